@@ -1,0 +1,48 @@
+// SPDX-License-Identifier: MIT
+#include "LiveReport.h"
+
+#include "blocks/measurementstable/KvStatisticsMeasurementsTableWidget.h"
+#include "data/KvReportKernelData.h"
+#include "data/KvStatisticsEngine.h"
+#include "report/KvReportNode.h"
+#include "report/KvReportPagedView.h"
+#include "templates/KvTemplateModel.h"
+
+#include <QCoreApplication>
+
+namespace {
+// Pages of 35 rows, header row included.
+constexpr int kPageWidth = 860;
+} // namespace
+
+LiveReport::LiveReport()
+    : m_view(std::make_unique<KvReportPagedView>())
+{
+    m_report.model().beginLiveUpdates();
+    m_view->setModel(&m_report.model());
+    m_view->resize(kPageWidth + 54, 900);
+    m_view->show();
+    QCoreApplication::processEvents();
+}
+
+LiveReport::~LiveReport()
+{
+    m_view.reset();
+    m_report.model().endLiveUpdates();
+}
+
+void LiveReport::refreshInPlace()
+{
+    KvBaseDisplayWidget *display = m_report.model().node(0)->displayWidget();
+    static_cast<KvStatisticsMeasurementsTableWidget *>(display)->slotUpdateTableContents();
+}
+
+void LiveReport::reflow()
+{
+    m_report.model().notifyListChanged();
+}
+
+int LiveReport::pageCount() const
+{
+    return m_view->pages().size();
+}

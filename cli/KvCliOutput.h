@@ -1,0 +1,32 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QString>
+
+struct ZtFault;
+
+/** Where the tool writes: results to standard output, errors and notes to standard error, a line each. */
+class KvCliOutput
+{
+public:
+    void setJsonErrors(bool json) { m_jsonErrors = json; }
+    void setQuiet(bool quiet) { m_quiet = quiet; }
+    bool isQuiet() const { return m_quiet; }
+
+    void result(const QString &text) const;
+    void result(const QByteArray &bytes) const;
+
+    /** Something worth knowing that does not stop the work. */
+    void note(const QString &text) const;
+    void error(const QString &text) const;
+    void error(const ZtFault &fault) const;
+
+    /** Whether standard error is a terminal, so that progress may be shown on it. */
+    static bool isTerminal();
+    /** Replaces the progress line; an empty text removes it. */
+    static void progress(const QString &text);
+
+private:
+    bool m_jsonErrors = false;
+    bool m_quiet = false;
+};

@@ -1,0 +1,187 @@
+// SPDX-License-Identifier: MIT
+#include "KvRenderCommand.h"
+
+#include "KvCliArguments.h"
+#include "KvCliHost.h"
+#include "KvCliOutput.h"
+#include "KvCliSource.h"
+#include "KvTemplateCheck.h"
+#include "KvTerminalProgress.h"
+
+#include "data/KvReportKernelData.h"
+#include "gui/ZtFontCoverage.h"
+#include "report/KvReportNode.h"
+#include "templates/KvBaseEditorNodeCfg.h"
+#include "templates/KvBlockRegistry.h"
+#include "templates/KvPageSectionsCfg.h"
+#include "templates/KvTemplateModel.h"
+#include "templates/KvUserMessages.h"
+
+#include <QFileInfo>
+#include <QJsonObject>
+#include <QScopeGuard>
+#include <QTemporaryFile>
+
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+
+namespace {
+
+/** Passes the model's messages on to standard error. */
+class CliMessages : public KvUserMessages
+{
+public:
+    explicit CliMessages(const KvCliOutput &output)
+        : m_output(output)
+    {
+    }
+    void warn(const QString &title, const QString &text) override
+    {
+        Q_UNUSED(title)
+        m_output.error(text);
+    }
+
+private:
+    const KvCliOutput &m_output;
+};
+
+// Qt's PDF writer does not tell when a disk is full; a file that lacks its end was not written.
+bool isCompletePdf(const QString &path)
+{
+    constexpr qint64 kTail = 32;
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly) || file.size() < kTail)
+        return false;
+    file.seek(file.size() - kTail);
+    return file.readAll().contains("%%EOF");
+}
+
+QString htmlText(const KvBaseEditorNodeCfg &cfg)
+{
+    QJsonObject object;
+    cfg.toJson(object);
+    QString texts;
+    for (const QJsonValue &value : qAsConst(object))
+        texts += value.toString();
+    return texts;
+}
+
+} // namespace
+
+KvRenderCommand::KvRenderCommand(const KvCliArguments &arguments, const KvCliOutput &output)
+    : m_arguments(arguments)
+    , m_output(output)
+{
+}
+
+int KvRenderCommand::run()
+{
+    KvCliHost host;
+    ZtFault fault;
+    KvCliSource templateFile;
+    if (!templateFile.open(m_arguments.templatePath, &fault)) {
+        m_output.error(fault);
+        return 1;
+    }
+    if (!checkTemplate(host, templateFile.path(), templateFile.displayName()) || !host.loadData(m_arguments, m_output))
+        return 1;
+
+    CliMessages messages(m_output);
+    KvTemplateModel model(nullptr, &host.kernelData());
+    model.setFactories(&host.blocks());
+    model.setUserMessages(&messages);
+    if (!model.load(templateFile.path()))
+        return 1;
+    model.beginLiveUpdates();
+    const auto endLive = qScopeGuard([&model]() { model.endLiveUpdates(); });
+    noteMissingGlyphs(host, model);
+    return print(model) ? 0 : 1;
+}
+
+bool KvRenderCommand::checkTemplate(KvCliHost &host, const QString &path, const QString &displayName) const
+{
+    KvTemplateCheck check(host.blocks());
+    if (!check.run(path, displayName)) {
+        m_output.error(check.fault());
+        return false;
+    }
+    for (const QString &warning : check.warnings())
+        m_output.note(displayName + QStringLiteral(": ") + warning);
+    return true;
+}
+
+void KvRenderCommand::noteMissingGlyphs(KvCliHost &host, KvTemplateModel &model) const
+{
+    ZtFontCoverage coverage(QFont(QStringLiteral("Segoe UI")));
+    for (const KvMeasuredValue &record : host.kernelData().measuredValues()) {
+        for (const QString &text : {record.objectName, record.objectTypeName, record.valueName, record.valueText})
+            coverage.addText(text);
+    }
+    for (const KvReportNode *node : model.nodes())
+        coverage.addText(htmlText(*node->config()));
+    coverage.addText(model.header()->text());
+    coverage.addText(model.footer()->text());
+    const QString missing = coverage.missingCharacters();
+    if (!missing.isEmpty())
+        m_output.note(QStringLiteral("no installed font has these characters, they are left out: ") + missing.left(40));
+}
+
+bool KvRenderCommand::print(KvTemplateModel &model) const
+{
+    if (m_arguments.outputPath == QLatin1String("-"))
+        return printToStandardOutput(model);
+    const QFileInfo target(m_arguments.outputPath);
+    // Into devices and the like directly; a file only gets its new content when all of it is there.
+    if (target.exists() && !target.isFile())
+        return target.isDir() ? failToWrite(m_arguments.outputPath, QStringLiteral("is a directory"))
+                              : printToFile(model, m_arguments.outputPath);
+    QTemporaryFile part(target.absolutePath() + QStringLiteral("/.statreport-XXXXXX.pdf"));
+    if (!part.open())
+        return failToWrite(m_arguments.outputPath, part.errorString());
+    part.close();
+    if (!printToFile(model, part.fileName()))
+        return false;
+    // As for a file that a program creates; a temporary file starts readable for its owner only.
+    QFile::setPermissions(part.fileName(), QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ReadGroup
+                                               | QFileDevice::ReadOther);
+    const QByteArray partName = QFile::encodeName(part.fileName());
+    if (std::rename(partName.constData(), QFile::encodeName(target.absoluteFilePath()).constData()) != 0)
+        return failToWrite(m_arguments.outputPath, QString::fromLocal8Bit(std::strerror(errno)));
+    part.setAutoRemove(false);
+    return true;
+}
+
+bool KvRenderCommand::printToFile(KvTemplateModel &model, const QString &path) const
+{
+    KvTerminalProgress progress(m_output);
+    const bool isPrinted = model.print(path, &progress) != 0;
+    progress.finish();
+    const QFileInfo file(path);
+    if (!isPrinted || (file.isFile() && !isCompletePdf(path)))
+        return failToWrite(m_arguments.outputPath, QStringLiteral("the file could not be written completely"));
+    return true;
+}
+
+bool KvRenderCommand::printToStandardOutput(KvTemplateModel &model) const
+{
+    QTemporaryFile part;
+    if (!part.open())
+        return failToWrite(QStringLiteral("<standard output>"), part.errorString());
+    if (!printToFile(model, part.fileName()))
+        return false;
+    QFile written(part.fileName());
+    if (!written.open(QIODevice::ReadOnly))
+        return failToWrite(QStringLiteral("<standard output>"), written.errorString());
+    m_output.result(written.readAll());
+    return std::ferror(stdout) == 0;
+}
+
+bool KvRenderCommand::failToWrite(const QString &path, const QString &reason) const
+{
+    ZtFault fault;
+    fault.file = path;
+    fault.message = QStringLiteral("cannot be written: ") + reason;
+    m_output.error(fault);
+    return false;
+}

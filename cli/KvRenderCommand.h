@@ -1,0 +1,29 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+class KvCliHost;
+class KvCliOutput;
+class KvTemplateModel;
+struct KvCliArguments;
+class QString;
+
+/** "statreport render": template and measurements in, PDF out. */
+class KvRenderCommand
+{
+public:
+    KvRenderCommand(const KvCliArguments &arguments, const KvCliOutput &output);
+
+    /** Returns the exit code. */
+    int run();
+
+private:
+    bool checkTemplate(KvCliHost &host, const QString &path, const QString &displayName) const;
+    bool print(KvTemplateModel &model) const;
+    bool printToFile(KvTemplateModel &model, const QString &path) const;
+    bool printToStandardOutput(KvTemplateModel &model) const;
+    void noteMissingGlyphs(KvCliHost &host, KvTemplateModel &model) const;
+    bool failToWrite(const QString &path, const QString &reason) const;
+
+    const KvCliArguments &m_arguments;
+    const KvCliOutput &m_output;
+};

@@ -1,0 +1,25 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "report/KvPrintProgress.h"
+
+#include <QElapsedTimer>
+
+class KvCliOutput;
+
+/** Shows how far a long print is, on a terminal only and not in the first half second. */
+class KvTerminalProgress : public KvPrintProgress
+{
+public:
+    explicit KvTerminalProgress(const KvCliOutput &output);
+
+    void pageWritten(int done, int total) override;
+    /** Removes the progress line. */
+    void finish();
+
+private:
+    QElapsedTimer m_sinceStart;
+    QElapsedTimer m_sinceShown;
+    bool m_isWanted;
+    bool m_isShown = false;
+};

@@ -1,0 +1,79 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "gui/ZtGuiGlobal.h"
+
+#include <QIcon>
+#include <QObject>
+#include <QPointer>
+#include <QString>
+
+class KvGuiMainWindowBase;
+class QToolButton;
+class QVBoxLayout;
+class QWidget;
+
+/**
+ * One tool of the main window: a checkable button, and a panel with the tool's title, a reset button and the
+ * tool's own widget. The tool is active while its button is checked.
+ *
+ * The main window places button and panel (KvGuiMainWindowBase::placeTool()). Both live as long as the tool,
+ * which is a child of the main window.
+ */
+class ZT_GUI_EXPORT KvToolBase : public QObject
+{
+    Q_OBJECT
+public:
+    /**
+     * Makes a tool and adds it to \a mainWindow.
+     * \param title     translated: the panel's title and the button's tool tip
+     * \param name      untranslated: the object name of tool and button
+     * \param activated whether the tool starts active
+     */
+    KvToolBase(KvGuiMainWindowBase *mainWindow, const QIcon &icon, const QString &title, const QString &name,
+               bool activated);
+    ~KvToolBase() override;
+
+    QString title() const { return m_title; }
+    QString name() const { return objectName(); }
+
+    QToolButton *getToolButton() const;
+    void setToolIcon(const QIcon &icon);
+
+    /** Title row and, below it, the tool's widget. */
+    QWidget *panel() const;
+    /**
+     * Puts the tool's widget into the panel and takes it over; the one before is deleted. Null takes it
+     * away.
+     */
+    void setGuiWidget(QWidget *widget);
+    QWidget *guiWidget() const;
+
+    /** Whether the panel offers the reset button; it does at first. */
+    void setResetVisible(bool visible);
+    bool isResetVisible() const;
+    QToolButton *getResetButton() const;
+
+    /**
+     * Lets the user have the tool or not. A tool that is not enabled is not active; one that is enabled
+     * becomes active with \a activate and stays as it is without.
+     */
+    void setEnabled(bool enabled, bool activate);
+    bool isEnabled() const;
+    bool isActivated() const;
+
+signals:
+    void toolActivated(bool anActivated); ///< the button was checked or unchecked, by the user or by code
+    void resetClicked();                  ///< the user wants the tool's values back at their defaults
+
+private:
+    void createButton(const QIcon &icon, bool activated);
+    void createPanel();
+
+    QString m_title;
+    QPointer<QToolButton> m_button;
+    QPointer<QToolButton> m_resetButton;
+    QPointer<QWidget> m_panel;
+    QPointer<QWidget> m_guiWidget;
+    QVBoxLayout *m_panelLayout = nullptr; ///< of the panel
+};

@@ -1,0 +1,27 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "gui/ZtGuiGlobal.h"
+
+#include <QFont>
+#include <QSet>
+#include <QString>
+
+/**
+ * Finds the characters that no installed font can draw. Such characters vanish from a page without a word, so whoever
+ * makes a report asks first. Texts are collected, then checked at once.
+ */
+class ZT_GUI_EXPORT ZtFontCoverage
+{
+public:
+    explicit ZtFontCoverage(const QFont &font);
+
+    void addText(const QString &text);
+    /** The characters of all texts that neither the font nor any substitute has, by code point. */
+    QString missingCharacters() const;
+
+private:
+    QFont m_font;
+    QString m_lastText;
+    QSet<uint> m_codePoints;
+};

@@ -1,0 +1,4 @@
+// SPDX-License-Identifier: MIT
+#include "gui/ZtPluginInterface.h"
+
+ZtPluginInterface::~ZtPluginInterface() = default;

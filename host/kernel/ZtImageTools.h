@@ -1,0 +1,27 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "kernel/ZtKernelGlobal.h"
+
+#include <QList>
+#include <QTransform>
+
+class ZtImage;
+
+/** Image operations of the application. */
+class ZT_KERNEL_EXPORT ZtImageTools
+{
+public:
+    static ZtImageTools *getInstance();
+
+    /**
+     * Draws the objects of ZtKernelData onto \a image.
+     * \param transform from scene coordinates to the image's pixels
+     * \param types     the object types to draw; empty means all
+     */
+    void drawEditorObjectsOnImage(ZtImage *image, const QTransform &transform,
+                                  const QList<int> &types = QList<int>()) const;
+
+private:
+    ZtImageTools() = default;
+};

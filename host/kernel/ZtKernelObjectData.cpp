@@ -1,0 +1,4 @@
+// SPDX-License-Identifier: MIT
+#include "kernel/ZtKernelObjectData.h"
+
+ZtKernelObjectData::~ZtKernelObjectData() = default;

@@ -1,0 +1,8 @@
+// SPDX-License-Identifier: MIT
+#include "kernel/ZtSignalCenter.h"
+
+ZtSignalCenter *ZtSignalCenter::getInstance()
+{
+    static ZtSignalCenter instance;
+    return &instance;
+}

@@ -1,0 +1,44 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "measuring/ZtMeasuringManipulator.h"
+
+#include <memory>
+
+class ZtCalibration;
+class ZtDrawnObjectData;
+struct ZtDrawnType;
+struct ZtDrawnValue;
+
+/** Manipulator of every built-in type: measures the points of a ZtDrawnObjectData as the type's row in the
+ * table says. */
+class ZT_MEASURING_EXPORT ZtDrawnManipulator : public ZtMeasuringManipulator
+{
+public:
+    /** \a type is one of ZtDrawnType::all(); \a calibration is shared with whoever changes it. */
+    ZtDrawnManipulator(const ZtDrawnType &type, std::shared_ptr<const ZtCalibration> calibration);
+
+    int typeFlags(int reserved) const override;
+    QString objectTypeName(int id) const override;
+    /** An int for counts, else a double; invalid for an unknown name and for points that the type refuses. */
+    QVariant value(const QString &valueName, const ZtKernelObjectData *object,
+                   int &measureKind) const override;
+    QString valueText(const QString &valueName, const ZtKernelObjectData *object) const override;
+    void draw(QPainter *painter, int id, const ZtKernelObjectData *object) const override;
+
+    const ZtDrawnType &type() const { return m_type; }
+
+    /** Fetches the names again after the language changed. */
+    void retranslate();
+
+private:
+    bool measure(const QString &valueName, const ZtKernelObjectData *object, double *baseValue,
+                 const ZtDrawnValue **definition) const;
+    double inBaseUnits(const ZtDrawnValue &definition, const ZtDrawnObjectData &object) const;
+    QString label(int id, const ZtDrawnObjectData &object) const;
+    QString lengthText(const ZtDrawnObjectData &object) const;
+
+    const ZtDrawnType &m_type;
+    std::shared_ptr<const ZtCalibration> m_calibration;
+    QString m_typeName;
+};

@@ -1,0 +1,38 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "measuring/ZtMeasuringGlobal.h"
+
+class QPainter;
+class QPainterPath;
+class QPointF;
+class QPolygonF;
+class QString;
+
+/**
+ * Draws objects so that they can be seen on dark and on light pictures: a bright line on a dark one.
+ *
+ * Geometry comes in scene coordinates; lines, markers and texts keep their size on the device whatever the
+ * zoom.
+ */
+class ZT_MEASURING_EXPORT ZtDrawnObjectPainter
+{
+public:
+    /** \a painter carries the transform from the scene to its device; every call leaves its state as it was.
+     */
+    explicit ZtDrawnObjectPainter(QPainter *painter)
+        : m_painter(painter)
+    {}
+
+    void drawOutline(const QPainterPath &path) const;
+    /** A small cross at each point. */
+    void drawMarkers(const QPolygonF &points) const;
+    /** A text in a dark box, its lower left corner near \a anchor; moved so that it stays on the device when
+     * \a anchor is on it. */
+    void drawLabel(const QPointF &anchor, const QString &text) const;
+
+private:
+    void strokeOnDevice(const QPainterPath &path) const;
+
+    QPainter *m_painter;
+};

@@ -1,0 +1,61 @@
+// SPDX-License-Identifier: MIT
+#include "measuring/ZtImportedManipulator.h"
+
+#include "measuring/ZtImportedObjectData.h"
+#include "measuring/ZtMeasureFormat.h"
+
+#include <cmath>
+#include <limits>
+
+namespace {
+
+bool isWholeInt(double value)
+{
+    return std::abs(value) <= std::numeric_limits<int>::max() && value == std::floor(value);
+}
+
+} // namespace
+
+ZtImportedManipulator::ZtImportedManipulator(int typeId, std::shared_ptr<const ZtImportedType> type)
+    : ZtMeasuringManipulator(typeId, type->valueNames())
+    , m_type(std::move(type))
+{}
+
+int ZtImportedManipulator::typeFlags(int reserved) const
+{
+    Q_UNUSED(reserved)
+    return MeasurementFlag;
+}
+
+QString ZtImportedManipulator::objectTypeName(int id) const
+{
+    Q_UNUSED(id)
+    return m_type->name();
+}
+
+const ZtImportedCell *ZtImportedManipulator::cell(const QString &valueName,
+                                                  const ZtKernelObjectData *object) const
+{
+    const int index = position(valueName);
+    if (index < 0 || !object)
+        return nullptr;
+    return m_type->cell(static_cast<const ZtImportedObjectData *>(object)->row(), index);
+}
+
+QVariant ZtImportedManipulator::value(const QString &valueName, const ZtKernelObjectData *object,
+                                      int &measureKind) const
+{
+    const ZtImportedCell *found = cell(valueName, object);
+    measureKind = found ? m_type->unit(*found).kind() : NoKind;
+    if (!found)
+        return QVariant();
+    if (measureKind == Count && isWholeInt(found->value))
+        return static_cast<int>(found->value);
+    return found->value;
+}
+
+QString ZtImportedManipulator::valueText(const QString &valueName, const ZtKernelObjectData *object) const
+{
+    const ZtImportedCell *found = cell(valueName, object);
+    return found ? ZtMeasureFormat::importedText(found->value, m_type->unit(*found), found->text) : QString();
+}

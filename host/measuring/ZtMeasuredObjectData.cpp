@@ -1,0 +1,4 @@
+// SPDX-License-Identifier: MIT
+#include "measuring/ZtMeasuredObjectData.h"
+
+ZtMeasuredObjectData::~ZtMeasuredObjectData() = default;

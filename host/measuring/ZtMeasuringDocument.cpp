@@ -1,0 +1,328 @@
+// SPDX-License-Identifier: MIT
+#include "measuring/ZtMeasuringDocument.h"
+
+#include "kernel/ZtKernelData.h"
+#include "kernel/ZtKernelObjectDataDescr.h"
+#include "kernel/ZtSignalCenter.h"
+#include "measuring/ZtDrawnManipulator.h"
+#include "measuring/ZtDrawnObjectData.h"
+#include "measuring/ZtDrawnType.h"
+#include "measuring/ZtImportedManipulator.h"
+#include "measuring/ZtImportedObjectData.h"
+#include "measuring/ZtKernelImage.h"
+#include "measuring/ZtSession.h"
+#include "measuring/ZtStillImageSource.h"
+#include "measuring/ZtTableImport.h"
+#include "measuring/ZtUnitSettings.h"
+
+namespace {
+
+ZtKernelData *kernel()
+{
+    return ZtKernelData::getInstance();
+}
+
+const ZtImportedManipulator *importedManipulator(int typeId)
+{
+    return static_cast<const ZtImportedManipulator *>(kernel()->getGsManipulator(typeId));
+}
+
+// The name that the user or a table gave an object; empty for the name that it has by itself.
+QString ownName(const ZtGsManipulator &manipulator, int id)
+{
+    const QString name = manipulator.getObjectName(id);
+    const QString standard = manipulator.objectTypeName(id) + QLatin1Char(' ') + QString::number(id);
+    return name == standard ? QString() : name;
+}
+
+void hideValues(int typeId, int id, const QVector<int> &positions)
+{
+    auto *manipulator = static_cast<ZtMeasuringManipulator *>(kernel()->getGsManipulator(typeId));
+    auto *object = static_cast<ZtMeasuredObjectData *>(kernel()->object(typeId, id));
+    for (const int position : positions)
+        manipulator->setValueShown(object, position, false);
+}
+
+// One announcement per type stands for all of its objects: receivers refresh everything.
+void announceTypes()
+{
+    const QMap<int, ZtObjectMap> all = kernel()->objects();
+    for (auto it = all.constBegin(); it != all.constEnd(); ++it) {
+        if (!it->isEmpty())
+            emit ZtSignalCenter::getInstance()->signalObjectCreated(it.key(), it->firstKey(), it->first());
+    }
+}
+
+ZtSessionObject toSessionObject(const ZtDrawnType &type, int id, const ZtKernelObjectData *data)
+{
+    const auto *drawn = static_cast<const ZtDrawnObjectData *>(data);
+    ZtSessionObject object;
+    object.type = &type;
+    object.id = id;
+    object.name = ownName(*kernel()->getGsManipulator(type.id), id);
+    object.text = drawn->text();
+    object.points = drawn->points();
+    object.hiddenValues = drawn->hiddenValues();
+    return object;
+}
+
+ZtSessionTable toSessionTable(int typeId)
+{
+    const ZtImportedManipulator *manipulator = importedManipulator(typeId);
+    ZtSessionTable table;
+    table.type = manipulator->sharedType();
+    const ZtObjectMap objects = kernel()->objects().value(typeId);
+    table.rows.reserve(objects.size());
+    for (auto it = objects.constBegin(); it != objects.constEnd(); ++it) {
+        const auto *object = static_cast<const ZtImportedObjectData *>(it.value());
+        table.rows.append({it.key(), object->row(), ownName(*manipulator, it.key()), object->hiddenValues()});
+    }
+    return table;
+}
+
+} // namespace
+
+ZtMeasuringDocument::ZtMeasuringDocument(QObject *parent)
+    : QObject(parent)
+    , m_calibration(std::make_shared<ZtCalibration>())
+    , m_kernelImage(std::make_unique<ZtKernelImage>())
+{
+    // From now on changed unit settings are announced.
+    ZtUnitSettings::getInstance();
+    registerTypes();
+    kernel()->setKernelImage(m_kernelImage.get());
+}
+
+ZtMeasuringDocument::~ZtMeasuringDocument()
+{
+    if (kernel()->kernelImage() == m_kernelImage.get())
+        kernel()->setKernelImage(nullptr);
+    removeImportedTypes();
+    for (const ZtDrawnType &type : ZtDrawnType::all())
+        kernel()->unregisterType(type.id);
+}
+
+void ZtMeasuringDocument::registerTypes()
+{
+    for (const ZtDrawnType &type : ZtDrawnType::all())
+        kernel()->registerType(type.id, std::make_unique<ZtDrawnManipulator>(type, m_calibration),
+                               std::make_unique<ZtKernelObjectDataDescr>(type.id, QLatin1String(type.key)));
+}
+
+void ZtMeasuringDocument::retranslate()
+{
+    for (const ZtDrawnType &type : ZtDrawnType::all())
+        static_cast<ZtDrawnManipulator *>(kernel()->getGsManipulator(type.id))->retranslate();
+}
+
+void ZtMeasuringDocument::clear()
+{
+    removeObjects();
+    removeImportedTypes();
+    setFrameSource(nullptr);
+    setCalibration(ZtCalibration());
+}
+
+void ZtMeasuringDocument::removeObjects()
+{
+    QVector<QPair<int, int>> first;
+    const QMap<int, ZtObjectMap> &all = kernel()->objects();
+    for (auto it = all.constBegin(); it != all.constEnd(); ++it) {
+        if (!it->isEmpty())
+            first.append({it.key(), it->firstKey()});
+    }
+    {
+        const ZtKernelData::SignalBlocker blocker;
+        kernel()->clearObjects();
+    }
+    for (const QPair<int, int> &object : qAsConst(first))
+        emit ZtSignalCenter::getInstance()->signalObjectRemoved(object.first, object.second);
+}
+
+void ZtMeasuringDocument::removeImportedTypes()
+{
+    for (const int id : qAsConst(m_importedTypes))
+        kernel()->unregisterType(id);
+    m_importedTypes.clear();
+}
+
+void ZtMeasuringDocument::setCalibration(const ZtCalibration &calibration)
+{
+    if (calibration == *m_calibration)
+        return;
+    *m_calibration = calibration;
+    emit signalCalibrationChanged();
+    emit ZtSignalCenter::getInstance()->signalLengthUnitChanged();
+}
+
+bool ZtMeasuringDocument::loadImage(const QString &path, ZtFault *fault)
+{
+    std::unique_ptr<ZtStillImageSource> source = ZtStillImageSource::load(path, fault);
+    if (!source)
+        return false;
+    useImage(std::move(source));
+    return true;
+}
+
+void ZtMeasuringDocument::useImage(std::unique_ptr<ZtStillImageSource> source)
+{
+    const QString path = source->path();
+    const ZtCalibration offered = source->offeredCalibration();
+    useSource(std::move(source), path, offered);
+}
+
+void ZtMeasuringDocument::setFrameSource(std::unique_ptr<ZtFrameSource> source)
+{
+    if (source || m_source || !m_imagePath.isEmpty())
+        useSource(std::move(source), QString(), ZtCalibration());
+}
+
+void ZtMeasuringDocument::useSource(std::unique_ptr<ZtFrameSource> source, const QString &imagePath,
+                                    const ZtCalibration &offered)
+{
+    m_kernelImage->setSource(source.get());
+    m_source = std::move(source);
+    m_imagePath = imagePath;
+    m_offered = offered;
+    emit signalImageChanged();
+    m_kernelImage->requestImage();
+}
+
+int ZtMeasuringDocument::addObject(int typeId, const QPolygonF &points, const QString &name,
+                                   const QString &text, int id)
+{
+    const ZtDrawnType *type = ZtDrawnType::find(typeId);
+    if (!type || !type->acceptsPoints(points) || id < 0)
+        return 0;
+    // An object that gives way is announced, too.
+    kernel()->removeObject(typeId, id);
+    int added = 0;
+    {
+        // The name is set before anybody hears of the object.
+        const ZtKernelData::SignalBlocker blocker;
+        added = kernel()->addObject(typeId, std::make_unique<ZtDrawnObjectData>(points, text), id);
+        kernel()->getGsManipulator(typeId)->setObjectName(added, name);
+    }
+    emit ZtSignalCenter::getInstance()->signalObjectCreated(typeId, added, kernel()->object(typeId, added));
+    return added;
+}
+
+bool ZtMeasuringDocument::importTable(const QString &path, const ZtTableImportOptions &options,
+                                      ZtFault *fault, QStringList *notes)
+{
+    ZtImportedTable table;
+    if (!ZtTableImport::readFile(path, options, &table, fault))
+        return false;
+    addImported(table, notes);
+    return true;
+}
+
+bool ZtMeasuringDocument::importTable(QIODevice *device, const QString &fileName,
+                                      const ZtTableImportOptions &options, ZtFault *fault, QStringList *notes)
+{
+    ZtImportedTable table;
+    if (!ZtTableImport::readDevice(device, fileName, options, &table, fault))
+        return false;
+    addImported(table, notes);
+    return true;
+}
+
+void ZtMeasuringDocument::addImported(const ZtImportedTable &table, QStringList *notes)
+{
+    if (notes)
+        *notes = table.notes;
+    m_importedTypes += ZtTableImport::apply(table);
+}
+
+std::optional<ZtUnit> ZtMeasuringDocument::importedUnit(const QString &typeName,
+                                                        const QString &valueName) const
+{
+    for (const int id : m_importedTypes) {
+        const ZtImportedType &type = importedManipulator(id)->type();
+        if (!typeName.isEmpty() && type.name() != typeName)
+            continue;
+        const int index = type.valueIndex(valueName);
+        if (index >= 0)
+            return type.values().at(index).unit;
+    }
+    return std::nullopt;
+}
+
+ZtSession ZtMeasuringDocument::toSession() const
+{
+    ZtSession session;
+    session.imagePath = m_imagePath;
+    session.calibration = *m_calibration;
+    for (const ZtDrawnType &type : ZtDrawnType::all()) {
+        const ZtObjectMap objects = kernel()->objects().value(type.id);
+        for (auto it = objects.constBegin(); it != objects.constEnd(); ++it)
+            session.objects.append(toSessionObject(type, it.key(), it.value()));
+    }
+    for (const int id : m_importedTypes)
+        session.tables.append(toSessionTable(id));
+    return session;
+}
+
+bool ZtMeasuringDocument::saveSession(const QString &path, ZtFault *fault) const
+{
+    return toSession().save(path, fault);
+}
+
+bool ZtMeasuringDocument::loadSession(const QString &path, ZtFault *fault, MissingImage missingImage)
+{
+    ZtSession session;
+    if (!ZtSession::load(path, &session, fault))
+        return false;
+    std::unique_ptr<ZtStillImageSource> image;
+    if (!session.imagePath.isEmpty()) {
+        ZtFault imageFault;
+        image = ZtStillImageSource::load(session.imagePath, &imageFault);
+        if (!image && missingImage == MissingImage::IsFault) {
+            *fault = {path, 0, 0, QStringLiteral("image"), imageFault.text()};
+            return false;
+        }
+    }
+    clear();
+    if (image)
+        useImage(std::move(image));
+    m_imagePath = session.imagePath;
+    apply(session);
+    return true;
+}
+
+void ZtMeasuringDocument::apply(const ZtSession &session)
+{
+    setCalibration(session.calibration);
+    {
+        const ZtKernelData::SignalBlocker blocker;
+        addSessionObjects(session);
+        addSessionTables(session);
+    }
+    announceTypes();
+}
+
+void ZtMeasuringDocument::addSessionObjects(const ZtSession &session)
+{
+    for (const ZtSessionObject &object : session.objects) {
+        const int type = object.type->id;
+        kernel()->addObject(type, std::make_unique<ZtDrawnObjectData>(object.points, object.text), object.id);
+        kernel()->getGsManipulator(type)->setObjectName(object.id, object.name);
+        hideValues(type, object.id, object.hiddenValues);
+    }
+}
+
+void ZtMeasuringDocument::addSessionTables(const ZtSession &session)
+{
+    for (const ZtSessionTable &table : session.tables) {
+        const int typeId =
+            ZtTableImport::registerType(table.type, m_importedTypes.isEmpty() ? 0 : m_importedTypes.last());
+        m_importedTypes.append(typeId);
+        for (const ZtSessionRow &row : table.rows) {
+            kernel()->addObject(typeId, std::make_unique<ZtImportedObjectData>(row.row), row.id);
+            ZtGsManipulator *manipulator = kernel()->getGsManipulator(typeId);
+            manipulator->setObjectName(row.id,
+                                       row.name.isEmpty() ? manipulator->getObjectName(row.id) : row.name);
+            hideValues(typeId, row.id, row.hiddenValues);
+        }
+    }
+}

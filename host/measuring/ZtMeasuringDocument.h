@@ -1,0 +1,117 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "measuring/ZtCalibration.h"
+#include "measuring/ZtFault.h"
+#include "measuring/ZtMeasuringGlobal.h"
+#include "measuring/ZtTableImportOptions.h"
+#include "measuring/ZtUnit.h"
+
+#include <QObject>
+#include <QPolygonF>
+#include <QVector>
+
+#include <memory>
+#include <optional>
+
+class QIODevice;
+class ZtFrameSource;
+class ZtKernelImage;
+class ZtStillImageSource;
+struct ZtImportedTable;
+struct ZtSession;
+
+/**
+ * What a measuring application works on: the image, its calibration, and the objects in ZtKernelData.
+ *
+ * There is one at a time. While it lives the built-in object types are registered and the kernel has an
+ * image; when it dies they are gone, with all objects. Operations that read a file change nothing when they
+ * fail. GUI thread only.
+ */
+class ZT_MEASURING_EXPORT ZtMeasuringDocument : public QObject
+{
+    Q_OBJECT
+public:
+    enum class MissingImage { IsFault, IsIgnored };
+
+    explicit ZtMeasuringDocument(QObject *parent = nullptr);
+    ~ZtMeasuringDocument() override;
+
+    /** Removes all objects, imported types, the image and the calibration. */
+    void clear();
+
+    const ZtCalibration &calibration() const { return *m_calibration; }
+    /** Changes the measured values of all drawn objects, which is announced as a change of the length unit.
+     */
+    void setCalibration(const ZtCalibration &calibration);
+
+    /** Absolute path of the image file; empty when there is none. */
+    QString imagePath() const { return m_imagePath; }
+    /** Shows an image file. The calibration stays; what the file says about it is in offeredCalibration(). */
+    bool loadImage(const QString &path, ZtFault *fault);
+    /** The pixel size that the image file states; uncalibrated when it states none. */
+    ZtCalibration offeredCalibration() const { return m_offered; }
+
+    ZtFrameSource *frameSource() const { return m_source.get(); }
+    /** Takes frames from another source, such as a camera, or from none. */
+    void setFrameSource(std::unique_ptr<ZtFrameSource> source);
+    ZtKernelImage *kernelImage() const { return m_kernelImage.get(); }
+
+    /**
+     * Draws an object and returns its id: the next free one of its type, or \a id, then in place of the
+     * object that has it.
+     * \param typeId a ZtDrawnType::Id
+     * \param points as ZtDrawnType::acceptsPoints() takes them
+     * \param name   a name of its own, or empty
+     * \param id     from 1, or 0 for a new one
+     * \return 0 when there is no such type, or for points or an id that no object can have
+     */
+    int addObject(int typeId, const QPolygonF &points, const QString &name = QString(),
+                  const QString &text = QString(), int id = 0);
+
+    /** Adds the objects of a table. \a notes, unless null, takes what was left out of it. */
+    bool importTable(const QString &path, const ZtTableImportOptions &options, ZtFault *fault,
+                     QStringList *notes = nullptr);
+    bool importTable(QIODevice *device, const QString &fileName, const ZtTableImportOptions &options,
+                     ZtFault *fault, QStringList *notes = nullptr);
+    /** Ids of the types that tables brought, in ascending order. */
+    const QVector<int> &importedTypes() const { return m_importedTypes; }
+
+    /**
+     * The unit in which imported tables give a value; no unit at all (an empty one) for values without.
+     * \param typeName display name of the type; empty takes the first type that has the value
+     */
+    std::optional<ZtUnit> importedUnit(const QString &typeName, const QString &valueName) const;
+
+    /** Replaces everything by a session's contents. An image that is missing can be ignored; its path is
+     * kept. */
+    bool loadSession(const QString &path, ZtFault *fault, MissingImage missingImage = MissingImage::IsFault);
+    bool saveSession(const QString &path, ZtFault *fault) const;
+
+    /** Fetches the names of the built-in types again after the language changed. */
+    void retranslate();
+
+signals:
+    void signalImageChanged();
+    void signalCalibrationChanged();
+
+private:
+    void registerTypes();
+    void removeObjects();
+    void removeImportedTypes();
+    void addImported(const ZtImportedTable &table, QStringList *notes);
+    void useImage(std::unique_ptr<ZtStillImageSource> source);
+    void useSource(std::unique_ptr<ZtFrameSource> source, const QString &imagePath,
+                   const ZtCalibration &offered);
+    ZtSession toSession() const;
+    void apply(const ZtSession &session);
+    void addSessionObjects(const ZtSession &session);
+    void addSessionTables(const ZtSession &session);
+
+    std::shared_ptr<ZtCalibration> m_calibration;
+    std::unique_ptr<ZtKernelImage> m_kernelImage;
+    std::unique_ptr<ZtFrameSource> m_source;
+    QString m_imagePath;
+    ZtCalibration m_offered;
+    QVector<int> m_importedTypes;
+};

@@ -1,0 +1,57 @@
+// SPDX-License-Identifier: MIT
+#include "measuring/ZtMeasuringManipulator.h"
+
+#include "kernel/ZtKernelData.h"
+#include "measuring/ZtMeasuredObjectData.h"
+
+ZtMeasuringManipulator::ZtMeasuringManipulator(int typeId, const QStringList &valueNames)
+    : m_typeId(typeId)
+{
+    changeValueNames(valueNames);
+}
+
+void ZtMeasuringManipulator::changeValueNames(const QStringList &valueNames)
+{
+    setValueNames(valueNames);
+    m_positions.clear();
+    for (int i = valueNames.size() - 1; i >= 0; --i)
+        m_positions.insert(valueNames.at(i), i);
+}
+
+bool ZtMeasuringManipulator::isValueShown(const QString &valueName, const QStringList &valueSet) const
+{
+    if (valueSet.isSharedWith(getValueNames()))
+        return position(valueName) >= 0;
+    return valueSet.contains(valueName);
+}
+
+QStringList ZtMeasuringManipulator::valueSet(int id) const
+{
+    if (!m_someHidden)
+        return getValueNames();
+    const ZtKernelObjectData *data = ZtKernelData::getInstance()->object(m_typeId, id);
+    const auto *object = static_cast<const ZtMeasuredObjectData *>(data);
+    if (!object || object->hiddenValues().isEmpty())
+        return getValueNames();
+    QStringList shown;
+    const QStringList names = getValueNames();
+    for (int i = 0; i < names.size(); ++i) {
+        if (isValueShown(*object, i))
+            shown.append(names.at(i));
+    }
+    return shown;
+}
+
+void ZtMeasuringManipulator::setValueShown(ZtMeasuredObjectData *object, int position, bool shown)
+{
+    object->m_hidden.removeAll(position);
+    if (shown)
+        return;
+    object->m_hidden.append(position);
+    m_someHidden = true;
+}
+
+bool ZtMeasuringManipulator::isValueShown(const ZtMeasuredObjectData &object, int position) const
+{
+    return !object.hiddenValues().contains(position);
+}

@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QJsonObject>
+
+struct ZtSession;
+
+/** Makes the JSON of a session. */
+class ZtSessionWriter
+{
+public:
+    /** \a path is the file to write: the image's path is stored relative to its folder. */
+    static QJsonObject toJson(const ZtSession &session, const QString &path);
+};

@@ -1,0 +1,175 @@
+// SPDX-License-Identifier: MIT
+#include "measuring/ZtTableImport.h"
+
+#include "kernel/ZtKernelData.h"
+#include "kernel/ZtKernelObjectDataDescr.h"
+#include "kernel/ZtSignalCenter.h"
+#include "measuring/ZtBoundedRead.h"
+#include "measuring/ZtClassIndexTableReader.h"
+#include "measuring/ZtCsvReader.h"
+#include "measuring/ZtImportedManipulator.h"
+#include "measuring/ZtImportedObjectData.h"
+#include "measuring/ZtTableDialect.h"
+#include "measuring/ZtTableNumber.h"
+#include "measuring/ZtTextDecoder.h"
+#include "measuring/ZtTidyTableReader.h"
+#include "measuring/ZtWideTableReader.h"
+
+#include <QCoreApplication>
+#include <QFile>
+#include <QFileInfo>
+
+namespace {
+
+QString tr(const char *text)
+{
+    return QCoreApplication::translate("ZtTableImport", text);
+}
+
+bool fail(const QString &message, ZtFault *fault)
+{
+    fault->message = message;
+    return false;
+}
+
+bool failTooLarge(qint64 maximumBytes, ZtFault *fault)
+{
+    const double megabytes = static_cast<double>(maximumBytes) / (1024.0 * 1024.0);
+    return fail(tr("The file is larger than %1 MB").arg(megabytes), fault);
+}
+
+// What one QByteArray can hold, with room for its text in another encoding.
+constexpr qint64 largestFile = 1024LL * 1024 * 1024;
+
+bool isColumnHeader(const ZtCsvRow &row)
+{
+    for (const std::string_view field : row.fields) {
+        if (ZtTableNumber::read(field, false).kind == ZtTableNumber::Text &&
+            ZtTableNumber::read(field, true).kind == ZtTableNumber::Text)
+            return true;
+    }
+    return false;
+}
+
+std::unique_ptr<ZtTableReader> makeReader(const ZtCsvRow &firstRow, ZtCsvReader *rows,
+                                          const ZtTableImportOptions &options, bool decimalComma)
+{
+    if (ZtClassIndexTableReader::recognizes(firstRow))
+        return std::make_unique<ZtClassIndexTableReader>(rows, options, decimalComma);
+    QVector<ZtTableHeader> headers;
+    for (const std::string_view field : firstRow.fields)
+        headers.append(ZtTableHeader::parse(QString::fromUtf8(field.data(), static_cast<int>(field.size()))));
+    if (ZtTidyTableReader::recognizes(headers))
+        return std::make_unique<ZtTidyTableReader>(rows, options, decimalComma);
+    return std::make_unique<ZtWideTableReader>(rows, options, decimalComma);
+}
+
+bool readText(std::string_view text, const ZtTableImportOptions &options, ZtImportedTable *table,
+              ZtFault *fault)
+{
+    const bool knownComma = options.decimalMark == ZtTableImportOptions::Comma;
+    ZtCsvReader rows(text, ZtTableDialect::findSeparator(text, knownComma));
+    ZtCsvRow firstRow;
+    if (!rows.next(&firstRow)) {
+        *fault = rows.fault();
+        return !fault->isNull() ? false : fail(tr("The file is empty"), fault);
+    }
+    if (!isColumnHeader(firstRow)) {
+        fault->line = firstRow.line;
+        return fail(tr("The first line does not name the columns"), fault);
+    }
+    const bool detected =
+        options.decimalMark == ZtTableImportOptions::DetectMark && ZtTableDialect::hasDecimalComma(&rows);
+    const std::unique_ptr<ZtTableReader> reader =
+        makeReader(firstRow, &rows, options, knownComma || detected);
+    if (reader->read(table))
+        return true;
+    *fault = reader->fault();
+    return false;
+}
+
+void addObjects(int typeId, const ZtImportedType &type)
+{
+    ZtKernelData *kernel = ZtKernelData::getInstance();
+    ZtGsManipulator *manipulator = kernel->getGsManipulator(typeId);
+    const ZtKernelData::SignalBlocker blocker;
+    for (int row = 0; row < type.rowCount(); ++row) {
+        const int id = kernel->addObject(typeId, std::make_unique<ZtImportedObjectData>(row), row + 1);
+        // Reports ask for the names again and again: also those that could be made up are stored.
+        const QString name = type.rowName(row).isEmpty() ? manipulator->getObjectName(id) : type.rowName(row);
+        manipulator->setObjectName(id, name);
+    }
+}
+
+} // namespace
+
+bool ZtTableImport::readFile(const QString &path, const ZtTableImportOptions &options, ZtImportedTable *table,
+                             ZtFault *fault)
+{
+    QFile file(path);
+    *fault = ZtFault();
+    fault->file = path;
+    if (!QFileInfo::exists(path))
+        return fail(tr("The file does not exist"), fault);
+    if (QFileInfo(path).isDir())
+        return fail(tr("This is a folder, not a file"), fault);
+    if (!file.open(QIODevice::ReadOnly))
+        return fail(tr("The file cannot be read (%1)").arg(file.errorString()), fault);
+    return readDevice(&file, path, options, table, fault);
+}
+
+bool ZtTableImport::readDevice(QIODevice *device, const QString &fileName,
+                               const ZtTableImportOptions &options, ZtImportedTable *table, ZtFault *fault)
+{
+    *fault = ZtFault();
+    fault->file = fileName;
+    if (!device->isReadable())
+        return fail(tr("The table is not open for reading"), fault);
+    const qint64 limit = qMin(options.maximumBytes, largestFile);
+    const QByteArray bytes = ztReadAtMost(device, limit + 1);
+    const auto *file = qobject_cast<QFileDevice *>(device);
+    if (file && file->error() != QFileDevice::NoError)
+        return fail(tr("The file cannot be read (%1)").arg(file->errorString()), fault);
+    if (bytes.size() > limit)
+        return failTooLarge(limit, fault);
+    return parse(bytes, fileName, options, table, fault);
+}
+
+bool ZtTableImport::parse(const QByteArray &bytes, const QString &fileName,
+                          const ZtTableImportOptions &options, ZtImportedTable *table, ZtFault *fault)
+{
+    *fault = ZtFault();
+    QByteArray utf8;
+    bool isRead = bytes.size() <= options.maximumBytes || failTooLarge(options.maximumBytes, fault);
+    isRead = isRead && ZtTextDecoder::toUtf8(bytes, &utf8, fault);
+    const std::string_view text(utf8.constData(), static_cast<std::size_t>(utf8.size()));
+    isRead = isRead && readText(text, options, table, fault);
+    if (!isRead)
+        fault->file = fileName;
+    return isRead;
+}
+
+int ZtTableImport::registerType(const std::shared_ptr<const ZtImportedType> &type, int afterId)
+{
+    ZtKernelData *kernel = ZtKernelData::getInstance();
+    int id = qMax(firstTypeId, afterId + 1);
+    while (kernel->getGsManipulator(id) || kernel->getDataDescriptor(id))
+        ++id;
+    kernel->registerType(id, std::make_unique<ZtImportedManipulator>(id, type),
+                         std::make_unique<ZtKernelObjectDataDescr>(id, type->name()));
+    return id;
+}
+
+QVector<int> ZtTableImport::apply(const ZtImportedTable &table)
+{
+    QVector<int> ids;
+    for (const auto &type : table.types) {
+        ids.append(registerType(type, ids.isEmpty() ? 0 : ids.last()));
+        addObjects(ids.last(), *type);
+    }
+    for (const int id : qAsConst(ids)) {
+        if (const ZtKernelObjectData *first = ZtKernelData::getInstance()->object(id, 1))
+            emit ZtSignalCenter::getInstance()->signalObjectCreated(id, 1, first);
+    }
+    return ids;
+}

@@ -1,0 +1,45 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "measuring/ZtFault.h"
+#include "measuring/ZtImportedTable.h"
+#include "measuring/ZtMeasuringGlobal.h"
+#include "measuring/ZtTableImportOptions.h"
+
+class QByteArray;
+class QIODevice;
+
+/**
+ * Reads tables of measurements: one value per row, one object per row, or results as ImageJ writes them.
+ *
+ * Layout, separator, decimal mark and encoding are found out. A table is taken as a whole: at the first fault
+ * nothing of it is.
+ */
+class ZT_MEASURING_EXPORT ZtTableImport
+{
+public:
+    /** First id of the object types that tables bring; built-in types have smaller ones. */
+    static constexpr int firstTypeId = 0x20000;
+
+    /** Each reads a whole table; false with the first fault found. \a fileName is only for the fault. */
+    static bool readFile(const QString &path, const ZtTableImportOptions &options, ZtImportedTable *table,
+                         ZtFault *fault);
+    static bool readDevice(QIODevice *device, const QString &fileName, const ZtTableImportOptions &options,
+                           ZtImportedTable *table, ZtFault *fault);
+    static bool parse(const QByteArray &bytes, const QString &fileName, const ZtTableImportOptions &options,
+                      ZtImportedTable *table, ZtFault *fault);
+
+    /**
+     * Makes every type of a table, with its objects, known to ZtKernelData under the next free ids from
+     * firstTypeId. Objects count from 1 in the order of their rows. Announces one creation per type that has
+     * objects. \return the ids of the new types
+     */
+    static QVector<int> apply(const ZtImportedTable &table);
+
+    /**
+     * Makes one type known without any objects.
+     * \param afterId the new id is greater than this one
+     * \return its id
+     */
+    static int registerType(const std::shared_ptr<const ZtImportedType> &type, int afterId = 0);
+};

@@ -1,0 +1,44 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "measuring/ZtTableReader.h"
+
+/** Reads tables with one value per row: columns for the value and its name, and for type, object and unit. */
+class ZtTidyTableReader : public ZtTableReader
+{
+public:
+    using ZtTableReader::ZtTableReader;
+
+    /** Whether headings are those of such a table. */
+    static bool recognizes(const QVector<ZtTableHeader> &headers);
+
+protected:
+    bool readTable() override;
+    int unitColumn() const override { return m_unitColumn; }
+
+private:
+    /** What is known about the objects of one type. */
+    struct TypeState
+    {
+        QHash<QByteArray, int> objects;      ///< by their key in the table
+        QHash<QByteArray, int> valueIndexes; ///< by the value's name in the table
+        QVector<int> occurrences;            ///< of each value, where objects have no key
+    };
+
+    bool chooseColumns();
+    void noteLeftOutColumns();
+    bool readRow(const ZtCsvRow &row);
+    bool readValue(const ZtCsvRow &row, int type, int object, int valueIndex);
+    bool readUnit(const ZtCsvRow &row, const QString &valueName, ZtUnit *unit);
+    bool findValue(const ZtCsvRow &row, int type, int *valueIndex);
+    bool findObject(const ZtCsvRow &row, int type, int valueIndex, int *object);
+    std::string_view field(const ZtCsvRow &row, int column) const;
+
+    int m_typeColumn = -1;
+    int m_objectColumn = -1;
+    int m_nameColumn = -1;
+    int m_unitColumn = -1;
+    int m_valueColumn = -1;
+    std::vector<TypeState> m_types;
+    QHash<QByteArray, ZtUnit> m_unitCache; ///< by value name and unit as written
+};

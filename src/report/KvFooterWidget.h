@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "report/KvPageSectionWidget.h"
+
+/** The footer of one page. Every page has its own, all showing the same section. */
+class KvFooterWidget : public KvPageSectionWidget
+{
+    Q_OBJECT
+public:
+    using KvPageSectionWidget::KvPageSectionWidget;
+
+    QString displayName() const override;
+};

@@ -1,0 +1,7 @@
+// SPDX-License-Identifier: MIT
+#include "report/KvHeaderWidget.h"
+
+QString KvHeaderWidget::displayName() const
+{
+    return tr("Header");
+}

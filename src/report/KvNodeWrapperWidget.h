@@ -1,0 +1,39 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QPointer>
+#include <QWidget>
+
+#include <memory>
+
+class KvReportNode;
+namespace Ui {
+class KvNodeWrapperWidgetUi;
+}
+
+/**
+ * White frame around one piece of a block, with the page's margins at its left and right.
+ *
+ * Only carries the piece: when the frame dies it lets the piece go first, since pieces belong to their block.
+ */
+class KvNodeWrapperWidget : public QWidget
+{
+    Q_OBJECT
+public:
+    KvNodeWrapperWidget(KvReportNode *node, QWidget *piece);
+    ~KvNodeWrapperWidget() override;
+
+    KvReportNode *node() const { return m_node; }
+    QWidget *piece() const { return m_piece; }
+
+    void setMargin(int pixels);
+    /** Takes the size that the piece asks for now. */
+    void fitToPiece();
+
+private:
+    void applyStyle();
+
+    std::unique_ptr<Ui::KvNodeWrapperWidgetUi> m_ui;
+    KvReportNode *m_node;
+    QPointer<QWidget> m_piece;
+};

@@ -1,0 +1,12 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+/** Told how far a print is. */
+class KvPrintProgress
+{
+public:
+    virtual ~KvPrintProgress() = default;
+
+    /** \a done of \a total pages are written; called once before the first with 0. */
+    virtual void pageWritten(int done, int total) = 0;
+};

@@ -1,0 +1,194 @@
+// SPDX-License-Identifier: MIT
+#include "report/KvReportPage.h"
+
+#include "report/KvFooterWidget.h"
+#include "report/KvHeaderWidget.h"
+#include "report/KvPageCountWidget.h"
+#include "report/KvReportProxyWidgetItem.h"
+#include "templates/KvTemplateModel.h"
+
+#include <QPen>
+
+namespace {
+
+constexpr qreal kPageZ = -1;
+constexpr qreal kSheetZ = -2;
+constexpr qreal kSectionZ = 2;
+constexpr qreal kPageNumberZ = 3;
+constexpr qreal kSeparatorZ = 5;
+constexpr int kContentInset = 20; // pixels at the page's top and bottom
+constexpr int kPageNumberRight = 40;
+constexpr int kPageNumberBottom = 30;
+// The content height told to blocks is lower than the rectangle: a piece of just that height still fits with its gap.
+constexpr int kContentReserve = 2;
+
+QPen separatorPen()
+{
+    QPen pen(QColor(QStringLiteral("#00659D")), 1.0, Qt::CustomDashLine, Qt::SquareCap, Qt::BevelJoin);
+    pen.setDashPattern({5, 2});
+    return pen;
+}
+
+} // namespace
+
+KvReportPage::KvReportPage(KvTemplateModel *model, int index, bool printMode)
+    : m_model(model)
+    , m_index(index)
+    , m_printMode(printMode)
+    , m_pageRect(pageRectOf(*model, index, printMode))
+    , m_contentRect(m_pageRect.adjusted(0, kContentInset, 0, -kContentInset))
+{
+    setHandlesChildEvents(false);
+    setZValue(kPageZ);
+    if (!m_printMode)
+        addSheet();
+    if (m_model->isHeaderEnabled())
+        addHeader();
+    if (m_model->isFooterEnabled())
+        addFooter();
+    if (m_model->isPageNumberingEnabled())
+        addPageNumber();
+    tellContentHeight();
+}
+
+KvReportPage::~KvReportPage() = default;
+
+QRect KvReportPage::pageRectOf(const KvTemplateModel &model, int index, bool printMode)
+{
+    const int width = model.pageWidth();
+    const int height = model.context()->pageHeight();
+    if (printMode)
+        return QRect(0, 0, width, height);
+    return QRect(Gap, (height + Gap) * index + Gap, width, height);
+}
+
+bool KvReportPage::contains(const QPointF &point) const
+{
+    return QRectF(m_pageRect).contains(point);
+}
+
+KvPageSectionWidget *KvReportPage::headerWidget() const
+{
+    return m_headerWidget;
+}
+
+KvPageSectionWidget *KvReportPage::footerWidget() const
+{
+    return m_footerWidget;
+}
+
+void KvReportPage::addSheet()
+{
+    auto *sheet = new QGraphicsRectItem(m_pageRect);
+    sheet->setPen(QPen(Qt::white));
+    sheet->setBrush(QBrush(Qt::white, Qt::SolidPattern));
+    sheet->setZValue(kSheetZ);
+    addToGroup(sheet);
+}
+
+KvReportProxyWidgetItem *KvReportPage::addSection(KvPageSectionWidget *widget)
+{
+    widget->setStyleSheet(QStringLiteral("QWidget { background-color: white; }"));
+    widget->fitToWidth(m_contentRect.width());
+    auto *item = new KvReportProxyWidgetItem;
+    item->setDisplayWidget(widget);
+    item->setWidget(widget);
+    item->setZValue(kSectionZ);
+    addToGroup(item);
+    return item;
+}
+
+QGraphicsLineItem *KvReportPage::addSeparator()
+{
+    auto *line = new QGraphicsLineItem(0, 0, m_pageRect.width(), 0);
+    line->setPen(separatorPen());
+    line->setZValue(kSeparatorZ);
+    addToGroup(line);
+    return line;
+}
+
+void KvReportPage::addHeader()
+{
+    m_headerWidget = m_model->createHeaderWidget();
+    m_headerItem = addSection(m_headerWidget);
+    if (!m_printMode)
+        m_headerLine = addSeparator();
+    placeHeader();
+}
+
+void KvReportPage::addFooter()
+{
+    m_footerWidget = m_model->createFooterWidget();
+    m_footerItem = addSection(m_footerWidget);
+    if (!m_printMode)
+        m_footerLine = addSeparator();
+    placeFooter();
+}
+
+void KvReportPage::addPageNumber()
+{
+    m_pageCountWidget = m_model->createPageCountWidget(m_index);
+    m_pageCountItem = new KvReportProxyWidgetItem;
+    m_pageCountItem->setDisplayWidget(m_pageCountWidget);
+    m_pageCountItem->setWidget(m_pageCountWidget);
+    m_pageCountItem->setZValue(kPageNumberZ);
+    addToGroup(m_pageCountItem);
+    placePageNumber();
+}
+
+void KvReportPage::placeHeader()
+{
+    m_headerRect = QRect(m_contentRect.topLeft(), m_headerItem->size().toSize());
+    m_headerItem->setPos(m_contentRect.topLeft());
+    m_contentRect.setTop(m_contentRect.top() + m_headerRect.height());
+    if (m_headerLine)
+        m_headerLine->setPos(m_contentRect.topLeft());
+}
+
+void KvReportPage::placeFooter()
+{
+    const QSize size = m_footerItem->size().toSize();
+    m_contentRect.setBottom(m_contentRect.bottom() - size.height());
+    m_footerRect = QRect(m_contentRect.bottomLeft(), size);
+    m_footerItem->setPos(m_footerRect.topLeft());
+    if (m_footerLine)
+        m_footerLine->setPos(m_footerRect.topLeft());
+}
+
+void KvReportPage::placePageNumber()
+{
+    const QSizeF size = m_pageCountItem->size();
+    m_pageCountItem->setPos(m_pageRect.right() - (size.width() + kPageNumberRight),
+                            m_pageRect.bottom() - (size.height() + kPageNumberBottom));
+}
+
+void KvReportPage::updateSections()
+{
+    m_contentRect = m_pageRect.adjusted(0, kContentInset, 0, -kContentInset);
+    if (m_headerItem) {
+        m_headerWidget->fitToWidth(m_contentRect.width());
+        m_headerItem->resize(m_headerWidget->size());
+        placeHeader();
+    }
+    if (m_footerItem) {
+        m_footerWidget->fitToWidth(m_contentRect.width());
+        m_footerItem->resize(m_footerWidget->size());
+        placeFooter();
+    }
+    tellContentHeight();
+}
+
+void KvReportPage::tellContentHeight()
+{
+    m_model->context()->setContentHeight(m_contentRect.height() - kContentReserve);
+}
+
+void KvReportPage::setPageTotal(int total)
+{
+    if (!m_pageCountWidget)
+        return;
+    m_pageCountWidget->setTotal(total);
+    m_pageCountWidget->adjustSize();
+    m_pageCountItem->resize(m_pageCountWidget->size());
+    placePageNumber();
+}

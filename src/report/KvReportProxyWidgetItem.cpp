@@ -1,0 +1,63 @@
+// SPDX-License-Identifier: MIT
+#include "report/KvReportProxyWidgetItem.h"
+
+#include "report/KvBaseDisplayWidget.h"
+#include "report/KvBaseDisplayWidgetSignals.h"
+#include "report/KvNodeWrapperWidget.h"
+#include "report/KvReportNode.h"
+#include "templates/KvTemplateContext.h"
+
+#include <QtMath>
+
+KvReportProxyWidgetItem::KvReportProxyWidgetItem(QGraphicsItem *parent)
+    : QGraphicsProxyWidget(parent)
+{
+}
+
+KvReportProxyWidgetItem *KvReportProxyWidgetItem::createForPiece(KvReportNode *node, int index)
+{
+    KvBaseDisplayWidget *displayWidget = node->displayWidget();
+    QWidget *piece = displayWidget ? displayWidget->subWidgetAt(index) : nullptr;
+    if (!piece)
+        return nullptr;
+    auto *wrapper = new KvNodeWrapperWidget(node, piece);
+    wrapper->setMargin(node->context()->marginPixels());
+    wrapper->fitToPiece();
+    auto *item = new KvReportProxyWidgetItem;
+    item->setNode(node);
+    item->setDisplayWidget(displayWidget);
+    item->setWidget(wrapper);
+    return item;
+}
+
+void KvReportProxyWidgetItem::setDisplayWidget(KvBaseDisplayWidget *displayWidget)
+{
+    if (m_displayWidget)
+        m_displayWidget->displaySignals()->disconnect(this);
+    m_displayWidget = displayWidget;
+    if (m_displayWidget)
+        connect(m_displayWidget->displaySignals(), SIGNAL(destroyed()), this, SLOT(slotDisplayWidgetDestroyed()));
+}
+
+void KvReportProxyWidgetItem::slotDisplayWidgetDestroyed()
+{
+    m_displayWidget = nullptr;
+}
+
+void KvReportProxyWidgetItem::adjustToPiece()
+{
+    auto *wrapper = qobject_cast<KvNodeWrapperWidget *>(widget());
+    if (!wrapper)
+        return;
+    if (m_node)
+        wrapper->setMargin(m_node->context()->marginPixels());
+    wrapper->fitToPiece();
+    const QSizeF wanted = wrapper->size();
+    if (size() != wanted)
+        resize(wanted);
+}
+
+int KvReportProxyWidgetItem::pieceHeight() const
+{
+    return qCeil(boundingRect().height());
+}

@@ -1,0 +1,316 @@
+// SPDX-License-Identifier: MIT
+#include "support/StatReportTest.h"
+
+#include "gui/QtAdvancedStylesheet.h"
+
+#include <QApplication>
+#include <QtWidgets>
+
+using acss::QtAdvancedStylesheet;
+
+namespace {
+
+/// One of every kind of control, in every state that can be set.
+void fill(QWidget *window)
+{
+    auto *const layout = new QVBoxLayout(window);
+    const QList<QWidget *> controls{new QPushButton(QStringLiteral("Push")),
+                                    new QToolButton,
+                                    new QCheckBox(QStringLiteral("Check")),
+                                    new QRadioButton(QStringLiteral("Radio")),
+                                    new QLineEdit,
+                                    new QComboBox,
+                                    new QSpinBox,
+                                    new QDoubleSpinBox,
+                                    new QSlider(Qt::Horizontal),
+                                    new QSlider(Qt::Vertical),
+                                    new QProgressBar,
+                                    new QScrollBar,
+                                    new QGroupBox(QStringLiteral("Group")),
+                                    new QLabel(QStringLiteral("Label")),
+                                    new QTabBar,
+                                    new QSplitter,
+                                    new QMenuBar,
+                                    new QStatusBar,
+                                    new QToolBar,
+                                    new QTableWidget(2, 2),
+                                    new QTreeWidget,
+                                    new QTextEdit};
+    for (QWidget *const control : controls)
+        layout->addWidget(control);
+}
+
+double relativeLuminance(const QColor &color)
+{
+    const auto linear = [](double c) {
+        return c <= 0.03928 ? c / 12.92 : std::pow((c + 0.055) / 1.055, 2.4);
+    };
+    return 0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) + 0.0722 * linear(color.blueF());
+}
+
+double contrast(const QColor &a, const QColor &b)
+{
+    const double la = relativeLuminance(a);
+    const double lb = relativeLuminance(b);
+    return (std::max(la, lb) + 0.05) / (std::min(la, lb) + 0.05);
+}
+
+} // namespace
+
+class QtAdvancedStylesheetTest : public StatReportTest
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void cleanupTestCase();
+    void startsDark();
+    void hasTwoThemes();
+    void changesAreAnnounced();
+    void unknownThemesAreRefused_data();
+    void unknownThemesAreRefused();
+    void colors_data();
+    void colors();
+    void unknownColorsAreInvalid();
+    void textsAreReadable_data();
+    void textsAreReadable();
+    void theStyleSheetIsFilledIn_data();
+    void theStyleSheetIsFilledIn();
+    void theStyleSheetSuitsItsParser_data();
+    void theStyleSheetSuitsItsParser();
+    void controlsAreEquallyHigh();
+    void applyingGivesFontAndPalette();
+    void applyingToNothing();
+    void freeFontsStandIn();
+
+private:
+    QtAdvancedStylesheet *m_style = QtAdvancedStylesheet::getInstance();
+};
+
+void QtAdvancedStylesheetTest::init()
+{
+    StatReportTest::init();
+    m_style->setCurrentTheme(QStringLiteral("Dark"));
+}
+
+void QtAdvancedStylesheetTest::cleanupTestCase()
+{
+    qApp->setStyleSheet(QString());
+}
+
+void QtAdvancedStylesheetTest::startsDark()
+{
+    QCOMPARE(m_style->currentTheme(), QStringLiteral("Dark"));
+}
+
+void QtAdvancedStylesheetTest::hasTwoThemes()
+{
+    QCOMPARE(m_style->themes(), QStringList({QStringLiteral("Dark"), QStringLiteral("Light")}));
+}
+
+void QtAdvancedStylesheetTest::changesAreAnnounced()
+{
+    QSignalSpy changed(m_style, SIGNAL(currentThemeChanged(QString)));
+    QVERIFY(m_style->setCurrentTheme(QStringLiteral("Dark")));
+    QCOMPARE(changed.count(), 0);
+    QVERIFY(m_style->setCurrentTheme(QStringLiteral("Light")));
+    QCOMPARE(changed.count(), 1);
+    QCOMPARE(changed.at(0).at(0).toString(), QStringLiteral("Light"));
+    QCOMPARE(m_style->currentTheme(), QStringLiteral("Light"));
+}
+
+void QtAdvancedStylesheetTest::unknownThemesAreRefused_data()
+{
+    QTest::addColumn<QString>("theme");
+    QTest::newRow("empty") << QString();
+    QTest::newRow("letter case") << QStringLiteral("light");
+    QTest::newRow("other") << QStringLiteral("Pink");
+}
+
+void QtAdvancedStylesheetTest::unknownThemesAreRefused()
+{
+    QFETCH(QString, theme);
+    QSignalSpy changed(m_style, SIGNAL(currentThemeChanged(QString)));
+    QVERIFY(!m_style->setCurrentTheme(theme));
+    QCOMPARE(changed.count(), 0);
+    QCOMPARE(m_style->currentTheme(), QStringLiteral("Dark"));
+}
+
+void QtAdvancedStylesheetTest::colors_data()
+{
+    QTest::addColumn<QString>("token");
+    QTest::addColumn<QString>("dark");
+    QTest::addColumn<QString>("light");
+    const auto row = [](const char *token, const char *dark, const char *light) {
+        QTest::newRow(token) << QString::fromLatin1(token) << QString::fromLatin1(dark)
+                             << QString::fromLatin1(light);
+    };
+    row("window", "#1f2123", "#f3f4f5");
+    row("panel", "#262626", "#ffffff");
+    row("raised", "#313131", "#ffffff");
+    row("line", "#4d4d4d", "#dcdcdc");
+    row("text", "#f0f0f1", "#141414");
+    row("muted", "#b4b7ba", "#5b5f63");
+    row("accent", "#00659d", "#00659d");
+    row("accent-hover", "#0a7dbd", "#0a7dbd");
+    row("accent-pressed", "#004f7c", "#004f7c");
+    row("on-accent", "#ffffff", "#ffffff");
+    row("danger", "#f0b1b5", "#f0b1b5");
+    row("danger-hover", "#a61d24", "#a61d24");
+    row("danger-pressed", "#e84749", "#e84749");
+    row("ok", "#60bd65", "#226a25");
+    row("warning", "#ffc107", "#9a6b00");
+    row("text-disabled", "#66f0f0f1", "#66141414");
+    row("accent-disabled", "#6600659d", "#6600659d");
+    row("on-accent-disabled", "#66ffffff", "#66ffffff");
+}
+
+void QtAdvancedStylesheetTest::colors()
+{
+    QFETCH(QString, token);
+    QFETCH(QString, dark);
+    QFETCH(QString, light);
+    QCOMPARE(m_style->color(token), QColor(dark));
+    m_style->setCurrentTheme(QStringLiteral("Light"));
+    QCOMPARE(m_style->color(token), QColor(light));
+}
+
+void QtAdvancedStylesheetTest::unknownColorsAreInvalid()
+{
+    QVERIFY(!m_style->color(QStringLiteral("no-such-colour")).isValid());
+    QVERIFY(!m_style->color(QString()).isValid());
+}
+
+void QtAdvancedStylesheetTest::textsAreReadable_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QString>("background");
+    for (const char *const text : {"text", "muted"}) {
+        for (const char *const background : {"window", "panel", "raised", "raised-hover", "raised-pressed"})
+            QTest::addRow("%s on %s", text, background)
+                << QString::fromLatin1(text) << QString::fromLatin1(background);
+    }
+    for (const char *const background : {"accent", "accent-pressed", "danger-hover"})
+        QTest::addRow("on-accent on %s", background)
+            << QStringLiteral("on-accent") << QString::fromLatin1(background);
+}
+
+void QtAdvancedStylesheetTest::textsAreReadable()
+{
+    QFETCH(QString, text);
+    QFETCH(QString, background);
+    for (const QString &theme : m_style->themes()) {
+        m_style->setCurrentTheme(theme);
+        const double ratio = contrast(m_style->color(text), m_style->color(background));
+        QVERIFY2(ratio >= 4.5, qPrintable(QStringLiteral("%1: %2:1").arg(theme).arg(ratio)));
+    }
+}
+
+void QtAdvancedStylesheetTest::theStyleSheetIsFilledIn_data()
+{
+    QTest::addColumn<QString>("theme");
+    QTest::addColumn<QString>("window");
+    QTest::newRow("dark") << QStringLiteral("Dark") << QStringLiteral("#1f2123");
+    QTest::newRow("light") << QStringLiteral("Light") << QStringLiteral("#f3f4f5");
+}
+
+void QtAdvancedStylesheetTest::theStyleSheetIsFilledIn()
+{
+    QFETCH(QString, theme);
+    QFETCH(QString, window);
+    m_style->setCurrentTheme(theme);
+    const QString sheet = m_style->styleSheet();
+    QVERIFY(!sheet.isEmpty());
+    QVERIFY(!sheet.contains(QLatin1String("{{")));
+    QVERIFY(!sheet.contains(QLatin1String("}}")));
+    QVERIFY(sheet.contains(window));
+    QVERIFY(sheet.contains(QLatin1String("font-family: \"Segoe UI\";")));
+    QVERIFY(sheet.contains(QLatin1String("font-size: 13px;")));
+    QVERIFY(sheet.contains(QLatin1String("rgba(0, 101, 157, 102)")));
+
+    const QRegularExpression url(QStringLiteral("url\\(\"([^\"]+)\"\\)"));
+    for (auto match = url.globalMatch(sheet); match.hasNext();) {
+        const QString image = match.next().captured(1);
+        QVERIFY2(QFile::exists(image), qPrintable(image));
+    }
+    // A colour name that does not exist leaves a hole.
+    QVERIFY(!sheet.contains(QRegularExpression(QStringLiteral(":\\s*;"))));
+    QVERIFY(!sheet.contains(QLatin1String("solid ;")));
+    QVERIFY(!sheet.contains(QLatin1String("#000000")));
+}
+
+void QtAdvancedStylesheetTest::theStyleSheetSuitsItsParser_data()
+{
+    QTest::addColumn<QString>("theme");
+    QTest::newRow("dark") << QStringLiteral("Dark");
+    QTest::newRow("light") << QStringLiteral("Light");
+}
+
+/// The parser and the drawing speak up through Qt warnings, which fail the test.
+void QtAdvancedStylesheetTest::theStyleSheetSuitsItsParser()
+{
+    QFETCH(QString, theme);
+    m_style->setCurrentTheme(theme);
+    m_style->applyTo(qApp);
+    QMainWindow window;
+    auto *const content = new QWidget;
+    fill(content);
+    window.setCentralWidget(content);
+    window.addDockWidget(Qt::LeftDockWidgetArea, new QDockWidget(QStringLiteral("Dock")));
+    window.resize(400, 900);
+    const QImage enabled = window.grab().toImage();
+    QCOMPARE(enabled.pixelColor(enabled.width() - 1, enabled.height() - 1),
+             m_style->color(QStringLiteral("window")));
+    content->setEnabled(false);
+    QVERIFY(window.grab().toImage() != enabled);
+}
+
+void QtAdvancedStylesheetTest::controlsAreEquallyHigh()
+{
+    m_style->applyTo(qApp);
+    QWidget window;
+    auto *const layout = new QHBoxLayout(&window);
+    const QList<QWidget *> controls{new QPushButton(QStringLiteral("Push")), new QLineEdit, new QComboBox,
+                                    new QSpinBox, new QDoubleSpinBox};
+    for (QWidget *const control : controls)
+        layout->addWidget(control);
+    window.grab(); // lays out
+    for (const QWidget *const control : controls)
+        QVERIFY2(control->height() == 28,
+                 qPrintable(QStringLiteral("%1: %2")
+                                .arg(QLatin1String(control->metaObject()->className()))
+                                .arg(control->height())));
+}
+
+void QtAdvancedStylesheetTest::applyingGivesFontAndPalette()
+{
+    m_style->applyTo(qApp);
+    QCOMPARE(QApplication::font().family(), QStringLiteral("Segoe UI"));
+    QCOMPARE(QApplication::font().pixelSize(), 13);
+    QCOMPARE(QApplication::palette().color(QPalette::Window), m_style->color(QStringLiteral("window")));
+    QCOMPARE(QApplication::palette().color(QPalette::WindowText), m_style->color(QStringLiteral("text")));
+    QCOMPARE(QApplication::palette().color(QPalette::Highlight), m_style->color(QStringLiteral("accent")));
+    QCOMPARE(QApplication::palette().color(QPalette::Disabled, QPalette::Text),
+             m_style->color(QStringLiteral("text-disabled")));
+    QCOMPARE(qApp->styleSheet(), m_style->styleSheet());
+}
+
+void QtAdvancedStylesheetTest::applyingToNothing()
+{
+    const QString before = qApp->styleSheet();
+    m_style->applyTo(nullptr);
+    QCOMPARE(qApp->styleSheet(), before);
+}
+
+void QtAdvancedStylesheetTest::freeFontsStandIn()
+{
+    QFont::removeSubstitutions(QStringLiteral("Segoe UI"));
+    QtAdvancedStylesheet::substituteFonts();
+    QtAdvancedStylesheet::substituteFonts();
+    QCOMPARE(QFont::substitutes(QStringLiteral("Segoe UI")),
+             QStringList(
+                 {QStringLiteral("open sans"), QStringLiteral("noto sans"), QStringLiteral("dejavu sans")}));
+}
+
+STATREPORT_TEST_MAIN(QtAdvancedStylesheetTest)
+#include "QtAdvancedStylesheetTest.moc"

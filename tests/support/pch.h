@@ -1,0 +1,5 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QtTest>
+#include <QtWidgets>
