@@ -74,8 +74,8 @@ private:
         drawLines(count + 1);
         m_painter.setPen(Qt::black);
         m_painter.setFont(m_headerFont);
-        drawRow(0, {QStringLiteral("Object Name"), QStringLiteral("Object Type"), QStringLiteral("Value Name"),
-                    QStringLiteral("Value")});
+        drawRow(0, {QStringLiteral("Object Name"), QStringLiteral("Object Type"),
+                    QStringLiteral("Value Name"), QStringLiteral("Value")});
         m_painter.setFont(m_bodyFont);
         for (int i = 0; i < count; ++i) {
             const KvMeasuredValue &record = records.at(first + i);
@@ -95,8 +95,8 @@ private:
     void drawRow(int row, const QStringList &texts)
     {
         for (int column = 0; column < texts.size(); ++column) {
-            const QRect cell(kLeft + column * kColumn + 6, kTop + row * KvTablePageSplit::RowHeight, kColumn - 12,
-                             KvTablePageSplit::RowHeight);
+            const QRect cell(kLeft + column * kColumn + 6, kTop + row * KvTablePageSplit::RowHeight,
+                             kColumn - 12, KvTablePageSplit::RowHeight);
             m_painter.drawText(cell, Qt::AlignLeft | Qt::AlignVCenter, texts.at(column));
         }
     }

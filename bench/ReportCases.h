@@ -29,5 +29,6 @@ private:
     std::unique_ptr<KvTemplateModel> m_model;
 };
 
-/** The same rows and pages drawn with bare QPainter calls on a QPdfWriter at 600 dpi: what printing costs at least. */
+/** The same rows and pages drawn with bare QPainter calls on a QPdfWriter at 600 dpi: what printing costs at
+ * least. */
 bool printFloor(const QString &fileName);

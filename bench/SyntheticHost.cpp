@@ -18,8 +18,7 @@ class LengthsData : public ZtKernelObjectData
 public:
     explicit LengthsData(double first)
         : m_first(first)
-    {
-    }
+    {}
     double length(int index) const { return m_first + 250.5 * index; }
 
 private:
@@ -34,8 +33,7 @@ public:
                            QStringLiteral("Depth")})
         , m_type(type)
         , m_typeName(QStringLiteral("Kind %1").arg(QChar(u'A' + type - kFirstType)))
-    {
-    }
+    {}
     int objectTypeId() const override { return m_type; }
     int typeFlags(int) const override { return MeasurementFlag; }
     QString objectTypeName(int) const override { return m_typeName; }
@@ -43,7 +41,8 @@ public:
     {
         return valueSet.contains(valueName);
     }
-    QVariant value(const QString &valueName, const ZtKernelObjectData *object, int &measureKind) const override
+    QVariant value(const QString &valueName, const ZtKernelObjectData *object,
+                   int &measureKind) const override
     {
         measureKind = Length;
         return length(valueName, object);
@@ -73,8 +72,9 @@ void fillSyntheticHost(int count)
     for (int i = 0; i < kTypes; ++i) {
         const int type = kFirstType + i;
         kernel->unregisterType(type);
-        kernel->registerType(type, std::make_unique<LengthsManipulator>(type),
-                             std::make_unique<ZtKernelObjectDataDescr>(type, QStringLiteral("kind%1").arg(i)));
+        kernel->registerType(
+            type, std::make_unique<LengthsManipulator>(type),
+            std::make_unique<ZtKernelObjectDataDescr>(type, QStringLiteral("kind%1").arg(i)));
     }
     for (int i = 0; i < count / kValues; ++i) {
         const double length = 1000.0 + (i * 7919) % 9000 + 0.125 * (i % 8);

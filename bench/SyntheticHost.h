@@ -2,7 +2,8 @@
 #pragma once
 
 /**
- * Fills the kernel with measured objects of four lengths each, so that benchmarks have records without an import.
+ * Fills the kernel with measured objects of four lengths each, so that benchmarks have records without an
+ * import.
  *
  * \param count number of values, a multiple of four; replaces what a former call made
  */

@@ -156,7 +156,8 @@ void printRatios(const RatioReporter &reporter)
 {
     std::printf("\n%-52s %8s   %6s\n", "ratio", "records", "times");
     for (const int size : {1000, 10000, 100000}) {
-        reporter.printRatio("rebuild of the records / the host's own calls", "rebuildRecords", "hostCalls", size);
+        reporter.printRatio("rebuild of the records / the host's own calls", "rebuildRecords", "hostCalls",
+                            size);
         reporter.printRatio("regrouping / a deep copy of the records", "regroup", "deepCopy", size);
     }
     for (const int size : {100, 1000, 10000})

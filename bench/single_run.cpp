@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// One case, once, for tools that count instructions or memory: statreport_single_run report|floor|data ROWS OUT.pdf
+// One case, once, for tools that count instructions or memory: statreport_single_run report|floor|data ROWS
+// OUT.pdf
 #include "ReportCases.h"
 #include "SyntheticHost.h"
 

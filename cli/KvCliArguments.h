@@ -26,21 +26,3 @@ struct KvCliArguments
     bool jsonErrors = false;
     bool quiet = false;
 };
-
-/** Outcome of reading a command line. */
-struct KvCliParseResult
-{
-    enum Kind { Run, ShowText, UsageError };
-
-    Kind kind = UsageError;
-    QString text; ///< help or version to show, or what is wrong with the usage
-    KvCliArguments arguments;
-};
-
-/** Reads command lines of statreport; prints nothing. */
-class KvCliParser
-{
-public:
-    /** \a arguments start with the program's name. */
-    static KvCliParseResult parse(const QStringList &arguments);
-};

@@ -32,7 +32,8 @@ bool KvCliHost::loadData(const KvCliArguments &arguments, const KvCliOutput &out
     ZtAppSettings::beginGroup(QStringLiteral("Measurement"));
     ZtAppSettings::setValue(QStringLiteral("MeasurementLabelsSignDigits"), arguments.digits);
     ZtAppSettings::endGroup();
-    const bool isLoaded = arguments.sessionPath.isEmpty() ? loadTable(arguments, output) : loadSession(arguments, output);
+    const bool isLoaded =
+        arguments.sessionPath.isEmpty() ? loadTable(arguments, output) : loadSession(arguments, output);
     if (!isLoaded)
         return false;
     ZtFault fault;
@@ -47,14 +48,15 @@ bool KvCliHost::loadSession(const KvCliArguments &arguments, const KvCliOutput &
 {
     ZtFault fault;
     KvCliSource source;
-    if (!source.open(arguments.sessionPath, &fault)
-        || !m_document->loadSession(source.path(), &fault, ZtMeasuringDocument::MissingImage::IsIgnored)) {
+    if (!source.open(arguments.sessionPath, &fault) ||
+        !m_document->loadSession(source.path(), &fault, ZtMeasuringDocument::MissingImage::IsIgnored)) {
         fault.file = source.displayName();
         output.error(fault);
         return false;
     }
     if (!m_document->imagePath().isEmpty() && !m_document->frameSource() && arguments.imagePath.isEmpty())
-        output.note(QStringLiteral("%1: the image %2 is missing").arg(source.displayName(), m_document->imagePath()));
+        output.note(
+            QStringLiteral("%1: the image %2 is missing").arg(source.displayName(), m_document->imagePath()));
     return true;
 }
 
@@ -70,8 +72,8 @@ bool KvCliHost::loadTable(const KvCliArguments &arguments, const KvCliOutput &ou
     ZtFault fault;
     QStringList notes;
     KvCliSource source;
-    if (!source.open(arguments.tablePath, &fault)
-        || !m_document->importTable(source.path(), options, &fault, &notes)) {
+    if (!source.open(arguments.tablePath, &fault) ||
+        !m_document->importTable(source.path(), options, &fault, &notes)) {
         fault.file = source.displayName();
         output.error(fault);
         return false;

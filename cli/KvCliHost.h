@@ -9,7 +9,8 @@ class KvReportKernelData;
 class ZtMeasuringDocument;
 struct KvCliArguments;
 
-/** What stands in for the measuring application: its document, the adapter of the plug-in, and the block types. */
+/** What stands in for the measuring application: its document, the adapter of the plug-in, and the block
+ * types. */
 class KvCliHost
 {
 public:

@@ -6,16 +6,19 @@
 #include <QJsonDocument>
 #include <QJsonObject>
 
+#include <cerrno>
 #include <cstdio>
+#include <cstring>
 
 #include <unistd.h>
 
 namespace {
 
-void write(FILE *stream, const QByteArray &bytes)
+bool write(FILE *stream, const QByteArray &bytes)
 {
-    std::fwrite(bytes.constData(), 1, static_cast<std::size_t>(bytes.size()), stream);
-    std::fflush(stream);
+    const auto size = static_cast<std::size_t>(bytes.size());
+    const bool isTaken = std::fwrite(bytes.constData(), 1, size, stream) == size;
+    return std::fflush(stream) == 0 && isTaken;
 }
 
 // One line, whatever a file's name or content brought into it.
@@ -26,14 +29,20 @@ QByteArray singleLine(const QString &text)
 
 } // namespace
 
-void KvCliOutput::result(const QString &text) const
+bool KvCliOutput::result(const QString &text) const
 {
-    write(stdout, text.toUtf8());
+    return result(text.toUtf8());
 }
 
-void KvCliOutput::result(const QByteArray &bytes) const
+bool KvCliOutput::result(const QByteArray &bytes) const
 {
-    write(stdout, bytes);
+    if (write(stdout, bytes))
+        return true;
+    ZtFault fault;
+    fault.message = QStringLiteral("cannot be written: ") + QString::fromLocal8Bit(std::strerror(errno));
+    fault.file = QStringLiteral("<standard output>");
+    error(fault);
+    return false;
 }
 
 void KvCliOutput::note(const QString &text) const

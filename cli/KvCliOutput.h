@@ -13,8 +13,9 @@ public:
     void setQuiet(bool quiet) { m_quiet = quiet; }
     bool isQuiet() const { return m_quiet; }
 
-    void result(const QString &text) const;
-    void result(const QByteArray &bytes) const;
+    /** False, with an error, when standard output does not take all of it. */
+    bool result(const QString &text) const;
+    bool result(const QByteArray &bytes) const;
 
     /** Something worth knowing that does not stop the work. */
     void note(const QString &text) const;

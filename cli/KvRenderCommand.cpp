@@ -26,6 +26,8 @@
 #include <cstdio>
 #include <cstring>
 
+#include <sys/stat.h>
+
 namespace {
 
 /** Passes the model's messages on to standard error. */
@@ -34,8 +36,7 @@ class CliMessages : public KvUserMessages
 public:
     explicit CliMessages(const KvCliOutput &output)
         : m_output(output)
-    {
-    }
+    {}
     void warn(const QString &title, const QString &text) override
     {
         Q_UNUSED(title)
@@ -57,6 +58,19 @@ bool isCompletePdf(const QString &path)
     return file.readAll().contains("%%EOF");
 }
 
+// As for any file that a program creates; a temporary file is its owner's only.
+QFileDevice::Permissions permissionsOfNewFiles()
+{
+    const mode_t mask = umask(0);
+    umask(mask);
+    QFileDevice::Permissions permissions = QFileDevice::ReadOwner | QFileDevice::WriteOwner;
+    if (!(mask & S_IRGRP))
+        permissions |= QFileDevice::ReadGroup;
+    if (!(mask & S_IROTH))
+        permissions |= QFileDevice::ReadOther;
+    return permissions;
+}
+
 QString htmlText(const KvBaseEditorNodeCfg &cfg)
 {
     QJsonObject object;
@@ -72,8 +86,7 @@ QString htmlText(const KvBaseEditorNodeCfg &cfg)
 KvRenderCommand::KvRenderCommand(const KvCliArguments &arguments, const KvCliOutput &output)
     : m_arguments(arguments)
     , m_output(output)
-{
-}
+{}
 
 int KvRenderCommand::run()
 {
@@ -84,7 +97,8 @@ int KvRenderCommand::run()
         m_output.error(fault);
         return 1;
     }
-    if (!checkTemplate(host, templateFile.path(), templateFile.displayName()) || !host.loadData(m_arguments, m_output))
+    if (!checkTemplate(host, templateFile.path(), templateFile.displayName()) ||
+        !host.loadData(m_arguments, m_output))
         return 1;
 
     CliMessages messages(m_output);
@@ -115,7 +129,8 @@ void KvRenderCommand::noteMissingGlyphs(KvCliHost &host, KvTemplateModel &model)
 {
     ZtFontCoverage coverage(QFont(QStringLiteral("Segoe UI")));
     for (const KvMeasuredValue &record : host.kernelData().measuredValues()) {
-        for (const QString &text : {record.objectName, record.objectTypeName, record.valueName, record.valueText})
+        for (const QString &text :
+             {record.objectName, record.objectTypeName, record.valueName, record.valueText})
             coverage.addText(text);
     }
     for (const KvReportNode *node : model.nodes())
@@ -124,29 +139,31 @@ void KvRenderCommand::noteMissingGlyphs(KvCliHost &host, KvTemplateModel &model)
     coverage.addText(model.footer()->text());
     const QString missing = coverage.missingCharacters();
     if (!missing.isEmpty())
-        m_output.note(QStringLiteral("no installed font has these characters, they are left out: ") + missing.left(40));
+        m_output.note(QStringLiteral("no installed font has these characters, they are left out: ") +
+                      missing.left(40));
 }
 
 bool KvRenderCommand::print(KvTemplateModel &model) const
 {
     if (m_arguments.outputPath == QLatin1String("-"))
-        return printToStandardOutput(model);
+        return printThroughCopy(model);
     const QFileInfo target(m_arguments.outputPath);
     // Into devices and the like directly; a file only gets its new content when all of it is there.
     if (target.exists() && !target.isFile())
         return target.isDir() ? failToWrite(m_arguments.outputPath, QStringLiteral("is a directory"))
-                              : printToFile(model, m_arguments.outputPath);
-    QTemporaryFile part(target.absolutePath() + QStringLiteral("/.statreport-XXXXXX.pdf"));
+                              : printThroughCopy(model);
+    // A link stays one: what it points to is replaced.
+    const QString path =
+        target.isSymLink() && target.exists() ? target.canonicalFilePath() : target.absoluteFilePath();
+    QTemporaryFile part(QFileInfo(path).absolutePath() + QStringLiteral("/.statreport-XXXXXX.pdf"));
     if (!part.open())
         return failToWrite(m_arguments.outputPath, part.errorString());
     part.close();
     if (!printToFile(model, part.fileName()))
         return false;
-    // As for a file that a program creates; a temporary file starts readable for its owner only.
-    QFile::setPermissions(part.fileName(), QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ReadGroup
-                                               | QFileDevice::ReadOther);
+    QFile::setPermissions(part.fileName(), target.exists() ? target.permissions() : permissionsOfNewFiles());
     const QByteArray partName = QFile::encodeName(part.fileName());
-    if (std::rename(partName.constData(), QFile::encodeName(target.absoluteFilePath()).constData()) != 0)
+    if (std::rename(partName.constData(), QFile::encodeName(path).constData()) != 0)
         return failToWrite(m_arguments.outputPath, QString::fromLocal8Bit(std::strerror(errno)));
     part.setAutoRemove(false);
     return true;
@@ -157,24 +174,31 @@ bool KvRenderCommand::printToFile(KvTemplateModel &model, const QString &path) c
     KvTerminalProgress progress(m_output);
     const bool isPrinted = model.print(path, &progress) != 0;
     progress.finish();
-    const QFileInfo file(path);
-    if (!isPrinted || (file.isFile() && !isCompletePdf(path)))
-        return failToWrite(m_arguments.outputPath, QStringLiteral("the file could not be written completely"));
+    if (!isPrinted || !isCompletePdf(path))
+        return failToWrite(m_arguments.outputPath,
+                           QStringLiteral("the file could not be written completely"));
     return true;
 }
 
-bool KvRenderCommand::printToStandardOutput(KvTemplateModel &model) const
+bool KvRenderCommand::printThroughCopy(KvTemplateModel &model) const
 {
+    const bool isStandardOutput = m_arguments.outputPath == QLatin1String("-");
+    const QString name = isStandardOutput ? QStringLiteral("<standard output>") : m_arguments.outputPath;
     QTemporaryFile part;
     if (!part.open())
-        return failToWrite(QStringLiteral("<standard output>"), part.errorString());
+        return failToWrite(name, part.errorString());
     if (!printToFile(model, part.fileName()))
         return false;
     QFile written(part.fileName());
     if (!written.open(QIODevice::ReadOnly))
-        return failToWrite(QStringLiteral("<standard output>"), written.errorString());
-    m_output.result(written.readAll());
-    return std::ferror(stdout) == 0;
+        return failToWrite(name, written.errorString());
+    const QByteArray bytes = written.readAll();
+    if (isStandardOutput)
+        return m_output.result(bytes);
+    QFile target(m_arguments.outputPath);
+    if (!target.open(QIODevice::WriteOnly | QIODevice::Unbuffered) || target.write(bytes) != bytes.size())
+        return failToWrite(name, target.errorString());
+    return true;
 }
 
 bool KvRenderCommand::failToWrite(const QString &path, const QString &reason) const

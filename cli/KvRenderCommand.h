@@ -20,7 +20,8 @@ private:
     bool checkTemplate(KvCliHost &host, const QString &path, const QString &displayName) const;
     bool print(KvTemplateModel &model) const;
     bool printToFile(KvTemplateModel &model, const QString &path) const;
-    bool printToStandardOutput(KvTemplateModel &model) const;
+    /** For targets that cannot be replaced: standard output and devices. */
+    bool printThroughCopy(KvTemplateModel &model) const;
     void noteMissingGlyphs(KvCliHost &host, KvTemplateModel &model) const;
     bool failToWrite(const QString &path, const QString &reason) const;
 

@@ -12,8 +12,7 @@
 KvStatsCommand::KvStatsCommand(const KvCliArguments &arguments, const KvCliOutput &output)
     : m_arguments(arguments)
     , m_output(output)
-{
-}
+{}
 
 int KvStatsCommand::run()
 {
@@ -23,16 +22,17 @@ int KvStatsCommand::run()
     host.kernelData().setActive(true);
     const KvStatsReport report(KvStatisticsEngine::instance(), host.document(), m_arguments.groupByObject);
     host.kernelData().setActive(false);
+    bool isWritten = false;
     switch (m_arguments.format) {
     case KvCliArguments::Csv:
-        m_output.result(report.toCsv());
+        isWritten = m_output.result(report.toCsv());
         break;
     case KvCliArguments::Json:
-        m_output.result(report.toJson());
+        isWritten = m_output.result(report.toJson());
         break;
     default:
-        m_output.result(report.toText());
+        isWritten = m_output.result(report.toText());
         break;
     }
-    return 0;
+    return isWritten ? 0 : 1;
 }

@@ -14,6 +14,7 @@
 #include <algorithm>
 #include <cmath>
 #include <functional>
+#include <optional>
 
 namespace {
 
@@ -27,17 +28,37 @@ struct Scale
     std::function<double(double)> convert;
 };
 
-Scale scaleOf(const ZtMeasuringDocument &document, const QString &objectType, const KvValueGroup &group,
-              const QString &valueName)
+/** The unit in which tables gave all values of a group; none when they were drawn or given in several units.
+ */
+std::optional<ZtUnit> givenUnit(const ZtMeasuringDocument &document, const KvValueGroup &group)
+{
+    std::optional<ZtUnit> common;
+    QString typeName;
+    for (const KvMeasuredValue &record : group) {
+        if (!common || record.objectTypeName != typeName) {
+            typeName = record.objectTypeName;
+            const std::optional<ZtUnit> unit = document.importedUnit(typeName, record.valueName);
+            if (!unit || (common && *unit != *common))
+                return std::nullopt;
+            common = unit;
+        }
+        // A value may have another unit than its column; its text tells.
+        if (!common->isEmpty() && !record.valueText.endsWith(QLatin1Char(' ') + common->text()))
+            return std::nullopt;
+    }
+    return common;
+}
+
+Scale scaleOf(const ZtMeasuringDocument &document, const KvValueGroup &group)
 {
     const int kind = group.first().measureKind;
-    if (const std::optional<ZtUnit> unit = document.importedUnit(objectType, valueName)) {
+    if (const std::optional<ZtUnit> unit = givenUnit(document, group)) {
         const double factor = unit->factor();
         return {unit->text(), [factor](double value) { return value / factor; }};
     }
     const QPair<QVariant, QVariant> range = KvStatisticsEngine::range(group);
-    const int unit = KvStatisticsUnitConverter::commonUnit(KvStatisticsEngine::numericValue(range.first),
-                                                           KvStatisticsEngine::numericValue(range.second), kind);
+    const int unit = KvStatisticsUnitConverter::commonUnit(
+        KvStatisticsEngine::numericValue(range.first), KvStatisticsEngine::numericValue(range.second), kind);
     return {KvStatisticsUnitConverter::unitText(unit),
             [kind, unit](double value) { return KvStatisticsUnitConverter::convert(value, kind, unit); }};
 }
@@ -56,7 +77,8 @@ QString readableNumber(double value)
     if (before > 15 || before < -9)
         return number(value, kTextDigits);
     QString text = QString::number(value, 'f', std::max(kTextDigits - before, 0));
-    while (text.contains(QLatin1Char('.')) && (text.endsWith(QLatin1Char('0')) || text.endsWith(QLatin1Char('.')))) {
+    while (text.contains(QLatin1Char('.')) &&
+           (text.endsWith(QLatin1Char('0')) || text.endsWith(QLatin1Char('.')))) {
         const bool isPoint = text.endsWith(QLatin1Char('.'));
         text.chop(1);
         if (isPoint)
@@ -67,8 +89,8 @@ QString readableNumber(double value)
 
 QString csvField(const QString &text)
 {
-    const bool needsQuotes = text.contains(QLatin1Char(',')) || text.contains(QLatin1Char('"'))
-        || text.contains(QLatin1Char('\n')) || text.contains(QLatin1Char('\r'));
+    const bool needsQuotes = text.contains(QLatin1Char(',')) || text.contains(QLatin1Char('"')) ||
+                             text.contains(QLatin1Char('\n')) || text.contains(QLatin1Char('\r'));
     if (!needsQuotes)
         return text;
     QString quoted = text;
@@ -82,25 +104,28 @@ QStringList headings(bool groupByObject)
     if (groupByObject)
         names.append(QStringLiteral("Object Type"));
     names << QStringLiteral("Measurement Type") << QStringLiteral("Unit") << QStringLiteral("Count")
-          << QStringLiteral("Min") << QStringLiteral("Max") << QStringLiteral("Average") << QStringLiteral("Sigma")
-          << QStringLiteral("3 Sigma") << QStringLiteral("6 Sigma");
+          << QStringLiteral("Min") << QStringLiteral("Max") << QStringLiteral("Average")
+          << QStringLiteral("Sigma") << QStringLiteral("3 Sigma") << QStringLiteral("6 Sigma");
     return names;
 }
 
-QStringList fields(const KvGroupStatistics &group, bool groupByObject, const std::function<QString(double)> &format)
+QStringList fields(const KvGroupStatistics &group, bool groupByObject,
+                   const std::function<QString(double)> &format)
 {
     QStringList texts;
     if (groupByObject)
         texts.append(group.objectType);
     texts << group.valueName << group.unit << QString::number(group.count);
-    for (const double value : {group.min, group.max, group.average, group.sigma, 3 * group.sigma, 6 * group.sigma})
+    for (const double value :
+         {group.min, group.max, group.average, group.sigma, 3 * group.sigma, 6 * group.sigma})
         texts.append(format(value));
     return texts;
 }
 
 } // namespace
 
-KvStatsReport::KvStatsReport(const KvStatisticsEngine &engine, const ZtMeasuringDocument &document, bool groupByObject)
+KvStatsReport::KvStatsReport(const KvStatisticsEngine &engine, const ZtMeasuringDocument &document,
+                             bool groupByObject)
     : m_groupByObject(groupByObject)
 {
     if (!groupByObject) {
@@ -117,7 +142,8 @@ KvStatsReport::KvStatsReport(const KvStatisticsEngine &engine, const ZtMeasuring
 void KvStatsReport::addGroup(const KvStatisticsEngine &engine, const ZtMeasuringDocument &document,
                              const QString &objectType, const QString &valueName)
 {
-    const KvValueGroup &values = m_groupByObject ? engine.values(objectType, valueName) : engine.values(valueName);
+    const KvValueGroup &values =
+        m_groupByObject ? engine.values(objectType, valueName) : engine.values(valueName);
     KvGroupStatistics group;
     if (!KvStatisticsEngine::fiveNumbers(values, group.min, group.q1, group.median, group.q3, group.max))
         return;
@@ -135,9 +161,10 @@ void KvStatsReport::addGroup(const KvStatisticsEngine &engine, const ZtMeasuring
     group.averageText = KvStatisticsUnitConverter::formatValue(group.average, kind, automatic);
     group.sigmaText = KvStatisticsUnitConverter::formatValue(group.sigma, kind, automatic);
 
-    const Scale scale = scaleOf(document, objectType, values, valueName);
+    const Scale scale = scaleOf(document, values);
     group.unit = scale.unit;
-    for (double *value : {&group.min, &group.q1, &group.median, &group.q3, &group.max, &group.average, &group.sigma})
+    for (double *value :
+         {&group.min, &group.q1, &group.median, &group.q3, &group.max, &group.average, &group.sigma})
         *value = scale.convert(*value);
     m_groups.append(group);
 }
@@ -157,7 +184,8 @@ QString KvStatsReport::toText() const
     for (const QStringList &row : qAsConst(rows)) {
         QString line;
         for (int i = 0; i < row.size(); ++i) {
-            line += i < textColumns ? row.at(i).leftJustified(widths.at(i)) : row.at(i).rightJustified(widths.at(i));
+            line += i < textColumns ? row.at(i).leftJustified(widths.at(i))
+                                    : row.at(i).rightJustified(widths.at(i));
             line += QLatin1String("  ");
         }
         text += line.trimmed() + QLatin1Char('\n');
@@ -182,28 +210,29 @@ QByteArray KvStatsReport::toJson() const
 {
     QJsonArray groups;
     for (const KvGroupStatistics &group : m_groups) {
-        QJsonObject object{{QStringLiteral("measurementType"), group.valueName},
-                           {QStringLiteral("unit"), group.unit},
-                           {QStringLiteral("count"), group.count},
-                           {QStringLiteral("min"), group.min},
-                           {QStringLiteral("lowerQuartile"), group.q1},
-                           {QStringLiteral("median"), group.median},
-                           {QStringLiteral("upperQuartile"), group.q3},
-                           {QStringLiteral("max"), group.max},
-                           {QStringLiteral("average"), group.average},
-                           {QStringLiteral("sigma"), group.sigma},
-                           {QStringLiteral("sigma3"), 3 * group.sigma},
-                           {QStringLiteral("sigma6"), 6 * group.sigma},
-                           {QStringLiteral("texts"), QJsonObject{{QStringLiteral("Min"), group.minText},
-                                                                 {QStringLiteral("Max"), group.maxText},
-                                                                 {QStringLiteral("Average"), group.averageText},
-                                                                 {QStringLiteral("Sigma"), group.sigmaText}}}};
+        QJsonObject object{
+            {QStringLiteral("measurementType"), group.valueName},
+            {QStringLiteral("unit"), group.unit},
+            {QStringLiteral("count"), group.count},
+            {QStringLiteral("min"), group.min},
+            {QStringLiteral("lowerQuartile"), group.q1},
+            {QStringLiteral("median"), group.median},
+            {QStringLiteral("upperQuartile"), group.q3},
+            {QStringLiteral("max"), group.max},
+            {QStringLiteral("average"), group.average},
+            {QStringLiteral("sigma"), group.sigma},
+            {QStringLiteral("sigma3"), 3 * group.sigma},
+            {QStringLiteral("sigma6"), 6 * group.sigma},
+            {QStringLiteral("texts"), QJsonObject{{QStringLiteral("Min"), group.minText},
+                                                  {QStringLiteral("Max"), group.maxText},
+                                                  {QStringLiteral("Average"), group.averageText},
+                                                  {QStringLiteral("Sigma"), group.sigmaText}}}};
         if (m_groupByObject)
             object.insert(QStringLiteral("objectType"), group.objectType);
         groups.append(object);
     }
-    const QJsonObject root{{QStringLiteral("groupBy"), m_groupByObject ? QStringLiteral("object")
-                                                                       : QStringLiteral("measurement")},
+    const QJsonObject root{{QStringLiteral("groupBy"),
+                            m_groupByObject ? QStringLiteral("object") : QStringLiteral("measurement")},
                            {QStringLiteral("groups"), groups}};
     return QJsonDocument(root).toJson();
 }

@@ -32,8 +32,8 @@ class KvStatsReport
 {
 public:
     /**
-     * The numbers are in the unit in which a table gave the values. Values that were drawn, or that a table gave in
-     * several units, are in one unit that suits the whole group.
+     * The numbers are in the unit in which a table gave the values. Values that were drawn, or that a table
+     * gave in several units, are in one unit that suits the whole group.
      */
     KvStatsReport(const KvStatisticsEngine &engine, const ZtMeasuringDocument &document, bool groupByObject);
 
@@ -44,8 +44,8 @@ public:
     QByteArray toJson() const;
 
 private:
-    void addGroup(const KvStatisticsEngine &engine, const ZtMeasuringDocument &document, const QString &objectType,
-                  const QString &valueName);
+    void addGroup(const KvStatisticsEngine &engine, const ZtMeasuringDocument &document,
+                  const QString &objectType, const QString &valueName);
 
     bool m_groupByObject;
     QVector<KvGroupStatistics> m_groups;

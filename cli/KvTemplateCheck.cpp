@@ -46,7 +46,8 @@ QJsonObject defaultConfig(KvBaseEditorNodeFactory &factory)
     return object;
 }
 
-// Why a configuration was refused: the first key that is missing or of another type than the block writes it with.
+// Why a configuration was refused: the first key that is missing or of another type than the block writes it
+// with.
 QString refusalOf(const QJsonObject &config, const QJsonObject &defaults)
 {
     for (auto it = defaults.constBegin(); it != defaults.constEnd(); ++it) {
@@ -54,7 +55,8 @@ QString refusalOf(const QJsonObject &config, const QJsonObject &defaults)
         if (value.isUndefined())
             return QStringLiteral("\"%1\" is missing").arg(it.key());
         if (value.type() != it.value().type())
-            return QStringLiteral("\"%1\" is %2, not %3").arg(it.key(), typeText(value), typeText(it.value()));
+            return QStringLiteral("\"%1\" is %2, not %3")
+                .arg(it.key(), typeText(value), typeText(it.value()));
     }
     return QStringLiteral("the block refuses its settings");
 }
@@ -63,8 +65,7 @@ QString refusalOf(const QJsonObject &config, const QJsonObject &defaults)
 
 KvTemplateCheck::KvTemplateCheck(const KvBlockRegistry &blocks)
     : m_blocks(blocks)
-{
-}
+{}
 
 bool KvTemplateCheck::run(const QString &path, const QString &displayName)
 {
@@ -119,7 +120,8 @@ bool KvTemplateCheck::readRoot(const QString &path, QJsonObject &root)
 void KvTemplateCheck::checkPage(const QJsonValue &config)
 {
     if (!config.isObject()) {
-        warn(QStringLiteral("config"), QStringLiteral("is %1; the page keeps its defaults").arg(typeText(config)));
+        warn(QStringLiteral("config"),
+             QStringLiteral("is %1; the page keeps its defaults").arg(typeText(config)));
         return;
     }
     const QJsonValue width = config.toObject().value(QStringLiteral("pageWidth"));
@@ -130,7 +132,8 @@ void KvTemplateCheck::checkPage(const QJsonValue &config)
         m_contents.append(QStringLiteral("page width %1 px").arg(pixels));
     const QJsonValue margin = config.toObject().value(QStringLiteral("marginWidth"));
     if (!margin.isUndefined() && (!margin.isDouble() || margin.toDouble() < 0.0 || margin.toDouble() >= 0.5))
-        warn(QStringLiteral("config.marginWidth"), QStringLiteral("is no fraction of the page width from 0 to 0.5"));
+        warn(QStringLiteral("config.marginWidth"),
+             QStringLiteral("is no fraction of the page width from 0 to 0.5"));
 }
 
 void KvTemplateCheck::checkSection(const QString &key, const QJsonValue &section)
@@ -144,9 +147,11 @@ void KvTemplateCheck::checkSection(const QString &key, const QJsonValue &section
     const QJsonValue enabled = section.toObject().value(QStringLiteral("enabled"));
     const QJsonValue text = section.toObject().value(QStringLiteral("text"));
     if (!enabled.isUndefined() && !enabled.isBool())
-        warn(key + QStringLiteral(".enabled"), QStringLiteral("is %1, not a boolean; it is off").arg(typeText(enabled)));
+        warn(key + QStringLiteral(".enabled"),
+             QStringLiteral("is %1, not a boolean; it is off").arg(typeText(enabled)));
     else if (enabled.toBool() && !text.isString())
-        warn(key + QStringLiteral(".text"), QStringLiteral("is %1, not a string; the section is off").arg(typeText(text)));
+        warn(key + QStringLiteral(".text"),
+             QStringLiteral("is %1, not a string; the section is off").arg(typeText(text)));
     else if (enabled.toBool())
         m_contents.append(key);
     checkKeywords(key + QStringLiteral(".text"), text.toString());
@@ -155,7 +160,8 @@ void KvTemplateCheck::checkSection(const QString &key, const QJsonValue &section
 bool KvTemplateCheck::checkNodes(const QJsonValue &nodes)
 {
     if (!nodes.isArray()) {
-        warn(QStringLiteral("nodes"), QStringLiteral("is %1, not an array; there are no blocks").arg(typeText(nodes)));
+        warn(QStringLiteral("nodes"),
+             QStringLiteral("is %1, not an array; there are no blocks").arg(typeText(nodes)));
         return true;
     }
     const QJsonArray array = nodes.toArray();
@@ -170,11 +176,13 @@ bool KvTemplateCheck::checkNode(const QString &place, const QJsonValue &node)
 {
     const QJsonValue name = node.toObject().value(QStringLiteral("name"));
     if (!name.isString()) {
-        warn(place + QStringLiteral(".name"), QStringLiteral("is %1, not a string; the block is skipped").arg(typeText(name)));
+        warn(place + QStringLiteral(".name"),
+             QStringLiteral("is %1, not a string; the block is skipped").arg(typeText(name)));
         return true;
     }
     if (!m_blocks.find(name.toString())) {
-        warn(place, QStringLiteral("there is no block type \"%1\"; the block is skipped").arg(name.toString()));
+        warn(place,
+             QStringLiteral("there is no block type \"%1\"; the block is skipped").arg(name.toString()));
         return true;
     }
     return checkConfig(place + QStringLiteral(".config"), name.toString(),
@@ -196,7 +204,9 @@ bool KvTemplateCheck::checkConfig(const QString &place, const QString &typeName,
         const QJsonValue expected = defaults.value(it.key());
         const QString member = place + QLatin1Char('.') + it.key();
         if (!expected.isUndefined() && expected.type() != it.value().type())
-            warn(member, QStringLiteral("is %1, not %2; it is ignored").arg(typeText(it.value()), typeText(expected)));
+            warn(
+                member,
+                QStringLiteral("is %1, not %2; it is ignored").arg(typeText(it.value()), typeText(expected)));
         checkKeywords(member, it.value().toString());
     }
     return true;

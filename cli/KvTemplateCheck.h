@@ -16,7 +16,8 @@ class KvTemplateCheck
 public:
     explicit KvTemplateCheck(const KvBlockRegistry &blocks);
 
-    /** Reads the file \a path, called \a displayName in faults. False when the template could not be used at all. */
+    /** Reads the file \a path, called \a displayName in faults. False when the template could not be used at
+     * all. */
     bool run(const QString &path, const QString &displayName);
 
     const ZtFault &fault() const { return m_fault; }

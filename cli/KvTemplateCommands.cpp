@@ -77,21 +77,19 @@ int check(const KvCliArguments &arguments, const KvCliOutput &output)
         text += line + QLatin1Char('\n');
     for (const QString &warning : check.warnings())
         text += QStringLiteral("warning: ") + warning + QLatin1Char('\n');
-    output.result(text);
+    const bool isWritten = output.result(text);
     if (!isUsable)
         output.error(check.fault());
-    return isUsable ? 0 : 1;
+    return isUsable && isWritten ? 0 : 1;
 }
 
 int blocks(const KvCliArguments &arguments, const KvCliOutput &output)
 {
     KvBlockTypeList registry;
     registerReportBlocks(registry);
-    if (arguments.format == KvCliArguments::Json)
-        output.result(blocksJson(registry));
-    else
-        output.result(blocksText(registry));
-    return 0;
+    const bool isWritten = arguments.format == KvCliArguments::Json ? output.result(blocksJson(registry))
+                                                                    : output.result(blocksText(registry));
+    return isWritten ? 0 : 1;
 }
 
 } // namespace KvTemplateCommands

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-#include "KvCliArguments.h"
 #include "KvCliOutput.h"
+#include "KvCliParser.h"
 #include "KvRenderCommand.h"
 #include "KvStatsCommand.h"
 #include "KvTemplateCommands.h"
@@ -41,7 +41,8 @@ int runApplication(int argc, char **argv, const KvCliArguments &arguments, const
 {
     if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
         qputenv("QT_QPA_PLATFORM", "offscreen");
-    // The same input gives the same output: no random order of keys, no settings of a user, one logical resolution.
+    // The same input gives the same output: no random order of keys, no settings of a user, one logical
+    // resolution.
     qSetGlobalQHashSeed(0);
     QCoreApplication::setAttribute(Qt::AA_Use96Dpi);
     QApplication application(argc, argv);
@@ -69,8 +70,7 @@ int main(int argc, char **argv)
     output.setJsonErrors(parsed.arguments.jsonErrors);
     output.setQuiet(parsed.arguments.quiet);
     if (parsed.kind == KvCliParseResult::ShowText) {
-        output.result(parsed.text);
-        return 0;
+        return output.result(parsed.text) ? 0 : 1;
     }
     if (parsed.kind == KvCliParseResult::UsageError) {
         output.error(parsed.text + QStringLiteral(" (statreport --help tells more)"));

@@ -44,7 +44,8 @@ bool ZtClassIndexTableReader::readTable()
     }
     if (hasFault() || rows == m_rowCount)
         return !hasFault();
-    return fail(m_firstLine, 1, tr("The first line announces %1 rows, but there are %2").arg(m_rowCount).arg(rows));
+    return fail(m_firstLine, 1,
+                tr("The first line announces %1 rows, but there are %2").arg(m_rowCount).arg(rows));
 }
 
 bool ZtClassIndexTableReader::readFirstRow()
@@ -96,8 +97,9 @@ bool ZtClassIndexTableReader::readClass(const ZtCsvRow &row, int *type)
 
 bool ZtClassIndexTableReader::readRow(const ZtCsvRow &row)
 {
-    if (row.fields.size() != static_cast<std::size_t>(m_valueCount) + 1)
-        return fail(row.line, qMin(static_cast<int>(row.fields.size()), m_valueCount + 1) + 1,
+    const std::size_t fieldCount = static_cast<std::size_t>(m_valueCount) + 1;
+    if (row.fields.size() != fieldCount)
+        return fail(row.line, static_cast<int>(qMin(row.fields.size(), fieldCount)) + 1,
                     tr("The row has %1 fields, but the first line announces %2 values and a class")
                         .arg(row.fields.size())
                         .arg(m_valueCount));

@@ -54,7 +54,8 @@ bool decode(const QString &path, qint64 pixelLimit, QImage *image, ZtFault *faul
     return isUsableSize(image->size(), pixelLimit, fault);
 }
 
-// Resolutions of screens, which programs write without meaning them, also those of screens scaled by 1.25 to 2.
+// Resolutions of screens, which programs write without meaning them, also those of screens scaled by 1.25
+// to 2.
 bool isMeaninglessResolution(int dotsPerMetre)
 {
     if (dotsPerMetre <= 0 || dotsPerMetre == QImage(1, 1, QImage::Format_RGB32).dotsPerMeterX())

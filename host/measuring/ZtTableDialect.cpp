@@ -41,6 +41,8 @@ bool isBetter(const Candidate &a, const Candidate &b)
 {
     if ((a.fields > 1) != (b.fields > 1))
         return a.fields > 1;
+    if (a.fields <= 1)
+        return false;
     if (a.consistency != b.consistency)
         return a.consistency > b.consistency;
     // Commas may as well be decimal marks; the others hardly ever mean anything else.

@@ -130,10 +130,10 @@ bool ZtTableReader::addNumber(const ZtCsvRow &row, int column, const Target &tar
         number.kind == ZtTableNumber::Infinite || !std::isfinite(unit.toBase(number.value));
     if (number.kind != ZtTableNumber::Number || isInfinite)
         return failNumber(row, column, isInfinite);
-    const bool isAdded = builder(target.type)
-                             .addCell(target.object, target.valueIndex, number.value,
-                                      ZtTableNumber::textOf(field, m_decimalComma), unit,
-                                      {row.line, column + 1});
+    const bool isAdded =
+        builder(target.type)
+            .addCell(target.object, target.valueIndex, number.value,
+                     ZtTableNumber::textOf(field, m_decimalComma), unit, {row.line, column + 1});
     return isAdded || failUnit(row, column, target, unit);
 }
 

@@ -34,7 +34,7 @@ ZtUnitSettings::ZtUnitSettings()
     read();
     ZtAppSettings *source = ZtAppSettings::getInstance();
     connect(source, SIGNAL(signalValuesModified(QStringList, QList<QVariant>)), this,
-            SLOT(slotValuesModified(QStringList, QList<QVariant>)));
+                           SLOT(slotValuesModified(QStringList, QList<QVariant>)));
     connect(source, SIGNAL(signalProfileChanged()), this, SLOT(slotProfileChanged()));
 }
 

@@ -8,7 +8,8 @@
 
 namespace kvCharts {
 
-/** The two colour themes of charts and tables, and which of them is current. Owned by a block's configuration. */
+/** The two colour themes of charts and tables, and which of them is current. Owned by a block's
+ * configuration. */
 class KvChartThemes : public QObject
 {
     Q_OBJECT
@@ -42,7 +43,8 @@ public:
 
     /** Selects a theme; returns whether it changed. */
     bool setTheme(kvCharts::KvChartThemes::ThemeType theme);
-    /** Selects a theme by its name ("Dark", "Light"). Any other text stores -1, which shows the Dark colours. */
+    /** Selects a theme by its name ("Dark", "Light"). Any other text stores -1, which shows the Dark colours.
+     */
     void setTheme(const QString &name);
     /** The name of the current theme; empty for an unknown one. */
     QString themeName() const;

@@ -8,8 +8,8 @@ namespace kvCharts {
 
 namespace {
 
-// The last entry lacks its '#': the colour parser refuses it, so that it is an invalid colour, which paints black.
-// Shipped that way and kept; made directly, as parsing it would print a warning.
+// The last entry lacks its '#': the colour parser refuses it, so that it is an invalid colour, which paints
+// black. Shipped that way and kept; made directly, as parsing it would print a warning.
 QVector<QColor> fixedColors()
 {
     static const char *const names[] = {"#ff5722", "#4caf50", "#ffc107", "#2196f3", "#da90e6",

@@ -9,8 +9,9 @@
 /** One measured value of one object of the host. */
 struct KvMeasuredValue
 {
-    qint32 objectType = 0;  ///< object type id of the host
-    qint32 valueClass = 0;  ///< class of the value inside its type, see KvReportKernelData::valueClass(); 0 = none
+    qint32 objectType = 0; ///< object type id of the host
+    qint32 valueClass =
+        0; ///< class of the value inside its type, see KvReportKernelData::valueClass(); 0 = none
     qint32 objectId = 0;    ///< id of the object within its type
     QString objectTypeName; ///< display name of the object type
     QString objectName;     ///< display name of the object

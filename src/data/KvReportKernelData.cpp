@@ -51,7 +51,8 @@ KvReportKernelData::KvReportKernelData(QObject *parent)
 
 KvReportKernelData::~KvReportKernelData()
 {
-    // A deferred deletion may come after the application has ended, so running timers must not fire into this object.
+    // A deferred deletion may come after the application has ended, so running timers must not fire into this
+    // object.
     if (m_refreshTimer)
         m_refreshTimer->stop();
     stopCameraTimer();
@@ -101,21 +102,22 @@ void KvReportKernelData::connectHost()
 {
     ZtSignalCenter *center = ZtSignalCenter::getInstance();
     connect(center, SIGNAL(signalObjectCreated(int, int, const ZtKernelObjectData *)), this,
-            SLOT(slotObjectCreated(int, int, const ZtKernelObjectData *)));
+                           SLOT(slotObjectCreated(int, int, const ZtKernelObjectData *)));
     connect(center, SIGNAL(signalObjectChanged(int, int, const ZtKernelObjectData *)), this,
-            SLOT(slotObjectChanged(int, int, const ZtKernelObjectData *)));
+                           SLOT(slotObjectChanged(int, int, const ZtKernelObjectData *)));
     connect(center, SIGNAL(signalObjectRemoved(int, int)), this, SLOT(slotObjectRemoved(int, int)));
     connect(center, SIGNAL(signalLengthUnitChanged()), this, SLOT(slotLengthUnitChanged()));
     connect(center, SIGNAL(signalAngleUnitChanged()), this, SLOT(slotAngleUnitChanged()));
     ZtAppSettings *settings = ZtAppSettings::getInstance();
     connect(settings, SIGNAL(signalValuesModified(QStringList, QList<QVariant>)), this,
-            SLOT(slotSettingsModified(QStringList, QList<QVariant>)));
+                             SLOT(slotSettingsModified(QStringList, QList<QVariant>)));
     connect(settings, SIGNAL(signalProfileChanged()), this, SLOT(slotProfileChanged()));
     m_connectedImage = m_kernelData->kernelImage();
     if (m_connectedImage) {
         // Direct: aHandled is a reference that the host reads when the emission returns.
         connect(m_connectedImage, SIGNAL(signalImageCompleted(FrameData, bool &)), this,
-                SLOT(slotImageFragmentReady(FrameData, bool &)), Qt::DirectConnection);
+                                         SLOT(slotImageFragmentReady(FrameData, bool &)),
+                                              Qt::DirectConnection);
     }
 }
 
@@ -136,8 +138,8 @@ void KvReportKernelData::startCameraTimer()
     if (m_cameraTimer->isActive())
         return;
     m_cameraTimer->setInterval(kCameraIntervalMs);
-    connect(m_cameraTimer.data(), SIGNAL(timeout()), this, SLOT(slotDelayedPrepareCameraImage()),
-            Qt::UniqueConnection);
+    connect(m_cameraTimer.data(), SIGNAL(timeout()), this,
+                                         SLOT(slotDelayedPrepareCameraImage()), Qt::UniqueConnection);
     m_cameraTimer->start();
 }
 
@@ -194,8 +196,8 @@ void KvReportKernelData::rebuildRecords()
     // A list that someone else still holds stays theirs; writing into it would copy every old record first.
     if (!m_values.isDetached())
         m_values.resize(0);
-    // Otherwise the old records are written over one by one. That frees their texts just before the new ones are
-    // made, which keeps the whole rebuild in the processor's caches.
+    // Otherwise the old records are written over one by one. That frees their texts just before the new ones
+    // are made, which keeps the whole rebuild in the processor's caches.
     int count = 0;
     const QMap<int, ZtObjectMap> &objects = m_kernelData->objects();
     for (auto it = objects.constBegin(); it != objects.constEnd(); ++it)
@@ -220,14 +222,15 @@ int KvReportKernelData::fillTypeRecords(int type, int count)
             continue;
         if (count + names.size() > m_values.size())
             m_values.resize(count + names.size() + kRoomStep);
-        count += fillObjectRecords(*manipulator, names, classes, object.key(), object.value(), m_values.data() + count);
+        count += fillObjectRecords(*manipulator, names, classes, object.key(), object.value(),
+                                   m_values.data() + count);
     }
     return count;
 }
 
 int KvReportKernelData::fillObjectRecords(const ZtGsManipulator &manipulator, const QStringList &names,
-                                          const QVector<int> &classes, int id, const ZtKernelObjectData *object,
-                                          KvMeasuredValue *records) const
+                                          const QVector<int> &classes, int id,
+                                          const ZtKernelObjectData *object, KvMeasuredValue *records) const
 {
     const QStringList shown = manipulator.valueSet(id);
     int count = 0;
@@ -300,8 +303,8 @@ void KvReportKernelData::slotAngleUnitChanged()
 
 bool KvReportKernelData::hasCameraReceivers() const
 {
-    return isSignalConnected(QMetaMethod::fromSignal(&KvReportKernelData::signalCameraImageChanged))
-        || isSignalConnected(QMetaMethod::fromSignal(&KvReportKernelData::signalCameraImageWithDataChanged));
+    return isSignalConnected(QMetaMethod::fromSignal(&KvReportKernelData::signalCameraImageChanged)) ||
+           isSignalConnected(QMetaMethod::fromSignal(&KvReportKernelData::signalCameraImageWithDataChanged));
 }
 
 void KvReportKernelData::requestCameraImage()

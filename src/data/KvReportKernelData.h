@@ -21,8 +21,8 @@ class iZTKernelImage;
 /**
  * The plug-in's only access to the host's measurements and camera image.
  *
- * Flattens the host's measured objects into a list of records, in the order of object type id, object id and the
- * manipulator's value names, and keeps the list current while it is active. All on the GUI thread.
+ * Flattens the host's measured objects into a list of records, in the order of object type id, object id and
+ * the manipulator's value names, and keeps the list current while it is active. All on the GUI thread.
  */
 class KvReportKernelData : public QObject
 {
@@ -32,8 +32,9 @@ public:
     ~KvReportKernelData() override;
 
     /**
-     * Reference-counted switch of live tracking: every view of live data calls it with true when it starts and with
-     * false when it ends. The records and pictures are kept while inactive. A surplus false is ignored.
+     * Reference-counted switch of live tracking: every view of live data calls it with true when it starts
+     * and with false when it ends. The records and pictures are kept while inactive. A surplus false is
+     * ignored.
      */
     void setActive(bool active);
     bool isActive() const { return m_activations > 0; }
@@ -88,9 +89,11 @@ private:
     void rebuildRecords();
     /** Fills the records of a type from index \a count on; returns the index behind them. */
     int fillTypeRecords(int type, int count);
-    /** Fills the records of one object from \a records on, which has room for all its values; returns their number. */
-    int fillObjectRecords(const ZtGsManipulator &manipulator, const QStringList &names, const QVector<int> &classes,
-                          int id, const ZtKernelObjectData *object, KvMeasuredValue *records) const;
+    /** Fills the records of one object from \a records on, which has room for all its values; returns their
+     * number. */
+    int fillObjectRecords(const ZtGsManipulator &manipulator, const QStringList &names,
+                          const QVector<int> &classes, int id, const ZtKernelObjectData *object,
+                          KvMeasuredValue *records) const;
     void requestCameraImage();
     bool hasCameraReceivers() const;
 

@@ -15,15 +15,14 @@ const KvValueGroup &emptyGroup()
     return group;
 }
 
-// Records come object by object, so value names repeat in a short cycle: remembering the last groups in their order
-// finds nearly every group with one comparison instead of a search in the map.
+// Records come object by object, so value names repeat in a short cycle: remembering the last groups in their
+// order finds nearly every group with one comparison instead of a search in the map.
 class GroupFinder
 {
 public:
     explicit GroupFinder(QMap<QString, KvValueGroup> *groups)
         : m_groups(groups)
-    {
-    }
+    {}
 
     KvValueGroup &find(const QString &name)
     {
@@ -61,15 +60,15 @@ int truncatedIndex(int index, int count)
     return std::min(index, count - 1);
 }
 
-// n / 4 + 1 serves every count but four, where it would yield the third value, the median: kept on purpose as an
-// exception, so that 1, 2, 3, 4 has the lower quartile 2.
+// n / 4 + 1 serves every count but four, where it would yield the third value, the median: kept on purpose as
+// an exception, so that 1, 2, 3, 4 has the lower quartile 2.
 int lowerQuartileIndex(int count)
 {
     return count == 4 ? 1 : truncatedIndex(count / 4 + 1, count);
 }
 
-// QVariant's own ordering, which keeps whole numbers whole and compares texts as texts. It is marked as deprecated for
-// not being total; a range needs no total order, and there is no public replacement.
+// QVariant's own ordering, which keeps whole numbers whole and compares texts as texts. It is marked as
+// deprecated for not being total; a range needs no total order, and there is no public replacement.
 QT_WARNING_PUSH
 QT_WARNING_DISABLE_DEPRECATED
 bool isLess(const QVariant &a, const QVariant &b)
@@ -103,7 +102,8 @@ void KvStatisticsEngine::setKernelData(KvReportKernelData *kernelData)
         disconnect(m_kernelData, nullptr, this, nullptr);
     m_kernelData = kernelData;
     if (m_kernelData)
-        connect(m_kernelData, SIGNAL(signalMeasuredValuesChanged()), this, SLOT(slotMeasurementsListUpdated()));
+        connect(m_kernelData, SIGNAL(signalMeasuredValuesChanged()), this,
+                                     SLOT(slotMeasurementsListUpdated()));
 }
 
 KvReportKernelData *KvStatisticsEngine::kernelData() const
@@ -136,7 +136,8 @@ void KvStatisticsEngine::slotMeasurementsListUpdated()
     emit signalMeasurementsListUpdating();
     m_byObjectType.clear();
     m_byValueName.clear();
-    const QVector<KvMeasuredValue> records = m_kernelData ? m_kernelData->measuredValues() : QVector<KvMeasuredValue>();
+    const QVector<KvMeasuredValue> records =
+        m_kernelData ? m_kernelData->measuredValues() : QVector<KvMeasuredValue>();
     GroupFinder byName(&m_byValueName);
     GroupFinder byNameOfType(nullptr);
     const QString *currentType = nullptr;
@@ -191,8 +192,8 @@ double KvStatisticsEngine::sigma(double mean, const KvValueGroup &group)
     return std::sqrt(sum);
 }
 
-bool KvStatisticsEngine::fiveNumbers(const KvValueGroup &group, double &min, double &q1, double &median, double &q3,
-                                     double &max)
+bool KvStatisticsEngine::fiveNumbers(const KvValueGroup &group, double &min, double &q1, double &median,
+                                     double &q3, double &max)
 {
     if (group.isEmpty())
         return false;
@@ -201,9 +202,8 @@ bool KvStatisticsEngine::fiveNumbers(const KvValueGroup &group, double &min, dou
     for (const KvMeasuredValue &record : group)
         sorted.append(numericValue(record.value));
     // NaN has no place in "<"; in front of everything the order stays a strict weak one.
-    std::sort(sorted.begin(), sorted.end(), [](double a, double b) {
-        return std::isnan(a) ? !std::isnan(b) : a < b;
-    });
+    std::sort(sorted.begin(), sorted.end(),
+              [](double a, double b) { return std::isnan(a) ? !std::isnan(b) : a < b; });
 
     const int count = sorted.size();
     min = sorted.first();

@@ -17,8 +17,8 @@ class KvReportKernelData;
 using KvValueGroup = QVector<KvMeasuredValue>;
 
 /**
- * Groups the measured records and computes statistics over groups. One engine per process; its maps are empty until
- * the data source first reports its records, and are rebuilt whole with every report.
+ * Groups the measured records and computes statistics over groups. One engine per process; its maps are empty
+ * until the data source first reports its records, and are rebuilt whole with every report.
  *
  * Groups are ordered by plain string comparison of their names (UTF-16 units, case-sensitive).
  */
@@ -52,13 +52,17 @@ public:
     static double average(const KvValueGroup &group);
     /** Population standard deviation (divisor n) about \a mean; 0 for an empty group. */
     static double sigma(double mean, const KvValueGroup &group);
-    /** Minimum, lower quartile, median, upper quartile, maximum; false (outputs untouched) for an empty group. */
-    static bool fiveNumbers(const KvValueGroup &group, double &min, double &q1, double &median, double &q3, double &max);
-    /** Least and greatest value by QVariant's ordering; the host's value types are kept. The group is not empty. */
+    /** Minimum, lower quartile, median, upper quartile, maximum; false (outputs untouched) for an empty
+     * group. */
+    static bool fiveNumbers(const KvValueGroup &group, double &min, double &q1, double &median, double &q3,
+                            double &max);
+    /** Least and greatest value by QVariant's ordering; the host's value types are kept. The group is not
+     * empty. */
     static QPair<QVariant, QVariant> range(const KvValueGroup &group);
     /**
-     * Least-squares line through (x, y) points as (slope, intercept); (0, 0) for fewer than two points. Points of
-     * equal x divide by zero: the result is then not finite, which callers that draw have to look at.
+     * Least-squares line through (x, y) points as (slope, intercept); (0, 0) for fewer than two points.
+     * Points of equal x divide by zero: the result is then not finite, which callers that draw have to look
+     * at.
      */
     static QPair<double, double> regression(const QVector<QPointF> &points);
     /** Smallest of 1, 2, 5, 10, 25, 50, 100, 250, 500, ... that lies in low..high; 0 when none does. */

@@ -64,7 +64,8 @@ ScaledNumber scaleToDigits(double value, uint significantDigits)
 {
     const int digits = static_cast<int>(std::min(significantDigits, kMaxDigits));
     // Truncated, not floored: 0.5 counts as one digit before the point, as 5 does; 0.05 as none.
-    const int before = value > 0.0 && std::isfinite(value) ? std::max(static_cast<int>(std::log10(value)) + 1, 0) : 0;
+    const int before =
+        value > 0.0 && std::isfinite(value) ? std::max(static_cast<int>(std::log10(value)) + 1, 0) : 0;
     if (before > digits)
         return {value / std::pow(10.0, before - digits), 1.0, before - digits};
     const double divisor = std::trunc(std::pow(10.0, digits - before));
@@ -90,8 +91,8 @@ ScaledNumber scaleByLadder(double value)
     return {value / 1000.0, 1000.0, 6};
 }
 
-// Only the exponents of the ladder have a superscript; a digits setting can yield others, which then read as a bare
-// factor of ten. Kept as it is.
+// Only the exponents of the ladder have a superscript; a digits setting can yield others, which then read as
+// a bare factor of ten. Kept as it is.
 QString exponentText(int exponent)
 {
     QString text;
@@ -179,13 +180,14 @@ QString KvStatisticsUnitConverter::formatNumber(double value)
 
 QString KvStatisticsUnitConverter::formatNumber(double value, uint significantDigits)
 {
-    const ScaledNumber scaled = significantDigits > 0 ? scaleToDigits(value, significantDigits) : scaleByLadder(value);
-    // Kept as a double: whole numbers beyond 32 bits occur from about 2.1e12 on, and values that are not finite have
-    // no integer. Halves of negative numbers round towards zero here, as they always did.
+    const ScaledNumber scaled =
+        significantDigits > 0 ? scaleToDigits(value, significantDigits) : scaleByLadder(value);
+    // Kept as a double: whole numbers beyond 32 bits occur from about 2.1e12 on, and values that are not
+    // finite have no integer. Halves of negative numbers round towards zero here, as they always did.
     const double mantissa = std::trunc(scaled.mantissa + 0.5);
     const int decimals = static_cast<int>(std::lround(std::log10(scaled.divisor)));
-    const QString text = mantissa == 0.0 ? QStringLiteral("0")
-                                         : QString::number(mantissa / scaled.divisor, 'f', decimals);
+    const QString text =
+        mantissa == 0.0 ? QStringLiteral("0") : QString::number(mantissa / scaled.divisor, 'f', decimals);
     return text + exponentText(scaled.exponent);
 }
 

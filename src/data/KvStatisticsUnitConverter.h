@@ -5,9 +5,9 @@
 #include <QVariant>
 
 /**
- * Turns measured numbers into display texts with an automatically chosen unit and the user's significant digits, so
- * that the same measurement reads the same everywhere. Measure kinds: 1 length, 2 area, 3 angle, 4 count,
- * 5 percentage; any other has no unit. Base units are the micrometre and the square micrometre.
+ * Turns measured numbers into display texts with an automatically chosen unit and the user's significant
+ * digits, so that the same measurement reads the same everywhere. Measure kinds: 1 length, 2 area, 3 angle, 4
+ * count, 5 percentage; any other has no unit. Base units are the micrometre and the square micrometre.
  */
 class KvStatisticsUnitConverter
 {

@@ -59,7 +59,8 @@ void KvEditorToolWidget::mousePressEvent(QMouseEvent *event)
 
 void KvEditorToolWidget::mouseMoveEvent(QMouseEvent *event)
 {
-    if (!m_isPressed || (event->pos() - m_pressPosition).manhattanLength() < QApplication::startDragDistance())
+    if (!m_isPressed ||
+        (event->pos() - m_pressPosition).manhattanLength() < QApplication::startDragDistance())
         return;
     m_isPressed = false;
     startDrag();

@@ -5,8 +5,7 @@
 
 KvBaseDisplayWidget::KvBaseDisplayWidget()
     : m_signals(std::make_unique<KvBaseDisplayWidgetSignals>())
-{
-}
+{}
 
 KvBaseDisplayWidget::~KvBaseDisplayWidget() = default;
 

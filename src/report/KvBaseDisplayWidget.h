@@ -11,8 +11,8 @@ class QWidget;
 /**
  * Interface of every block's display widget, which is laid out in one or more pieces.
  *
- * Implemented beside a QWidget or QObject base. The signals object dies in this class's destructor, when the derived
- * class is already gone: what is connected to its destroyed() may only clear pointers.
+ * Implemented beside a QWidget or QObject base. The signals object dies in this class's destructor, when the
+ * derived class is already gone: what is connected to its destroyed() may only clear pointers.
  */
 class KvBaseDisplayWidget
 {

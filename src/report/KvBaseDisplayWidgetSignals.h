@@ -13,8 +13,8 @@ public:
     KvBaseDisplayWidgetSignals();
 
 signals:
-    void signalWidgetChanged();                                          ///< a piece changed its size or content
-    void signalWidgetConfigChanged(const KvBaseEditorNodeCfg *aCfg);     ///< the user changed the block's options
-    void signalSubWidgetsChanged();                                      ///< number or identity of the pieces changed
-    void signalFocusBackToPageView();                                    ///< an inline editor gave up the keyboard focus
+    void signalWidgetChanged();                                      ///< a piece changed its size or content
+    void signalWidgetConfigChanged(const KvBaseEditorNodeCfg *aCfg); ///< the user changed the block's options
+    void signalSubWidgetsChanged();   ///< number or identity of the pieces changed
+    void signalFocusBackToPageView(); ///< an inline editor gave up the keyboard focus
 };

@@ -19,8 +19,9 @@ KvNodeWrapperWidget::KvNodeWrapperWidget(KvReportNode *node, QWidget *piece)
 
 void KvNodeWrapperWidget::applyStyle()
 {
-    // On paper a piece that paints all of itself needs no background from us. Style sheets are polished for every
-    // widget below them, each time one gets a new parent: hundreds of pages would spend more on them than on painting.
+    // On paper a piece that paints all of itself needs no background from us. Style sheets are polished for
+    // every widget below them, each time one gets a new parent: hundreds of pages would spend more on them
+    // than on painting.
     if (m_node->context()->isPrinting() && m_piece->testAttribute(Qt::WA_OpaquePaintEvent)) {
         setAttribute(Qt::WA_OpaquePaintEvent);
         return;
@@ -49,6 +50,9 @@ void KvNodeWrapperWidget::setMargin(int pixels)
 void KvNodeWrapperWidget::fitToPiece()
 {
     ensurePolished();
+    // The layout keeps the size that it was told last; not every piece tells it of another one.
+    if (m_piece)
+        m_piece->updateGeometry();
     layout()->activate();
     // Not adjustSize(): it would cap the frame, a window of its own, at two thirds of the screen.
     const QSize wanted = sizeHint();

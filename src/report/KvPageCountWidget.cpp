@@ -9,6 +9,9 @@ KvPageCountWidget::KvPageCountWidget(QWidget *parent, int pageIndex)
 {
     setObjectName(QStringLiteral("pageCount"));
     setStyleSheet(QStringLiteral("QLabel{color: black;}"));
+    // It stands on the page as a window of its own, which would paint the program's window colour over the
+    // paper.
+    setAttribute(Qt::WA_TranslucentBackground);
     // "1/10" must not turn around in a program that reads from right to left.
     setLayoutDirection(Qt::LeftToRight);
     // Plain text spares the check for rich text at each change.

@@ -6,7 +6,9 @@
 #include <QLabel>
 
 /** The page number in a page's corner: "2" until the number of pages is known, "2/7" then. */
-class KvPageCountWidget : public QLabel, public KvBaseDisplayWidget
+class KvPageCountWidget
+    : public QLabel
+    , public KvBaseDisplayWidget
 {
     Q_OBJECT
 public:

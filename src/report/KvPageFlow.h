@@ -7,22 +7,26 @@
 
 #include <functional>
 
-/** Where a piece stands: page index and top-left corner in the coordinates of the pages' content rectangles. */
+/** Where a piece stands: page index and top-left corner in the coordinates of the pages' content rectangles.
+ */
 struct KvPlacedPiece
 {
     int page = 0;
     QPoint topLeft;
 
-    bool operator==(const KvPlacedPiece &other) const { return page == other.page && topLeft == other.topLeft; }
+    bool operator==(const KvPlacedPiece &other) const
+    {
+        return page == other.page && topLeft == other.topLeft;
+    }
 };
 
 /**
  * The one rule by which pieces flow onto pages, used by the view, its size update and the printer.
  *
- * A piece stands below the one before, one pixel apart. When it would not end above the last pixel row of the content
- * rectangle it moves, whole, to the top of a fresh page, also when it stood alone: a piece higher than a page leaves
- * the page it was tried on without it and overflows the next one. Content rectangles are asked for page by page, in
- * order, as pages are reached; the first one at construction.
+ * A piece stands below the one before, one pixel apart. When it would not end above the last pixel row of the
+ * content rectangle it moves, whole, to the top of a fresh page, also when it stood alone: a piece higher
+ * than a page leaves the page it was tried on without it and overflows the next one. Content rectangles are
+ * asked for page by page, in order, as pages are reached; the first one at construction.
  */
 class KvPageFlow
 {

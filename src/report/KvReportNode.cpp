@@ -13,15 +13,14 @@
 
 const char KvReportNode::MimeFormat[] = "application/x-meeditorpreviewlistmodeldatalist";
 
-KvReportNode::KvReportNode(QWidget *displayParent, KvBaseEditorNodeFactory *factory, KvTemplateContext *context,
-                           KvTemplateModel *model)
+KvReportNode::KvReportNode(QWidget *displayParent, KvBaseEditorNodeFactory *factory,
+                           KvTemplateContext *context, KvTemplateModel *model)
     : m_model(model)
     , m_factory(factory)
     , m_displayParent(displayParent)
     , m_context(context)
     , m_config(factory->createConfig(context))
-{
-}
+{}
 
 KvReportNode::~KvReportNode()
 {
@@ -41,7 +40,8 @@ KvBaseDisplayWidget *KvReportNode::displayWidget()
     if (!m_displayWidget) {
         m_displayWidget = m_factory->createDisplayWidget(m_displayParent, m_config.get());
         if (m_displayWidget)
-            connect(m_displayWidget->displaySignals(), SIGNAL(destroyed()), this, SLOT(slotDisplayWidgetDestroyed()));
+            connect(m_displayWidget->displaySignals(), SIGNAL(destroyed()), this,
+                                                              SLOT(slotDisplayWidgetDestroyed()));
     }
     return m_displayWidget;
 }

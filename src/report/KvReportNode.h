@@ -21,7 +21,8 @@ class KvReportNode : public QObject
 {
     Q_OBJECT
 public:
-    /** \a displayParent (may be null) becomes the parent of display widgets. Factory, context, model are not owned. */
+    /** \a displayParent (may be null) becomes the parent of display widgets. Factory, context, model are not
+     * owned. */
     KvReportNode(QWidget *displayParent, KvBaseEditorNodeFactory *factory, KvTemplateContext *context,
                  KvTemplateModel *model = nullptr);
     ~KvReportNode() override;
@@ -37,7 +38,8 @@ public:
     /** The display widget, made on first use. */
     KvBaseDisplayWidget *displayWidget();
 
-    /** Appends {"name", "config"} to \a nodes; false (nothing appended) when the configuration fails to write itself. */
+    /** Appends {"name", "config"} to \a nodes; false (nothing appended) when the configuration fails to write
+     * itself. */
     bool toJson(QJsonArray &nodes) const;
 
     /** New drag data for moving the block, which stands at \a index; the caller owns it. */

@@ -19,7 +19,8 @@ constexpr qreal kSeparatorZ = 5;
 constexpr int kContentInset = 20; // pixels at the page's top and bottom
 constexpr int kPageNumberRight = 40;
 constexpr int kPageNumberBottom = 30;
-// The content height told to blocks is lower than the rectangle: a piece of just that height still fits with its gap.
+// The content height told to blocks is lower than the rectangle: a piece of just that height still fits with
+// its gap.
 constexpr int kContentReserve = 2;
 
 QPen separatorPen()
@@ -55,11 +56,10 @@ KvReportPage::~KvReportPage() = default;
 
 QRect KvReportPage::pageRectOf(const KvTemplateModel &model, int index, bool printMode)
 {
-    const int width = model.pageWidth();
-    const int height = model.context()->pageHeight();
+    const QSize size(model.context()->layoutWidth(), model.context()->pageHeight());
     if (printMode)
-        return QRect(0, 0, width, height);
-    return QRect(Gap, (height + Gap) * index + Gap, width, height);
+        return QRect(QPoint(0, 0), size);
+    return QRect(QPoint(Gap, (size.height() + Gap) * index + Gap), size);
 }
 
 bool KvReportPage::contains(const QPointF &point) const

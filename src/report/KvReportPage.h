@@ -11,10 +11,11 @@ class KvReportProxyWidgetItem;
 class KvTemplateModel;
 
 /**
- * One page of a report: its white sheet, header, footer and page number, and the content rectangle that they leave.
+ * One page of a report: its white sheet, header, footer and page number, and the content rectangle that they
+ * leave.
  *
- * On screen the pages stand in one column; in print mode each is at the origin of a scene of its own, without sheet and
- * separator lines.
+ * On screen the pages stand in one column; in print mode each is at the origin of a scene of its own, without
+ * sheet and separator lines.
  */
 class KvReportPage : public QGraphicsItemGroup
 {

@@ -15,6 +15,8 @@
 #include <QScopedValueRollback>
 #include <QScrollBar>
 
+#include <algorithm>
+
 namespace {
 const Qt::ConnectionType kQueuedUnique = Qt::ConnectionType(Qt::QueuedConnection | Qt::UniqueConnection);
 const Qt::ConnectionType kDirectUnique = Qt::ConnectionType(Qt::DirectConnection | Qt::UniqueConnection);
@@ -42,12 +44,17 @@ KvReportPagedView::~KvReportPagedView()
     clearScene();
 }
 
+KvTemplateModel *KvReportPagedView::model() const
+{
+    return m_model;
+}
+
 void KvReportPagedView::setModel(KvTemplateModel *model)
 {
     m_model = model;
     if (m_model) {
-        connect(m_model, SIGNAL(signalBeforeDeleteNode(KvReportNode *)), this,
-                SLOT(slotBeforeDeleteNode(KvReportNode *)));
+        connect(m_model, SIGNAL(signalBeforeDeleteNode(KvReportNode*)), this,
+                                SLOT(slotBeforeDeleteNode(KvReportNode*)));
         connect(m_model, SIGNAL(signalListChanged()), this, SLOT(slotWidgetsListChanged()));
         connect(m_model, SIGNAL(signalHeaderStateChanged(bool)), this, SLOT(slotWidgetsListChanged()));
         connect(m_model, SIGNAL(signalFooterStateChanged(bool)), this, SLOT(slotWidgetsListChanged()));
@@ -69,15 +76,30 @@ void KvReportPagedView::slotWidgetsListChanged()
     if (m_model && m_model->isLoading())
         return;
     const int scrollPosition = verticalScrollBar()->value();
-    clearScene();
-    if (!m_model)
+    if (!m_model) {
+        clearScene();
         return;
+    }
     {
         // Blocks answer to the page's content height with size changes, which the rebuild takes in anyway.
         const QScopedValueRollback<bool> guard(m_layoutRunning, true);
-        addPages();
+        replacePages();
     }
     verticalScrollBar()->setValue(scrollPosition);
+}
+
+void KvReportPagedView::replacePages()
+{
+    // The old items go last: pieces then move straight from their old frame into the new one. Every change of
+    // parent makes Qt polish the style sheets of all widgets in a piece, which takes most of the time of a
+    // rebuild.
+    QList<QGraphicsItem *> oldItems = m_scene->items();
+    const auto isChild = [](const QGraphicsItem *item) { return item->parentItem() != nullptr; };
+    oldItems.erase(std::remove_if(oldItems.begin(), oldItems.end(), isChild), oldItems.end());
+    m_pages.clear();
+    m_pieceItems.clear();
+    addPages();
+    qDeleteAll(oldItems);
 }
 
 void KvReportPagedView::addPages()
@@ -105,9 +127,11 @@ void KvReportPagedView::connectNode(KvReportNode *node)
     if (!displayWidget)
         return;
     KvBaseDisplayWidgetSignals *displaySignals = displayWidget->displaySignals();
-    connect(displaySignals, SIGNAL(signalWidgetChanged()), this, SLOT(slotUpdateSceneWithSizes()), kDirectUnique);
+    connect(displaySignals, SIGNAL(signalWidgetChanged()), this,
+                                   SLOT(slotUpdateSceneWithSizes()), kDirectUnique);
     // Queued: a block may announce new pieces from inside an event of a piece that the rebuild would delete.
-    connect(displaySignals, SIGNAL(signalSubWidgetsChanged()), this, SLOT(slotWidgetsListChanged()), kQueuedUnique);
+    connect(displaySignals, SIGNAL(signalSubWidgetsChanged()), this,
+                                   SLOT(slotWidgetsListChanged()), kQueuedUnique);
 }
 
 KvReportPage *KvReportPagedView::addPage()
@@ -117,7 +141,8 @@ KvReportPage *KvReportPagedView::addPage()
     m_scene->addItem(page);
     for (KvPageSectionWidget *section : {page->headerWidget(), page->footerWidget()}) {
         if (section)
-            connect(section->displaySignals(), SIGNAL(signalWidgetChanged()), this, SLOT(slotUpdateSceneWithSizes()));
+            connect(section->displaySignals(), SIGNAL(signalWidgetChanged()), this,
+                                                      SLOT(slotUpdateSceneWithSizes()));
     }
     return page;
 }
@@ -156,8 +181,17 @@ void KvReportPagedView::slotUpdateSceneWithSizes()
 
 void KvReportPagedView::dropPagesFrom(int count)
 {
-    while (m_pages.size() > count)
-        delete m_pages.takeLast();
+    if (m_pages.size() <= count)
+        return;
+    while (m_pages.size() > count) {
+        KvReportPage *page = m_pages.takeLast();
+        m_scene->removeItem(page);
+        m_droppedPages.emplace_back(page);
+    }
+    // Not at once: the header in which the user types may be on such a page, and this is called from its
+    // typing.
+    QMetaObject::invokeMethod(
+        this, [this]() { m_droppedPages.clear(); }, Qt::QueuedConnection);
 }
 
 void KvReportPagedView::slotBeforeDeleteNode(KvReportNode *aNode)
@@ -177,15 +211,18 @@ void KvReportPagedView::resizeEvent(QResizeEvent *event)
 void KvReportPagedView::showEvent(QShowEvent *event)
 {
     QGraphicsView::showEvent(event);
-    applyViewWidth();
+    // A print while the view was hidden has taken the blocks' widgets, and nothing told the view of it.
+    if (!applyViewWidth() && !event->spontaneous())
+        slotWidgetsListChanged();
 }
 
-void KvReportPagedView::applyViewWidth()
+bool KvReportPagedView::applyViewWidth()
 {
     // A hidden view has no say: a template that is only printed keeps the width of its file.
     const int width = viewport()->width() - 2 * KvReportPage::Gap;
     if (!m_model || !isVisible() || width <= 0 || width == m_model->pageWidth())
-        return;
+        return false;
     m_model->setPageWidth(width);
     slotWidgetsListChanged();
+    return true;
 }

@@ -3,7 +3,11 @@
 
 #include <QGraphicsView>
 #include <QList>
+#include <QPointer>
 #include <QVector>
+
+#include <memory>
+#include <vector>
 
 class KvReportNode;
 class KvReportPage;
@@ -13,7 +17,8 @@ class KvTemplateModel;
 /**
  * Shows a template as a column of pages on a dark background and flows its blocks onto them.
  *
- * A page always spans the view; blocks flow anew whenever the template, the page width or a block's size changes.
+ * A page always spans the view; blocks flow anew whenever the template, the page width or a block's size
+ * changes.
  */
 class KvReportPagedView : public QGraphicsView
 {
@@ -24,7 +29,8 @@ public:
 
     /** Set once; not owned, may be null. */
     void setModel(KvTemplateModel *model);
-    KvTemplateModel *model() const { return m_model; }
+    /** Null, too, once the model is gone. */
+    KvTemplateModel *model() const;
 
     const QVector<KvReportPage *> &pages() const { return m_pages; }
     /** Items of all pieces of blocks, in layout order. */
@@ -41,17 +47,19 @@ protected:
 
 private:
     void clearScene();
+    void replacePages();
     void addPages();
     KvReportPage *addPage();
     QRect contentRectOf(int page);
     void connectNode(KvReportNode *node);
     void dropPagesFrom(int count);
     void finishLayout();
-    void applyViewWidth();
+    bool applyViewWidth();
 
     QGraphicsScene *m_scene;
-    KvTemplateModel *m_model = nullptr;
+    QPointer<KvTemplateModel> m_model;
     QVector<KvReportPage *> m_pages;
+    std::vector<std::unique_ptr<KvReportPage>> m_droppedPages; ///< off the scene, deleted by the event loop
     QList<KvReportProxyWidgetItem *> m_pieceItems;
     bool m_layoutRunning = false;
 };

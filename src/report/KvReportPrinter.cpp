@@ -20,8 +20,7 @@ constexpr int kResolution = 600; // dots per inch
 
 KvReportPrinter::KvReportPrinter(KvTemplateModel *model)
     : m_model(model)
-{
-}
+{}
 
 KvReportPrinter::~KvReportPrinter() = default;
 
@@ -86,7 +85,8 @@ bool KvReportPrinter::render(QPdfWriter &writer)
     for (int i = 0; i < m_pages.size(); ++i) {
         if (i > 0)
             writer.newPage();
-        m_scenes[static_cast<std::size_t>(i)]->render(&painter, target, m_pages.at(i)->pageRect(), Qt::KeepAspectRatio);
+        m_scenes[static_cast<std::size_t>(i)]->render(&painter, target, m_pages.at(i)->pageRect(),
+                                                      Qt::KeepAspectRatio);
         reportProgress(i + 1);
     }
     return painter.end();

@@ -11,8 +11,7 @@
 
 KvReportProxyWidgetItem::KvReportProxyWidgetItem(QGraphicsItem *parent)
     : QGraphicsProxyWidget(parent)
-{
-}
+{}
 
 KvReportProxyWidgetItem *KvReportProxyWidgetItem::createForPiece(KvReportNode *node, int index)
 {
@@ -36,7 +35,8 @@ void KvReportProxyWidgetItem::setDisplayWidget(KvBaseDisplayWidget *displayWidge
         m_displayWidget->displaySignals()->disconnect(this);
     m_displayWidget = displayWidget;
     if (m_displayWidget)
-        connect(m_displayWidget->displaySignals(), SIGNAL(destroyed()), this, SLOT(slotDisplayWidgetDestroyed()));
+        connect(m_displayWidget->displaySignals(), SIGNAL(destroyed()), this,
+                                                          SLOT(slotDisplayWidgetDestroyed()));
 }
 
 void KvReportProxyWidgetItem::slotDisplayWidgetDestroyed()

@@ -14,8 +14,8 @@ public:
     explicit KvReportProxyWidgetItem(QGraphicsItem *parent = nullptr);
 
     /**
-     * A new item with piece \a index of a block in its white frame with the page's margins, fitted to its size; null
-     * when the block has no such piece. The caller owns the item; the piece stays the block's.
+     * A new item with piece \a index of a block in its white frame with the page's margins, fitted to its
+     * size; null when the block has no such piece. The caller owns the item; the piece stays the block's.
      */
     static KvReportProxyWidgetItem *createForPiece(KvReportNode *node, int index);
 

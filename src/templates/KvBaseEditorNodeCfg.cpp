@@ -4,5 +4,4 @@
 KvBaseEditorNodeCfg::KvBaseEditorNodeCfg(KvTemplateContext *context, QObject *parent)
     : QObject(parent)
     , m_context(context)
-{
-}
+{}

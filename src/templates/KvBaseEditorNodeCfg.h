@@ -6,7 +6,8 @@
 class KvTemplateContext;
 class QJsonObject;
 
-/** What the user set for one block, and its "config" object in template files. Lives as long as its report node. */
+/** What the user set for one block, and its "config" object in template files. Lives as long as its report
+ * node. */
 class KvBaseEditorNodeCfg : public QObject
 {
     Q_OBJECT

@@ -3,6 +3,7 @@
 
 #include "editor/KvEditorToolWidget.h"
 #include "gui/acss.h"
+#include "resources/KvReportResources.h"
 
 #include <QDataStream>
 #include <QMimeData>
@@ -12,14 +13,20 @@ const char KvBaseEditorNodeFactory::MimeFormat[] = "application/x-KvEditorToolsL
 namespace {
 constexpr int kToolIconMode = 6;
 constexpr int kToolIconExtent = 24;
+
+QIcon toolIcon(const QString &path)
+{
+    KvReportResources::ensure();
+    return acss::createIcon(kToolIconMode, path, QSize(kToolIconExtent, kToolIconExtent));
+}
 } // namespace
 
-KvBaseEditorNodeFactory::KvBaseEditorNodeFactory(const QString &name, const QString &title, const QString &iconPath)
+KvBaseEditorNodeFactory::KvBaseEditorNodeFactory(const QString &name, const QString &title,
+                                                 const QString &iconPath)
     : m_name(name)
     , m_title(title)
-    , m_icon(acss::createIcon(kToolIconMode, iconPath, QSize(kToolIconExtent, kToolIconExtent)))
-{
-}
+    , m_icon(toolIcon(iconPath))
+{}
 
 KvBaseEditorNodeFactory::~KvBaseEditorNodeFactory()
 {

@@ -19,7 +19,8 @@ class KvBaseEditorNodeFactory
 public:
     virtual ~KvBaseEditorNodeFactory();
 
-    /** A new display widget that draws the block from \a cfg, which is of this factory's making and outlives it. */
+    /** A new display widget that draws the block from \a cfg, which is of this factory's making and outlives
+     * it. */
     virtual KvBaseDisplayWidget *createDisplayWidget(QWidget *parent, KvBaseEditorNodeCfg *cfg) = 0;
     /** A new configuration with its defaults, bound to \a context. The caller owns it. */
     virtual KvBaseEditorNodeCfg *createConfig(KvTemplateContext *context) = 0;

@@ -8,7 +8,8 @@ KvBlockRegistry::~KvBlockRegistry() = default;
 KvBlockTypeList::KvBlockTypeList() = default;
 KvBlockTypeList::~KvBlockTypeList() = default;
 
-void KvBlockTypeList::registerFactory(std::unique_ptr<KvBaseEditorNodeFactory> factory, const KvBlockGroup &group)
+void KvBlockTypeList::registerFactory(std::unique_ptr<KvBaseEditorNodeFactory> factory,
+                                      const KvBlockGroup &group)
 {
     if (!factory)
         return;

@@ -9,8 +9,7 @@ const char kEnabledKey[] = "enabled";
 
 KvPageSectionsCfg::KvPageSectionsCfg(KvTemplateContext *context, QObject *parent)
     : KvTextDocumentNodeCfg(context, parent)
-{
-}
+{}
 
 bool KvPageSectionsCfg::toJson(QJsonObject &config) const
 {

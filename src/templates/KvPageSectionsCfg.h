@@ -12,8 +12,8 @@ public:
 
     bool toJson(QJsonObject &config) const override;
     /**
-     * Never fails. The section is enabled only by a JSON true, and only together with a text; without a text the
-     * section is off and keeps the text it had.
+     * Never fails. The section is enabled only by a JSON true, and only together with a text; without a text
+     * the section is off and keeps the text it had.
      */
     bool fromJson(const QJsonObject &config) override;
 

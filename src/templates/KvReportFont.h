@@ -7,10 +7,12 @@
 namespace KvReportFont {
 
 /**
- * "Segoe UI" (or what the host puts in its place) in pixels, so that lines break alike on every screen and in the PDF.
+ * "Segoe UI" (or what the host puts in its place) in pixels, so that lines break alike on every screen and in
+ * the PDF.
  *
- * Without ligatures: a PDF stores the ligature of "f" and "l" as one character, and whoever then looks for "flow" in
- * the report does not find it. Any letter spacing switches them off; this one is the smallest there is.
+ * Without ligatures: a PDF stores the ligature of "f" and "l" as one character, and whoever then looks for
+ * "flow" in the report does not find it. Any letter spacing switches them off; this one is the smallest there
+ * is.
  */
 inline QFont make(int pixelSize, QFont::Weight weight = QFont::Normal)
 {

@@ -12,8 +12,8 @@ class ZtAppSettings;
 /** One placeholder that texts of a report may hold. */
 struct KvReportKeyword
 {
-    QString label;                   ///< translated, for the list that inserts it
-    QString keyword;                 ///< as it stands in texts, "${" and "}" included
+    QString label;                  ///< translated, for the list that inserts it
+    QString keyword;                ///< as it stands in texts, "${" and "}" included
     std::function<QString()> value; ///< computes the replacement, anew at each call
 };
 
@@ -28,9 +28,9 @@ public:
     const QVector<KvReportKeyword> &keywords() const { return m_keywords; }
 
     /**
-     * Replaces every keyword in \a text, case-sensitively, keyword by keyword over the already replaced text: a program
-     * name that holds "${PROGRAM_VENDOR}" is expanded too, not the other way round. Values are not escaped. Anything
-     * else of the form ${...} stays.
+     * Replaces every keyword in \a text, case-sensitively, keyword by keyword over the already replaced text:
+     * a program name that holds "${PROGRAM_VENDOR}" is expanded too, not the other way round. Values are not
+     * escaped. Anything else of the form ${...} stays.
      */
     void expand(QString &text) const;
 

@@ -9,8 +9,7 @@ const char kThemeKey[] = "theme";
 
 KvStatisticsThemedNodeCfg::KvStatisticsThemedNodeCfg(KvTemplateContext *context, QObject *parent)
     : KvBaseEditorNodeCfg(context, parent)
-{
-}
+{}
 
 bool KvStatisticsThemedNodeCfg::toJson(QJsonObject &config) const
 {

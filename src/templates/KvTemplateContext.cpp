@@ -12,8 +12,9 @@ namespace {
 const char kPageWidthKey[] = "pageWidth";
 const char kMarginWidthKey[] = "marginWidth";
 
-// The largest widget that Qt can make; a page from a damaged file is not larger either.
-constexpr int kLargestExtent = 16777215;
+// No window system makes larger windows, and to Qt the pieces of a page are such; a damaged file may ask for
+// any width.
+constexpr int kLargestExtent = 32767;
 constexpr double kPageProportion = 1.4142;
 
 } // namespace
@@ -21,8 +22,7 @@ constexpr double kPageProportion = 1.4142;
 KvTemplateContext::KvTemplateContext(KvReportKernelData *kernelData, QObject *parent)
     : QObject(parent)
     , m_kernelData(kernelData)
-{
-}
+{}
 
 bool KvTemplateContext::toJson(QJsonObject &config) const
 {
@@ -74,10 +74,15 @@ void KvTemplateContext::setContentHeight(int height)
     emit signalContentHeightChanged();
 }
 
+int KvTemplateContext::layoutWidth() const
+{
+    return std::clamp(m_pageWidth, 0, kLargestExtent);
+}
+
 int KvTemplateContext::marginPixels() const
 {
     // In single precision: 600 px x 0.12 is 72, which double arithmetic on the same fraction truncates to 71.
-    const float margin = static_cast<float>(m_pageWidth) * m_marginWidth;
+    const float margin = static_cast<float>(layoutWidth()) * m_marginWidth;
     if (!(margin >= 1.0f))
         return 0;
     return margin < static_cast<float>(kLargestExtent) ? static_cast<int>(margin) : kLargestExtent;
@@ -85,12 +90,10 @@ int KvTemplateContext::marginPixels() const
 
 int KvTemplateContext::usableWidth() const
 {
-    const qint64 width = static_cast<qint64>(m_pageWidth) - 2 * static_cast<qint64>(marginPixels());
-    return static_cast<int>(std::clamp<qint64>(width, 0, kLargestExtent));
+    return std::max(0, layoutWidth() - 2 * marginPixels());
 }
 
 int KvTemplateContext::pageHeight() const
 {
-    const double height = m_pageWidth * kPageProportion;
-    return static_cast<int>(std::clamp<double>(height, 0.0, kLargestExtent));
+    return static_cast<int>(layoutWidth() * kPageProportion);
 }

@@ -12,8 +12,8 @@ class QJsonObject;
 /**
  * What all blocks of one template share: page geometry, keywords and the switch of live data.
  *
- * Widths and heights are device-independent pixels. The margins of every page come from here, computed once for view,
- * printer and blocks alike.
+ * Widths and heights are device-independent pixels. The margins of every page come from here, computed once
+ * for view, printer and blocks alike.
  */
 class KvTemplateContext : public QObject
 {
@@ -38,8 +38,8 @@ public:
     bool isLiveUpdates() const { return m_liveUpdates; }
 
     /**
-     * True while the template is being printed. What is printed is painted once and never touched by the user, so
-     * blocks may make their pieces with less than the screen needs.
+     * True while the template is being printed. What is printed is painted once and never touched by the
+     * user, so blocks may make their pieces with less than the screen needs.
      */
     bool isPrinting() const { return m_printing; }
     void setPrinting(bool printing) { m_printing = printing; }
@@ -55,6 +55,9 @@ public:
     float marginWidth() const { return m_marginWidth; }
     void setMarginWidth(float fraction) { m_marginWidth = fraction; }
 
+    /** The page width as pages are laid out: 0 at least and no wider than a window can be, whatever a file
+     * said. */
+    int layoutWidth() const;
     /** Margin at the left and at the right of a page, 0 at least, whatever a file said. */
     int marginPixels() const;
     /** Width between the margins, 0 at least. */

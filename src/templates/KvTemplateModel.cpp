@@ -26,7 +26,8 @@ const char kPageNumberingKey[] = "pageNumbering";
 const char kNodesKey[] = "nodes";
 const char kNameKey[] = "name";
 
-// No template of pictures and text comes near this; without a limit a wrong path such as a device would never end.
+// No template of pictures and text comes near this; without a limit a wrong path such as a device would never
+// end.
 constexpr qint64 kLargestFile = 256LL * 1024 * 1024;
 
 std::unique_ptr<KvPageSectionsCfg> makeSection(KvTemplateContext *context)
@@ -128,7 +129,8 @@ void KvTemplateModel::readSections(const QJsonObject &root, bool isLast)
 
 bool KvTemplateModel::readNodes(const QJsonArray &elements)
 {
-    // Made before the old blocks go: the last announcement has to be known as such, also when a block is refused.
+    // Made before the old blocks go: the last announcement has to be known as such, also when a block is
+    // refused.
     NodeList nodes;
     const bool isRead = makeNodes(elements, nodes);
     m_loading = !nodes.empty();
@@ -145,7 +147,8 @@ bool KvTemplateModel::makeNodes(const QJsonArray &elements, NodeList &nodes)
     for (const QJsonValue &value : elements) {
         const QJsonObject element = value.toObject();
         const QJsonValue name = element.value(QLatin1String(kNameKey));
-        KvBaseEditorNodeFactory *factory = name.isString() && m_factories ? m_factories->find(name.toString()) : nullptr;
+        KvBaseEditorNodeFactory *factory =
+            name.isString() && m_factories ? m_factories->find(name.toString()) : nullptr;
         if (!factory)
             continue;
         const QJsonValue config = element.value(QLatin1String(kConfigKey));
@@ -268,7 +271,8 @@ void KvTemplateModel::removeNode(KvReportNode *node)
 
 void KvTemplateModel::clearNodes()
 {
-    // Off the list first: whoever looks at the list while a block is announced and deleted finds no dead ones.
+    // Off the list first: whoever looks at the list while a block is announced and deleted finds no dead
+    // ones.
     const QVector<KvReportNode *> nodes = std::exchange(m_nodes, {});
     for (KvReportNode *node : nodes) {
         emit signalBeforeDeleteNode(node);

@@ -25,8 +25,8 @@ class QJsonObject;
 class QWidget;
 
 /**
- * A report template in memory: an ordered list of blocks, three page sections and the page context. Reads and writes
- * .rtp files and tells its views of every change.
+ * A report template in memory: an ordered list of blocks, three page sections and the page context. Reads and
+ * writes .rtp files and tells its views of every change.
  */
 class KvTemplateModel : public QObject
 {
@@ -42,9 +42,9 @@ public:
     void setUserMessages(KvUserMessages *messages) { m_messages = messages; }
 
     /**
-     * Reads a template file. False when the file cannot be read or is no template (a message says so, but for a
-     * document that is no object), and when a block is refused: the blocks before it are then in the model, while
-     * path and modified state stay as they were.
+     * Reads a template file. False when the file cannot be read or is no template (a message says so, but for
+     * a document that is no object), and when a block is refused: the blocks before it are then in the model,
+     * while path and modified state stay as they were.
      */
     bool load(const QString &path);
     /** Writes a template file, replacing what is there. False when it could not be created or written. */
@@ -54,11 +54,12 @@ public:
     /** Prints the template to a PDF file; 1 when it was written, 0 when not. \a progress may be null. */
     int print(const QString &target, KvPrintProgress *progress = nullptr);
 
-    void appendNode(KvReportNode *node);                 ///< takes the node over
-    void insertNode(int index, KvReportNode *node);      ///< takes over; -1 or beyond the end appends
+    void appendNode(KvReportNode *node);            ///< takes the node over
+    void insertNode(int index, KvReportNode *node); ///< takes over; -1 or beyond the end appends
     /** A new block of a type, appended for -1 or an index beyond the end; null for an unknown type. */
     KvReportNode *createNode(const QString &typeName, int index);
-    /** Moves a block, the others keep their order; -1 is the last place. Emits nothing and does not mark modified. */
+    /** Moves a block, the others keep their order; -1 is the last place. Emits nothing and does not mark
+     * modified. */
     void moveNode(int from, int to);
     void removeNode(KvReportNode *node);
     void clearNodes();
@@ -93,8 +94,8 @@ public:
     QString filePath() const { return m_filePath; }
     bool isModified() const { return m_modified; }
     /**
-     * True while a file is read, until the last change that it causes is announced: views that rebuild themselves on
-     * each announcement wait for that one, or a file of n blocks costs n rebuilds.
+     * True while a file is read, until the last change that it causes is announced: views that rebuild
+     * themselves on each announcement wait for that one, or a file of n blocks costs n rebuilds.
      */
     bool isLoading() const { return m_loading; }
 

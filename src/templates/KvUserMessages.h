@@ -3,7 +3,8 @@
 
 #include <QString>
 
-/** How the user is told of a failure. Programs without a display install another one in the template model. */
+/** How the user is told of a failure. Programs without a display install another one in the template model.
+ */
 class KvUserMessages
 {
 public:

@@ -18,7 +18,8 @@ KvAlignmentOptionsRow::KvAlignmentOptionsRow(QWidget *parent)
     auto *row = new QHBoxLayout(this);
     row->setContentsMargins(0, 0, 0, 0);
     row->setSpacing(kSpacing);
-    m_leftButton = addButton(QStringLiteral("Icons/IconAlignLeft.svg"), tr("Align left"), SIGNAL(signalLeftClicked()));
+    m_leftButton =
+        addButton(QStringLiteral("Icons/IconAlignLeft.svg"), tr("Align left"), SIGNAL(signalLeftClicked()));
     m_centerButton = addButton(QStringLiteral("Icons/IconAlignCenter.svg"), tr("Align center"),
                                SIGNAL(signalCenterClicked()));
     m_rightButton = addButton(QStringLiteral("Icons/IconAlignRight.svg"), tr("Align right"),
@@ -26,7 +27,8 @@ KvAlignmentOptionsRow::KvAlignmentOptionsRow(QWidget *parent)
     row->addStretch(1);
 }
 
-QPushButton *KvAlignmentOptionsRow::addButton(const QString &iconPath, const QString &text, const char *clickedSignal)
+QPushButton *KvAlignmentOptionsRow::addButton(const QString &iconPath, const QString &text,
+                                              const char *clickedSignal)
 {
     auto *button = new QPushButton(this);
     button->setCheckable(true);

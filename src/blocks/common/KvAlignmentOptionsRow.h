@@ -12,7 +12,8 @@ class KvAlignmentOptionsRow : public QWidget
 public:
     explicit KvAlignmentOptionsRow(QWidget *parent = nullptr);
 
-    /** Checks the button that stands for \a alignment; the centre one whenever the horizontal-centre bit is set. */
+    /** Checks the button that stands for \a alignment; the centre one whenever the horizontal-centre bit is
+     * set. */
     void setAlignment(Qt::Alignment alignment);
 
 signals:

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "blocks/common/KvBaseOptionsWidget.h"
 
+#include "resources/KvReportResources.h"
+
 #include <QLabel>
 #include <QVBoxLayout>
 
@@ -12,6 +14,7 @@ KvBaseOptionsWidget::KvBaseOptionsWidget(const QString &heading, QWidget *parent
     : QFrame(parent)
     , m_rows(new QVBoxLayout(this))
 {
+    KvReportResources::ensure();
     m_rows->setContentsMargins(0, 0, 0, 0);
     m_rows->setSpacing(kRowSpacing);
     m_rows->setAlignment(Qt::AlignTop);

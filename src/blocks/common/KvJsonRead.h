@@ -4,12 +4,14 @@
 #include <QJsonObject>
 #include <QString>
 
-/** Reads members of a block's "config" object; a member that is missing or of another type keeps the current value. */
+/** Reads members of a block's "config" object; a member that is missing or of another type keeps the current
+ * value. */
 namespace KvJsonRead {
 
 inline int readInt(const QJsonObject &object, const QString &key, int current)
 {
-    // The current value as default: QJsonValue answers with it for another type and for numbers that are not whole.
+    // The current value as default: QJsonValue answers with it for another type and for numbers that are not
+    // whole.
     return object.value(key).toInt(current);
 }
 

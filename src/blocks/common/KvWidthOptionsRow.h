@@ -16,7 +16,8 @@ public:
     void setWidthPercent(int percent); ///< 1..100; emits nothing
 
 signals:
-    void signalWidthChanged(int aWidth); ///< the user chose another width, in percent of the width between the margins
+    void signalWidthChanged(
+        int aWidth); ///< the user chose another width, in percent of the width between the margins
 
 private:
     QSpinBox *m_spinBox;

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "blocks/measurementstable/KvMeasurementsOrder.h"
 
-
 #include <algorithm>
 #include <cmath>
 #include <numeric>
@@ -41,7 +40,8 @@ ValueKey keyOf(const QVariant &value)
     return key;
 }
 
-template <typename Key> void sortByKeys(QVector<int> &order, const QVector<Key> &keys, bool ascending)
+template <typename Key>
+void sortByKeys(QVector<int> &order, const QVector<Key> &keys, bool ascending)
 {
     if (ascending)
         std::sort(order.begin(), order.end(), [&keys](int a, int b) { return keys.at(a) < keys.at(b); });

@@ -10,9 +10,9 @@
 namespace KvMeasurementsOrder {
 
 /**
- * Sorts by one of the four columns: the texts by UTF-16 units, the value by its number. Values that are no numbers
- * come after all numbers, NaN before texts. Any other column name keeps the order of the records. Not stable: rows
- * that compare equal come in no guaranteed order.
+ * Sorts by one of the four columns: the texts by UTF-16 units, the value by its number. Values that are no
+ * numbers come after all numbers, NaN before texts. Any other column name keeps the order of the records. Not
+ * stable: rows that compare equal come in no guaranteed order.
  */
 QVector<int> sorted(const QVector<KvMeasuredValue> &records, const QString &column, bool ascending);
 

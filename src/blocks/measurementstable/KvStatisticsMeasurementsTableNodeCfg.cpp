@@ -29,7 +29,8 @@ QStringList makeColumnNames()
 
 } // namespace
 
-KvStatisticsMeasurementsTableNodeCfg::KvStatisticsMeasurementsTableNodeCfg(KvTemplateContext *context, QObject *parent)
+KvStatisticsMeasurementsTableNodeCfg::KvStatisticsMeasurementsTableNodeCfg(KvTemplateContext *context,
+                                                                           QObject *parent)
     : KvStatisticsThemedNodeCfg(context, parent)
 {
     m_options.columns = QSet<QString>(columnNames().begin(), columnNames().end());
@@ -37,8 +38,8 @@ KvStatisticsMeasurementsTableNodeCfg::KvStatisticsMeasurementsTableNodeCfg(KvTem
 
 bool KvStatisticsMeasurementsTableNodeCfg::Options::operator==(const Options &other) const
 {
-    return alignment == other.alignment && widthPercent == other.widthPercent && columns == other.columns
-        && orderColumn == other.orderColumn && orderAscending == other.orderAscending;
+    return alignment == other.alignment && widthPercent == other.widthPercent && columns == other.columns &&
+           orderColumn == other.orderColumn && orderAscending == other.orderAscending;
 }
 
 const QStringList &KvStatisticsMeasurementsTableNodeCfg::columnNames()
@@ -68,14 +69,17 @@ bool KvStatisticsMeasurementsTableNodeCfg::fromJson(const QJsonObject &config)
 {
     if (!KvStatisticsThemedNodeCfg::fromJson(config))
         return false;
-    const int alignment = KvJsonRead::readInt(config, QLatin1String(kAlignmentKey), static_cast<int>(m_options.alignment));
+    const int alignment =
+        KvJsonRead::readInt(config, QLatin1String(kAlignmentKey), static_cast<int>(m_options.alignment));
     m_options.alignment = Qt::Alignment(alignment);
     m_options.widthPercent = KvJsonRead::readInt(config, QLatin1String(kWidthKey), m_options.widthPercent);
     const QJsonValue columns = config.value(QLatin1String(kColumnsKey));
     if (columns.isString())
         m_options.columns = KvColumnsText::split(columns.toString());
-    m_options.orderColumn = KvJsonRead::readString(config, QLatin1String(kOrderColumnKey), m_options.orderColumn);
-    m_options.orderAscending = KvJsonRead::readBool(config, QLatin1String(kOrderAscendingKey), m_options.orderAscending);
+    m_options.orderColumn =
+        KvJsonRead::readString(config, QLatin1String(kOrderColumnKey), m_options.orderColumn);
+    m_options.orderAscending =
+        KvJsonRead::readBool(config, QLatin1String(kOrderAscendingKey), m_options.orderAscending);
     return true;
 }
 

@@ -15,9 +15,9 @@ public:
     struct Options
     {
         Qt::Alignment alignment = Qt::AlignHCenter | Qt::AlignVCenter;
-        int widthPercent = 75;     ///< of the width between the page's margins
-        QSet<QString> columns;     ///< may hold names that no column has; they show nothing and are kept
-        QString orderColumn;       ///< column that the rows are sorted by; empty keeps the order of measurement
+        int widthPercent = 75; ///< of the width between the page's margins
+        QSet<QString> columns; ///< may hold names that no column has; they show nothing and are kept
+        QString orderColumn;   ///< column that the rows are sorted by; empty keeps the order of measurement
         bool orderAscending = true;
 
         bool operator==(const Options &other) const;

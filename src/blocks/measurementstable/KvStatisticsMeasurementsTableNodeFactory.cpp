@@ -10,8 +10,7 @@ KvStatisticsMeasurementsTableNodeFactory::KvStatisticsMeasurementsTableNodeFacto
     : KvBaseEditorNodeFactory(QStringLiteral("Measurement table"),
                               QCoreApplication::translate("KvBaseEditorNodeFactory", "Measurements Table"),
                               QStringLiteral("Icons/ToolIconTable.svg"))
-{
-}
+{}
 
 KvBaseDisplayWidget *KvStatisticsMeasurementsTableNodeFactory::createDisplayWidget(QWidget *parent,
                                                                                    KvBaseEditorNodeCfg *cfg)

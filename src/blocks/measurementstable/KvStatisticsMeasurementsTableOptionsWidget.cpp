@@ -63,7 +63,7 @@ void KvStatisticsMeasurementsTableOptionsWidget::addColumnsRow()
     m_columnsRow = new KvColumnsOptionsRow(names, labels, this);
     addRow(m_columnsRow);
     connect(m_columnsRow, SIGNAL(signalColumnStateChanged(QString, int)), this,
-            SLOT(slotColumnStateChanged(QString, int)));
+                                 SLOT(slotColumnStateChanged(QString, int)));
 }
 
 void KvStatisticsMeasurementsTableOptionsWidget::addOrderRow()
@@ -107,8 +107,8 @@ void KvStatisticsMeasurementsTableOptionsWidget::setFromConfig(const KvBaseEdito
     const QSignalBlocker orderBlocker(m_orderBox);
     m_orderBox->setCurrentIndex(0);
     for (int i = 1; i < m_orderBox->count(); ++i) {
-        if (m_orderBox->itemData(i, kColumnRole).toString() == tableCfg->orderColumn()
-            && m_orderBox->itemData(i, kAscendingRole).toBool() == tableCfg->isOrderAscending())
+        if (m_orderBox->itemData(i, kColumnRole).toString() == tableCfg->orderColumn() &&
+            m_orderBox->itemData(i, kAscendingRole).toBool() == tableCfg->isOrderAscending())
             m_orderBox->setCurrentIndex(i);
     }
 }

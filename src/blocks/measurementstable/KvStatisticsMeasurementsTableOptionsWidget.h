@@ -15,8 +15,8 @@ class KvWidthOptionsRow;
 class QComboBox;
 
 /**
- * Options panel of the measurements table: width, alignment, theme, columns, order of the rows. Every change is written
- * to the configuration and then announced.
+ * Options panel of the measurements table: width, alignment, theme, columns, order of the rows. Every change
+ * is written to the configuration and then announced.
  */
 class KvStatisticsMeasurementsTableOptionsWidget : public KvBaseOptionsWidget
 {

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "blocks/measurementstable/KvStatisticsMeasurementsTableWidget.h"
 
-#include "blocks/table/KvTableFonts.h"
 #include "blocks/measurementstable/KvMeasurementsOrder.h"
 #include "blocks/measurementstable/KvStatisticsMeasurementsTableOptionsWidget.h"
+#include "blocks/table/KvTableFonts.h"
 #include "data/KvReportKernelData.h"
 #include "data/KvStatisticsEngine.h"
 #include "templates/KvTemplateContext.h"
@@ -11,8 +11,9 @@
 namespace {
 
 // What each column shows, in the fixed order of the column names.
-QString KvMeasuredValue::*const kColumnMembers[] = {&KvMeasuredValue::objectName, &KvMeasuredValue::objectTypeName,
-                                                   &KvMeasuredValue::valueName, &KvMeasuredValue::valueText};
+QString KvMeasuredValue::*const kColumnMembers[] = {&KvMeasuredValue::objectName,
+                                                    &KvMeasuredValue::objectTypeName,
+                                                    &KvMeasuredValue::valueName, &KvMeasuredValue::valueText};
 
 QString arrowText(bool ascending)
 {
@@ -21,8 +22,8 @@ QString arrowText(bool ascending)
 
 } // namespace
 
-KvStatisticsMeasurementsTableWidget::KvStatisticsMeasurementsTableWidget(QWidget *displayParent,
-                                                                         KvStatisticsMeasurementsTableNodeCfg *cfg)
+KvStatisticsMeasurementsTableWidget::KvStatisticsMeasurementsTableWidget(
+    QWidget *displayParent, KvStatisticsMeasurementsTableNodeCfg *cfg)
     : KvStatisticsBaseTableWidget(displayParent, cfg)
     , m_cfg(cfg)
     , m_announcedOptions(cfg->options())
@@ -45,11 +46,14 @@ QWidget *KvStatisticsMeasurementsTableWidget::createOptionsWidget(QWidget *paren
 {
     auto *options = new KvStatisticsMeasurementsTableOptionsWidget(m_cfg, parent, withPlacement);
     connect(options, SIGNAL(signalWidthChanged(int)), this, SLOT(slotWidthChanged(int)));
-    connect(options, SIGNAL(signalAlignmentChanged(Qt::Alignment)), this, SLOT(slotAlignmentChanged(Qt::Alignment)));
+    connect(options, SIGNAL(signalAlignmentChanged(Qt::Alignment)), this,
+                            SLOT(slotAlignmentChanged(Qt::Alignment)));
     connect(options, SIGNAL(signalThemeChanged(kvCharts::KvChartThemes::ThemeType)), this,
-            SLOT(slotThemeChanged(kvCharts::KvChartThemes::ThemeType)));
-    connect(options, SIGNAL(signalColumnsChanged(QSet<QString>)), this, SLOT(slotColumnsChanged(QSet<QString>)));
-    connect(options, SIGNAL(signalOrderByChanged(QString, bool)), this, SLOT(slotOrderBySelected(QString, bool)));
+                            SLOT(slotThemeChanged(kvCharts::KvChartThemes::ThemeType)));
+    connect(options, SIGNAL(signalColumnsChanged(QSet<QString>)), this,
+                            SLOT(slotColumnsChanged(QSet<QString>)));
+    connect(options, SIGNAL(signalOrderByChanged(QString, bool)), this,
+                            SLOT(slotOrderBySelected(QString, bool)));
     return options;
 }
 
@@ -104,9 +108,9 @@ void KvStatisticsMeasurementsTableWidget::fillBody(const QVector<int> &columns)
         return;
     const QVector<KvMeasuredValue> records = kernelData->measuredValues();
     const bool isSorted = KvStatisticsMeasurementsTableNodeCfg::columnNames().contains(m_cfg->orderColumn());
-    const QVector<int> order = isSorted
-        ? KvMeasurementsOrder::sorted(records, m_cfg->orderColumn(), m_cfg->isOrderAscending())
-        : QVector<int>();
+    const QVector<int> order =
+        isSorted ? KvMeasurementsOrder::sorted(records, m_cfg->orderColumn(), m_cfg->isOrderAscending())
+                 : QVector<int>();
     reserve(records.size(), columns.size());
     for (int row = 0; row < records.size(); ++row) {
         const KvMeasuredValue &record = records.at(isSorted ? order.at(row) : row);

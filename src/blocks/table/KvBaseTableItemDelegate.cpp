@@ -6,8 +6,8 @@
 #include "blocks/table/KvTextFit.h"
 #include "charts/KvChartThemes.h"
 
-#include <QHelpEvent>
 #include <QAbstractItemView>
+#include <QHelpEvent>
 #include <QPainter>
 #include <QTextDocument>
 #include <QToolTip>
@@ -40,8 +40,7 @@ QRect KvBaseTableItemDelegate::Geometry::cellRect(int row, int column, int colum
 KvBaseTableItemDelegate::KvBaseTableItemDelegate(const KvChartThemes *themes, QObject *parent)
     : QStyledItemDelegate(parent)
     , m_themes(themes)
-{
-}
+{}
 
 KvBaseTableItemDelegate::~KvBaseTableItemDelegate() = default;
 
@@ -104,7 +103,8 @@ void KvBaseTableItemDelegate::paintRows(QPainter *painter, const KvStatisticsBas
     paintTexts(painter, model, geometry, first, last);
 }
 
-void KvBaseTableItemDelegate::paintGrid(QPainter *painter, const Geometry &geometry, int first, int last) const
+void KvBaseTableItemDelegate::paintGrid(QPainter *painter, const Geometry &geometry, int first,
+                                        int last) const
 {
     const int left = geometry.columnEdges.first();
     const int right = geometry.columnEdges.last();
@@ -164,8 +164,8 @@ bool KvBaseTableItemDelegate::isShortened(const QString &text, const QFont &font
     return textFit(font).fitted(text, cellWidth - 2 * kTextPadding) != text;
 }
 
-bool KvBaseTableItemDelegate::helpEvent(QHelpEvent *event, QAbstractItemView *view, const QStyleOptionViewItem &option,
-                                        const QModelIndex &index)
+bool KvBaseTableItemDelegate::helpEvent(QHelpEvent *event, QAbstractItemView *view,
+                                        const QStyleOptionViewItem &option, const QModelIndex &index)
 {
     if (event->type() != QEvent::ToolTip || !index.isValid())
         return QStyledItemDelegate::helpEvent(event, view, option, index);
@@ -173,7 +173,8 @@ bool KvBaseTableItemDelegate::helpEvent(QHelpEvent *event, QAbstractItemView *vi
     const QFont font = qvariant_cast<QFont>(index.data(Qt::FontRole));
     if (isShortened(text, font, option.rect.width())) {
         // Names may look like markup; the tip shows them as they are.
-        const QString tip = Qt::mightBeRichText(text) ? Qt::convertFromPlainText(text, Qt::WhiteSpaceNormal) : text;
+        const QString tip =
+            Qt::mightBeRichText(text) ? Qt::convertFromPlainText(text, Qt::WhiteSpaceNormal) : text;
         QToolTip::showText(event->globalPos(), tip, view);
     } else {
         QToolTip::hideText();

@@ -15,8 +15,8 @@ class KvStatisticsBaseTableWidgetModel;
 class KvTextFit;
 
 /**
- * Paints the cells of a table piece: flat background, one line of text, left and vertically centred, shortened where it
- * is too wide. Cells without colours of their own take the theme's.
+ * Paints the cells of a table piece: flat background, one line of text, left and vertically centred,
+ * shortened where it is too wide. Cells without colours of their own take the theme's.
  */
 class KvBaseTableItemDelegate : public QStyledItemDelegate
 {
@@ -26,9 +26,11 @@ public:
     explicit KvBaseTableItemDelegate(const kvCharts::KvChartThemes *themes, QObject *parent = nullptr);
     ~KvBaseTableItemDelegate() override;
 
-    void paint(QPainter *painter, const QStyleOptionViewItem &option, const QModelIndex &index) const override;
+    void paint(QPainter *painter, const QStyleOptionViewItem &option,
+               const QModelIndex &index) const override;
 
-    /** Where cells lie: left edges of the columns (and the right end), top of the first row, height of every row. */
+    /** Where cells lie: left edges of the columns (and the right end), top of the first row, height of every
+     * row. */
     struct Geometry
     {
         QVector<int> columnEdges;
@@ -43,12 +45,12 @@ public:
     static QVector<int> sharedEdges(int left, int width, int columns);
 
     /**
-     * Paints rows first..last of a model in layers: backgrounds, grid lines, texts. One change of colour and font per
-     * layer instead of several per cell keeps PDF files small and printing quick. A header cell that spans columns
-     * covers those at its right; spans of the body do not count.
+     * Paints rows first..last of a model in layers: backgrounds, grid lines, texts. One change of colour and
+     * font per layer instead of several per cell keeps PDF files small and printing quick. A header cell that
+     * spans columns covers those at its right; spans of the body do not count.
      */
-    void paintRows(QPainter *painter, const KvStatisticsBaseTableWidgetModel &model, const Geometry &geometry, int first,
-                   int last) const;
+    void paintRows(QPainter *painter, const KvStatisticsBaseTableWidgetModel &model, const Geometry &geometry,
+                   int first, int last) const;
 
     /** Whether \a text is shortened in a cell of \a cellWidth pixels. */
     bool isShortened(const QString &text, const QFont &font, int cellWidth) const;
@@ -60,8 +62,8 @@ protected:
 private:
     const KvTextFit &textFit(const QFont &font) const;
     void paintGrid(QPainter *painter, const Geometry &geometry, int first, int last) const;
-    void paintTexts(QPainter *painter, const KvStatisticsBaseTableWidgetModel &model, const Geometry &geometry,
-                    int first, int last) const;
+    void paintTexts(QPainter *painter, const KvStatisticsBaseTableWidgetModel &model,
+                    const Geometry &geometry, int first, int last) const;
     void paintText(QPainter *painter, const KvTextFit &fit, const QRect &cell, const QString &text) const;
 
     const kvCharts::KvChartThemes *m_themes;

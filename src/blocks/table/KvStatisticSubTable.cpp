@@ -51,7 +51,8 @@ QTableView *KvStatisticSubTable::tableView() const
     return m_view;
 }
 
-void KvStatisticSubTable::fill(const std::shared_ptr<const KvTableContents> &contents, int firstBodyRow, int bodyRows)
+void KvStatisticSubTable::fill(const std::shared_ptr<const KvTableContents> &contents, int firstBodyRow,
+                               int bodyRows)
 {
     setRowHeight(KvTablePageSplit::RowHeight);
     if (m_view)
@@ -104,9 +105,10 @@ void KvStatisticSubTable::applyStyle()
     if (!m_view)
         return;
     // "{{Font}}" is for the host's style engine to replace; Qt drops the rule while it stands.
-    const QString sheet = QStringLiteral("QTableView { border: none; background: transparent; gridline-color: %1; "
-                                         "font: 12px {{Font}}; }")
-                              .arg(m_cfg->themes()->color(kvCharts::KvChartThemes::TableGridLine).name());
+    const QString sheet =
+        QStringLiteral("QTableView { border: none; background: transparent; gridline-color: %1; "
+                       "font: 12px {{Font}}; }")
+            .arg(m_cfg->themes()->color(kvCharts::KvChartThemes::TableGridLine).name());
     if (m_view->styleSheet() == sheet)
         return;
     m_view->setStyleSheet(sheet);
@@ -168,13 +170,15 @@ void KvStatisticSubTable::paintEvent(QPaintEvent *event)
         return;
     Q_UNUSED(event)
     QPainter painter(this);
-    // On a PDF the clip of the widget painted before this one (a header's text, say) would go on hiding this one.
+    // On a PDF the clip of the widget painted before this one (a header's text, say) would go on hiding this
+    // one.
     painter.setClipRect(rect());
     painter.fillRect(rect(), Qt::white);
     const QRect table = tableRect();
     KvBaseTableItemDelegate::Geometry geometry;
     geometry.top = table.top();
     geometry.rowHeight = m_rowHeight;
-    geometry.columnEdges = KvBaseTableItemDelegate::sharedEdges(table.left(), table.width(), m_model->columnCount());
+    geometry.columnEdges =
+        KvBaseTableItemDelegate::sharedEdges(table.left(), table.width(), m_model->columnCount());
     m_delegate->paintRows(&painter, *m_model, geometry, 0, m_model->rowCount() - 1);
 }

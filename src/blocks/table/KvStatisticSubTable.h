@@ -16,17 +16,19 @@ class QTableView;
 struct KvTableContents;
 
 /**
- * One page piece of a table block. As wide as a page's content; the table in it takes its share of that width.
+ * One page piece of a table block. As wide as a page's content; the table in it takes its share of that
+ * width.
  *
- * On screen the table is a QTableView. A piece that is made only to be printed has none: it paints the same rows with
- * the same delegate itself, since setting up hundreds of views costs more than all the drawing.
+ * On screen the table is a QTableView. A piece that is made only to be printed has none: it paints the same
+ * rows with the same delegate itself, since setting up hundreds of views costs more than all the drawing.
  */
 class KvStatisticSubTable : public QWidget
 {
     Q_OBJECT
 public:
     /** \a cfg and \a delegate are not owned and outlive the piece. The piece has no view yet. */
-    KvStatisticSubTable(KvStatisticsThemedNodeCfg *cfg, KvBaseTableItemDelegate *delegate, QWidget *parent = nullptr);
+    KvStatisticSubTable(KvStatisticsThemedNodeCfg *cfg, KvBaseTableItemDelegate *delegate,
+                        QWidget *parent = nullptr);
     ~KvStatisticSubTable() override;
 
     /** Makes the view for the screen, once. */
@@ -48,8 +50,8 @@ public:
     void applyStyle();
 
     /**
-     * Fits the piece to a page: \a pageWidth is the width between the margins, \a tableWidth that of the table,
-     * \a alignment its place (left, centre, right). The height follows from the rows.
+     * Fits the piece to a page: \a pageWidth is the width between the margins, \a tableWidth that of the
+     * table, \a alignment its place (left, centre, right). The height follows from the rows.
      */
     void setPlacement(int pageWidth, int tableWidth, Qt::Alignment alignment);
     /** Height of the piece: its rows and a little room above and below, in pixels. */

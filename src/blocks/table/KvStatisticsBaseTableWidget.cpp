@@ -22,14 +22,14 @@ const QColor &warningColor()
 
 } // namespace
 
-KvStatisticsBaseTableWidget::KvStatisticsBaseTableWidget(QWidget *displayParent, KvStatisticsThemedNodeCfg *cfg)
+KvStatisticsBaseTableWidget::KvStatisticsBaseTableWidget(QWidget *displayParent,
+                                                         KvStatisticsThemedNodeCfg *cfg)
     : m_engine(KvStatisticsEngine::instance())
     , m_cfg(cfg)
     , m_displayParent(displayParent)
     , m_delegate(std::make_unique<KvBaseTableItemDelegate>(cfg->themes()))
     , m_contents(std::make_shared<KvTableContents>())
-{
-}
+{}
 
 KvStatisticsBaseTableWidget::~KvStatisticsBaseTableWidget()
 {
@@ -72,7 +72,8 @@ void KvStatisticsBaseTableWidget::setHeaderCell(int row, int column, const QStri
     m_contents->header.setCell(row, column, text, QColor(), columnSpan);
 }
 
-void KvStatisticsBaseTableWidget::setCell(int row, int column, const QString &text, bool flagged, int columnSpan)
+void KvStatisticsBaseTableWidget::setCell(int row, int column, const QString &text, bool flagged,
+                                          int columnSpan)
 {
     m_contents->body.setCell(row, column, text, flagged ? warningColor() : QColor(), columnSpan);
 }
@@ -101,8 +102,9 @@ KvStatisticSubTable *KvStatisticsBaseTableWidget::addSubTable()
 
 void KvStatisticsBaseTableWidget::slotSubTableDestroyed(QObject *aSubTable)
 {
-    // Only the address is compared: the object is no sub-table any more.
-    m_subTables.removeAll(static_cast<KvStatisticSubTable *>(aSubTable));
+    // Compared as objects: what is being destroyed is no sub-table any more, and no cast may say so.
+    const auto isDestroyed = [aSubTable](const QObject *subTable) { return subTable == aSubTable; };
+    m_subTables.erase(std::remove_if(m_subTables.begin(), m_subTables.end(), isDestroyed), m_subTables.end());
 }
 
 void KvStatisticsBaseTableWidget::fillSubTable(KvStatisticSubTable *subTable, int page)
@@ -137,7 +139,8 @@ KvTablePageSplit KvStatisticsBaseTableWidget::computeSplit() const
 {
     const KvTemplateContext *context = m_cfg->context();
     const int contentHeight = context ? context->contentHeight() : 0;
-    return KvTablePageSplit::compute(contentHeight, m_contents->header.rowCount(), m_contents->body.rowCount());
+    return KvTablePageSplit::compute(contentHeight, m_contents->header.rowCount(),
+                                     m_contents->body.rowCount());
 }
 
 void KvStatisticsBaseTableWidget::finishUpdate()

@@ -18,13 +18,15 @@ class QFont;
 struct KvTableContents;
 
 /**
- * Display object of a table block: collects the table as a grid of cells and shows it in page-sized pieces, each under
- * the same header rows.
+ * Display object of a table block: collects the table as a grid of cells and shows it in page-sized pieces,
+ * each under the same header rows.
  *
- * Not a widget itself; its pieces are. Derived classes fill the grid (startUpdate(), setHeaderCell(), setCell(), then
- * finishUpdate()) and answer where the table stands.
+ * Not a widget itself; its pieces are. Derived classes fill the grid (startUpdate(), setHeaderCell(),
+ * setCell(), then finishUpdate()) and answer where the table stands.
  */
-class KvStatisticsBaseTableWidget : public QObject, public KvBaseDisplayWidget
+class KvStatisticsBaseTableWidget
+    : public QObject
+    , public KvBaseDisplayWidget
 {
     Q_OBJECT
 public:
@@ -48,13 +50,14 @@ public:
     const QList<KvStatisticSubTable *> &subTables() const { return m_subTables; }
 
 protected:
-    /** \a cfg is not owned and outlives the block; pieces become children of \a displayParent, which may be null. */
+    /** \a cfg is not owned and outlives the block; pieces become children of \a displayParent, which may be
+     * null. */
     KvStatisticsBaseTableWidget(QWidget *displayParent, KvStatisticsThemedNodeCfg *cfg);
 
     void setFonts(const QFont &headerFont, const QFont &bodyFont);
     /**
-     * Empties the grid for a new filling, which finishUpdate() ends. Unlike clear() it leaves the pieces alone: they are
-     * refilled at the end, and every reset of a piece costs as much as filling it.
+     * Empties the grid for a new filling, which finishUpdate() ends. Unlike clear() it leaves the pieces
+     * alone: they are refilled at the end, and every reset of a piece costs as much as filling it.
      */
     void startUpdate();
     /** Makes room for a grid of known size. */
@@ -65,7 +68,8 @@ protected:
     void updatePageSplit();
     /** Places all pieces anew after a change of width, alignment or page. */
     void updatePlacement();
-    /** After the user changed an option: tells the window, which may save it, and marks the template modified. */
+    /** After the user changed an option: tells the window, which may save it, and marks the template
+     * modified. */
     void announceConfigChanged();
 
     /** Width of the table in percent of the width between the margins. */

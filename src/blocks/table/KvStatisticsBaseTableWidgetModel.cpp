@@ -6,13 +6,12 @@
 KvStatisticsBaseTableWidgetModel::KvStatisticsBaseTableWidgetModel(QObject *parent)
     : QAbstractTableModel(parent)
     , m_contents(std::make_shared<KvTableContents>())
-{
-}
+{}
 
 KvStatisticsBaseTableWidgetModel::~KvStatisticsBaseTableWidgetModel() = default;
 
-void KvStatisticsBaseTableWidgetModel::setPart(std::shared_ptr<const KvTableContents> contents, int firstBodyRow,
-                                               int bodyRows)
+void KvStatisticsBaseTableWidgetModel::setPart(std::shared_ptr<const KvTableContents> contents,
+                                               int firstBodyRow, int bodyRows)
 {
     beginResetModel();
     m_contents = std::move(contents);

@@ -12,8 +12,8 @@ class QFont;
 /**
  * Model of one page piece of a table: all header rows, followed by a run of body rows.
  *
- * Shows a part of the block's contents without copying them. A cell has a text (display role), a font, an alignment,
- * a text colour and a background colour; the last two are invalid colours where the theme decides.
+ * Shows a part of the block's contents without copying them. A cell has a text (display role), a font, an
+ * alignment, a text colour and a background colour; the last two are invalid colours where the theme decides.
  */
 class KvStatisticsBaseTableWidgetModel : public QAbstractTableModel
 {
@@ -25,7 +25,8 @@ public:
     explicit KvStatisticsBaseTableWidgetModel(QObject *parent = nullptr);
     ~KvStatisticsBaseTableWidgetModel() override;
 
-    /** Shows the header of \a contents and \a bodyRows of its body rows from \a firstBodyRow on; resets the model. */
+    /** Shows the header of \a contents and \a bodyRows of its body rows from \a firstBodyRow on; resets the
+     * model. */
     void setPart(std::shared_ptr<const KvTableContents> contents, int firstBodyRow, int bodyRows);
     /** Shows nothing; resets the model unless it is empty already. */
     void clear();

@@ -73,7 +73,8 @@ void KvStatisticsTableView::paintEvent(QPaintEvent *event)
         return;
     const QRect exposed = event->rect();
     const int first = std::max(0, (exposed.top() - geometry.top) / geometry.rowHeight);
-    const int last = std::min(m_model->rowCount() - 1, (exposed.bottom() - geometry.top) / geometry.rowHeight);
+    const int last =
+        std::min(m_model->rowCount() - 1, (exposed.bottom() - geometry.top) / geometry.rowHeight);
     QPainter painter(viewport());
     m_delegate->paintRows(&painter, *m_model, geometry, first, last);
 }

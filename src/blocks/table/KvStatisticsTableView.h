@@ -10,8 +10,8 @@ class KvStatisticsBaseTableWidgetModel;
 /**
  * The QTableView of a table piece: hidden headers, rows of one height, columns that share the width.
  *
- * Header rows of the report table are ordinary cells: a header view painted through a graphics proxy would end up as a
- * bitmap in the PDF.
+ * Header rows of the report table are ordinary cells: a header view painted through a graphics proxy would
+ * end up as a bitmap in the PDF.
  */
 class KvStatisticsTableView : public QTableView
 {

@@ -13,5 +13,8 @@ struct KvTableContents
     QFont headerFont;
     QFont bodyFont;
 
-    int columnCount() const { return header.columnCount() > body.columnCount() ? header.columnCount() : body.columnCount(); }
+    int columnCount() const
+    {
+        return header.columnCount() > body.columnCount() ? header.columnCount() : body.columnCount();
+    }
 };

@@ -16,8 +16,8 @@ struct KvTableCell
 Q_DECLARE_TYPEINFO(KvTableCell, Q_MOVABLE_TYPE);
 
 /**
- * Cells by row and column. Kept in one array, row after row, because a report holds hundreds of thousands of them;
- * cheapest to fill row by row, with the widest row first.
+ * Cells by row and column. Kept in one array, row after row, because a report holds hundreds of thousands of
+ * them; cheapest to fill row by row, with the widest row first.
  */
 class KvTableGrid
 {

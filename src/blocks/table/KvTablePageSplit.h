@@ -13,8 +13,8 @@ struct KvTablePageSplit
     /**
      * \param contentHeight height that a page grants; 0 or less means no limit
      *
-     * A page too low for one body row holds them all in one piece: dividing by the zero or negative number of rows
-     * that the height yields would have no meaning.
+     * A page too low for one body row holds them all in one piece: dividing by the zero or negative number of
+     * rows that the height yields would have no meaning.
      */
     static KvTablePageSplit compute(int contentHeight, int headerRows, int bodyRows);
 

@@ -14,8 +14,8 @@ constexpr int kLongestMeasured = 2000;
 
 bool isLineBreak(QChar c)
 {
-    return c == QLatin1Char('\n') || c == QLatin1Char('\r') || c == QChar::LineSeparator
-        || c == QChar::ParagraphSeparator;
+    return c == QLatin1Char('\n') || c == QLatin1Char('\r') || c == QChar::LineSeparator ||
+           c == QChar::ParagraphSeparator;
 }
 
 QString singleLine(QString text)
@@ -33,15 +33,16 @@ KvTextFit::KvTextFit(const QFont &font)
     : m_font(font)
     , m_metrics(font)
     , m_advances(kTableSize, -1.0f)
-{
-}
+{}
 
 QString KvTextFit::fitted(const QString &text, qreal width) const
 {
     if (surelyFits(text, width))
         return text;
-    const QString measured = text.size() > kLongestMeasured ? text.left(kLongestMeasured) + QChar(0x2026) : text;
-    const QString line = std::any_of(measured.begin(), measured.end(), isLineBreak) ? singleLine(measured) : measured;
+    const QString measured =
+        text.size() > kLongestMeasured ? text.left(kLongestMeasured) + QChar(0x2026) : text;
+    const QString line =
+        std::any_of(measured.begin(), measured.end(), isLineBreak) ? singleLine(measured) : measured;
     return m_metrics.elidedText(line, Qt::ElideRight, width);
 }
 

@@ -9,8 +9,8 @@
 /**
  * Finds out whether texts fit a width, and shortens those that do not.
  *
- * Measuring a text costs as much as drawing it, and nearly every cell of a table fits: the widths of single characters,
- * measured once, settle those cells.
+ * Measuring a text costs as much as drawing it, and nearly every cell of a table fits: the widths of single
+ * characters, measured once, settle those cells.
  */
 class KvTextFit
 {

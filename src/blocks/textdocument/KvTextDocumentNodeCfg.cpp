@@ -9,8 +9,7 @@ const char kTextKey[] = "text";
 
 KvTextDocumentNodeCfg::KvTextDocumentNodeCfg(KvTemplateContext *context, QObject *parent)
     : KvBaseEditorNodeCfg(context, parent)
-{
-}
+{}
 
 bool KvTextDocumentNodeCfg::toJson(QJsonObject &config) const
 {

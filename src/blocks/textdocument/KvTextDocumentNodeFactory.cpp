@@ -12,8 +12,7 @@ KvTextDocumentNodeFactory::KvTextDocumentNodeFactory()
     : KvBaseEditorNodeFactory(QStringLiteral("Text Document"),
                               QCoreApplication::translate("KvBaseEditorNodeFactory", "Text Document"),
                               QStringLiteral("Icons/ToolIconText.svg"))
-{
-}
+{}
 
 KvBaseDisplayWidget *KvTextDocumentNodeFactory::createDisplayWidget(QWidget *parent, KvBaseEditorNodeCfg *cfg)
 {

@@ -6,6 +6,7 @@
 #include "templates/KvReportFont.h"
 #include "templates/KvTemplateContext.h"
 
+#include <QAbstractTextDocumentLayout>
 #include <QSignalBlocker>
 #include <QTextDocument>
 
@@ -26,10 +27,18 @@ KvTextDocumentNodeWidget::KvTextDocumentNodeWidget(QWidget *parent, KvTextDocume
     setFrameShape(QFrame::NoFrame);
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    // Pages read from left to right whatever the language of the program; paragraphs still follow their own script.
+    // Pages read from left to right whatever the language of the program; paragraphs still follow their own
+    // script.
     setLayoutDirection(Qt::LeftToRight);
+    // Laid out for no device: the viewport would scale margins, pictures and point sizes by the screen's
+    // resolution, and lines would break differently on every screen and in every program.
+    document()->documentLayout()->setPaintDevice(nullptr);
     document()->setDefaultFont(KvReportFont::make(KvReportFont::BodyPixelSize));
     setTextColor(QColor(QStringLiteral("black")));
+    // Text without a colour of its own takes the palette's, which is that of a dark program around the white page.
+    QPalette paper = palette();
+    paper.setColor(QPalette::Text, Qt::black);
+    setPalette(paper);
     applyPageWidth();
     connect(this, SIGNAL(textChanged()), this, SLOT(slotTextChanged()));
     refreshText();

@@ -12,7 +12,9 @@ class KvTextDocumentNodeCfg;
  *
  * The configuration keeps keywords as placeholders; what is shown has them expanded.
  */
-class KvTextDocumentNodeWidget : public QTextEdit, public KvBaseDisplayWidget
+class KvTextDocumentNodeWidget
+    : public QTextEdit
+    , public KvBaseDisplayWidget
 {
     Q_OBJECT
 public:
@@ -35,8 +37,8 @@ public slots:
 
 protected:
     /**
-     * Takes the text over into the configuration after an edit, announces it and marks the template modified, whether
-     * the stored text changed or not: a deliberately coarse rule.
+     * Takes the text over into the configuration after an edit, announces it and marks the template modified,
+     * whether the stored text changed or not: a deliberately coarse rule.
      */
     virtual void applyContent();
 

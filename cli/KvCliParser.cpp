@@ -1,30 +1,34 @@
 // SPDX-License-Identifier: MIT
-#include "KvCliArguments.h"
+#include "KvCliParser.h"
 
 #include <QCommandLineParser>
+#include <QCoreApplication>
+
+#include <memory>
 
 namespace {
 
-const char kOverview[] = "Usage: statreport COMMAND [options]\n"
-                         "Turns measurements and a report template into a PDF report, without a display.\n"
-                         "\n"
-                         "Commands:\n"
-                         "  render TEMPLATE.rtp (--session S | --table T) [--image I] -o OUT.pdf\n"
-                         "                        prints a report\n"
-                         "  stats (--session S | --table T) [--group-by object|measurement]\n"
-                         "        [--format text|csv|json]\n"
-                         "                        prints the statistics of every measured value\n"
-                         "  check TEMPLATE.rtp    says what a template holds and what would be skipped or refused\n"
-                         "  blocks [--format text|json]\n"
-                         "                        lists the block types and their settings with defaults\n"
-                         "\n"
-                         "Options everywhere:\n"
-                         "  -h, --help            this text, or that of a command\n"
-                         "  -v, --version         the version\n"
-                         "  --json-errors         errors as one line of JSON each\n"
-                         "\n"
-                         "\"-\" as a file name is standard input or output. Exit codes: 0 done, 1 the work failed,\n"
-                         "2 wrong usage.\n";
+const char kOverview[] =
+    "Usage: statreport COMMAND [options]\n"
+    "Turns measurements and a report template into a PDF report, without a display.\n"
+    "\n"
+    "Commands:\n"
+    "  render TEMPLATE.rtp (--session S | --table T) [--image I] -o OUT.pdf\n"
+    "                        prints a report\n"
+    "  stats (--session S | --table T) [--group-by object|measurement]\n"
+    "        [--format text|csv|json]\n"
+    "                        prints the statistics of every measured value\n"
+    "  check TEMPLATE.rtp    says what a template holds and what would be skipped or refused\n"
+    "  blocks [--format text|json]\n"
+    "                        lists the block types and their settings with defaults\n"
+    "\n"
+    "Options everywhere:\n"
+    "  -h, --help            this text, or that of a command\n"
+    "  -v, --version         the version\n"
+    "  --json-errors         errors as one line of JSON each\n"
+    "\n"
+    "\"-\" as a file name is standard input or output. Exit codes: 0 done, 1 the work failed,\n"
+    "2 wrong usage.\n";
 
 struct CommandName
 {
@@ -62,60 +66,95 @@ KvCliParseResult usageError(const QString &text)
     return result;
 }
 
+// The parser asks the application for the program's name, and the command line is read before there is one.
+QString helpOf(const QCommandLineParser &parser, const QString &command)
+{
+    int count = 1;
+    char name[] = "statreport";
+    char *words[] = {name, nullptr};
+    std::unique_ptr<QCoreApplication> application;
+    if (!QCoreApplication::instance())
+        application = std::make_unique<QCoreApplication>(count, words);
+    // The options come behind the command.
+    QString text = parser.helpText();
+    return text.replace(QStringLiteral(" [options] ") + command,
+                        QLatin1Char(' ') + command + QStringLiteral(" [options]"));
+}
+
 void addCommonOptions(QCommandLineParser &parser)
 {
     parser.addOption({{QStringLiteral("h"), QStringLiteral("help")}, QStringLiteral("Shows this text.")});
-    parser.addOption({{QStringLiteral("v"), QStringLiteral("version")}, QStringLiteral("Shows the version.")});
-    parser.addOption({QStringLiteral("json-errors"), QStringLiteral("Writes errors as one line of JSON each.")});
-    parser.addOption({{QStringLiteral("q"), QStringLiteral("quiet")}, QStringLiteral("Writes no notes and no progress.")});
+    parser.addOption(
+        {{QStringLiteral("v"), QStringLiteral("version")}, QStringLiteral("Shows the version.")});
+    parser.addOption(
+        {QStringLiteral("json-errors"), QStringLiteral("Writes errors as one line of JSON each.")});
+    parser.addOption(
+        {{QStringLiteral("q"), QStringLiteral("quiet")}, QStringLiteral("Writes no notes and no progress.")});
 }
 
 void addDataOptions(QCommandLineParser &parser)
 {
     const QString file = QStringLiteral("file");
     const QString column = QStringLiteral("column");
-    parser.addOption({QStringLiteral("session"), QStringLiteral("Measurements: a session of the Measuring Desk."), file});
-    parser.addOption({QStringLiteral("table"), QStringLiteral("Measurements: a table (CSV, TSV, ImageJ results)."), file});
-    parser.addOption({QStringLiteral("unit"),
-                      QStringLiteral("Unit of the table's values that state none, or Name=unit for one value. May be given "
-                                     "several times."),
-                      QStringLiteral("unit")});
-    parser.addOption({QStringLiteral("type-column"), QStringLiteral("The table's column with the object types."), column});
-    parser.addOption({QStringLiteral("name-column"), QStringLiteral("The table's column with the object names."), column});
+    parser.addOption(
+        {QStringLiteral("session"), QStringLiteral("Measurements: a session of the Measuring Desk."), file});
+    parser.addOption(
+        {QStringLiteral("table"), QStringLiteral("Measurements: a table (CSV, TSV, ImageJ results)."), file});
+    parser.addOption(
+        {QStringLiteral("unit"),
+         QStringLiteral(
+             "Unit of the table's values that state none, or Name=unit for one value. May be given "
+             "several times."),
+         QStringLiteral("unit")});
+    parser.addOption(
+        {QStringLiteral("type-column"), QStringLiteral("The table's column with the object types."), column});
+    parser.addOption(
+        {QStringLiteral("name-column"), QStringLiteral("The table's column with the object names."), column});
     parser.addOption({QStringLiteral("decimal"), QStringLiteral("Decimal mark of the table: point or comma."),
                       QStringLiteral("mark")});
-    parser.addOption({QStringLiteral("digits"), QStringLiteral("Significant digits of measured values; 0 is automatic."),
+    parser.addOption({QStringLiteral("digits"),
+                      QStringLiteral("Significant digits of measured values; 0 is automatic."),
                       QStringLiteral("count")});
 }
 
 void addCommandOptions(QCommandLineParser &parser, KvCliArguments::Command command)
 {
-    const QCommandLineOption format(QStringLiteral("format"), QStringLiteral("Output: text, csv or json."),
+    const QCommandLineOption format(QStringLiteral("format"),
+                                    command == KvCliArguments::Stats
+                                        ? QStringLiteral("Output: text, csv or json.")
+                                        : QStringLiteral("Output: text or json."),
                                     QStringLiteral("format"), QStringLiteral("text"));
     switch (command) {
     case KvCliArguments::Render:
-        parser.setApplicationDescription(QStringLiteral("Prints a report: template and measurements in, PDF out."));
+        parser.setApplicationDescription(
+            QStringLiteral("Prints a report: template and measurements in, PDF out."));
         parser.addPositionalArgument(QStringLiteral("TEMPLATE.rtp"), QStringLiteral("The report template."));
         addDataOptions(parser);
-        parser.addOption({QStringLiteral("image"), QStringLiteral("The image that was measured."), QStringLiteral("file")});
-        parser.addOption({{QStringLiteral("o"), QStringLiteral("output")}, QStringLiteral("The PDF file to write."),
+        parser.addOption({QStringLiteral("image"), QStringLiteral("The image that was measured."),
+                          QStringLiteral("file")});
+        parser.addOption({{QStringLiteral("o"), QStringLiteral("output")},
+                          QStringLiteral("The PDF file to write."),
                           QStringLiteral("file")});
         break;
     case KvCliArguments::Stats:
-        parser.setApplicationDescription(QStringLiteral("Prints the statistics of every measured value, in the table's "
-                                                        "own units."));
+        parser.setApplicationDescription(
+            QStringLiteral("Prints the statistics of every measured value, in the table's "
+                           "own units."));
         addDataOptions(parser);
-        parser.addOption({QStringLiteral("group-by"), QStringLiteral("Groups: object (type and value) or measurement."),
+        parser.addOption({QStringLiteral("group-by"),
+                          QStringLiteral("Groups: object (type and value) or measurement."),
                           QStringLiteral("grouping"), QStringLiteral("object")});
         parser.addOption(format);
         break;
     case KvCliArguments::Check:
-        parser.setApplicationDescription(QStringLiteral("Says what a template holds and what would be skipped or "
-                                                        "refused."));
+        parser.setApplicationDescription(
+            QStringLiteral("Says what a template holds and what would be skipped or "
+                           "refused."));
         parser.addPositionalArgument(QStringLiteral("TEMPLATE.rtp"), QStringLiteral("The report template."));
         break;
     default:
-        parser.setApplicationDescription(QStringLiteral("Lists the block types and their settings with defaults."));
+        parser.setApplicationDescription(
+            QStringLiteral("Lists the block types and their settings with defaults."));
         parser.addOption(format);
         break;
     }
@@ -174,8 +213,8 @@ QString takeData(const QCommandLineParser &parser, KvCliArguments &arguments)
     arguments.decimalMark = parser.value(QStringLiteral("decimal"));
     if (arguments.sessionPath.isEmpty() == arguments.tablePath.isEmpty())
         return QStringLiteral("give the measurements: either --session or --table");
-    if (!arguments.decimalMark.isEmpty() && arguments.decimalMark != QLatin1String("point")
-        && arguments.decimalMark != QLatin1String("comma"))
+    if (!arguments.decimalMark.isEmpty() && arguments.decimalMark != QLatin1String("point") &&
+        arguments.decimalMark != QLatin1String("comma"))
         return QStringLiteral("--decimal must be point or comma, not \"%1\"").arg(arguments.decimalMark);
     return takeDigits(parser, arguments);
 }
@@ -184,7 +223,8 @@ QString takePositionals(const QCommandLineParser &parser, KvCliArguments &argume
 {
     // The first one is the command itself.
     const QStringList words = parser.positionalArguments().mid(1);
-    const bool wantsTemplate = arguments.command == KvCliArguments::Render || arguments.command == KvCliArguments::Check;
+    const bool wantsTemplate =
+        arguments.command == KvCliArguments::Render || arguments.command == KvCliArguments::Check;
     const int wanted = wantsTemplate ? 1 : 0;
     if (words.size() < wanted)
         return QStringLiteral("the template is missing");
@@ -203,8 +243,8 @@ QString takePositionals(const QCommandLineParser &parser, KvCliArguments &argume
 QString doubleInputFault(const KvCliArguments &arguments)
 {
     const QString input = QStringLiteral("-");
-    const int count = (arguments.templatePath == input ? 1 : 0) + (arguments.sessionPath == input ? 1 : 0)
-        + (arguments.tablePath == input ? 1 : 0);
+    const int count = (arguments.templatePath == input ? 1 : 0) + (arguments.sessionPath == input ? 1 : 0) +
+                      (arguments.tablePath == input ? 1 : 0);
     return count > 1 ? QStringLiteral("only one file can be read from standard input") : QString();
 }
 
@@ -235,7 +275,8 @@ KvCliParseResult KvCliParser::parse(const QStringList &arguments)
     result.arguments.command = commandOf(first);
     result.arguments.jsonErrors = arguments.contains(QStringLiteral("--json-errors"));
     if (result.arguments.command == KvCliArguments::NoCommand) {
-        result.text = QStringLiteral("unknown command \"%1\"; it must be render, stats, check or blocks").arg(first);
+        result.text =
+            QStringLiteral("unknown command \"%1\"; it must be render, stats, check or blocks").arg(first);
         return result;
     }
     QCommandLineParser parser;
@@ -247,7 +288,7 @@ KvCliParseResult KvCliParser::parse(const QStringList &arguments)
         return result;
     }
     if (parser.isSet(QStringLiteral("help")))
-        return shownText(parser.helpText());
+        return shownText(helpOf(parser, first));
     if (parser.isSet(QStringLiteral("version")))
         return shownText(version);
     result.arguments.quiet = parser.isSet(QStringLiteral("quiet"));
