@@ -35,7 +35,8 @@ KvTextDocumentNodeWidget::KvTextDocumentNodeWidget(QWidget *parent, KvTextDocume
     document()->documentLayout()->setPaintDevice(nullptr);
     document()->setDefaultFont(KvReportFont::make(KvReportFont::BodyPixelSize));
     setTextColor(QColor(QStringLiteral("black")));
-    // Text without a colour of its own takes the palette's, which is that of a dark program around the white page.
+    // Text without a colour of its own takes the palette's, which is that of a dark program around the white
+    // page.
     QPalette paper = palette();
     paper.setColor(QPalette::Text, Qt::black);
     setPalette(paper);
