@@ -58,14 +58,6 @@ KvCliParseResult shownText(const QString &text)
     return result;
 }
 
-KvCliParseResult usageError(const QString &text)
-{
-    KvCliParseResult result;
-    result.kind = KvCliParseResult::UsageError;
-    result.text = text;
-    return result;
-}
-
 // The parser asks the application for the program's name, and the command line is read before there is one.
 QString helpOf(const QCommandLineParser &parser, const QString &command)
 {
@@ -258,22 +250,36 @@ QString takeValues(const QCommandLineParser &parser, KvCliArguments &arguments)
     return doubleInputFault(arguments);
 }
 
+// The command, unless it is missing: options that hold for every command may stand before it.
+QString firstWord(const QStringList &arguments)
+{
+    const QStringList common{QStringLiteral("--json-errors"), QStringLiteral("-q"),
+                             QStringLiteral("--quiet")};
+    for (const QString &word : arguments.mid(1)) {
+        if (!common.contains(word))
+            return word;
+    }
+    return QString();
+}
+
 } // namespace
 
 KvCliParseResult KvCliParser::parse(const QStringList &arguments)
 {
-    const QString first = arguments.value(1);
+    const QString first = firstWord(arguments);
     if (first == QLatin1String("-h") || first == QLatin1String("--help"))
         return shownText(QLatin1String(kOverview));
     const QString version = QStringLiteral("statreport " STATREPORT_VERSION "\n");
     if (first == QLatin1String("-v") || first == QLatin1String("--version"))
         return shownText(version);
-    if (first.isEmpty())
-        return usageError(QStringLiteral("a command is missing: render, stats, check or blocks"));
 
     KvCliParseResult result;
     result.arguments.command = commandOf(first);
     result.arguments.jsonErrors = arguments.contains(QStringLiteral("--json-errors"));
+    if (first.isEmpty()) {
+        result.text = QStringLiteral("a command is missing: render, stats, check or blocks");
+        return result;
+    }
     if (result.arguments.command == KvCliArguments::NoCommand) {
         result.text =
             QStringLiteral("unknown command \"%1\"; it must be render, stats, check or blocks").arg(first);

@@ -8,14 +8,15 @@
 class QTemporaryFile;
 struct ZtFault;
 
-/** A file named on the command line; "-" is read from standard input into a temporary file first. */
+/** A file named on the command line; standard input ("-"), pipes and devices are copied to a temporary file
+ * first. */
 class KvCliSource
 {
 public:
     KvCliSource();
     ~KvCliSource();
 
-    /** False with a fault when standard input cannot be taken over. */
+    /** False with a fault when the copy cannot be made. */
     bool open(const QString &name, ZtFault *fault);
 
     /** The file to read. */

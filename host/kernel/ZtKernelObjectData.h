@@ -3,6 +3,8 @@
 
 #include "kernel/ZtKernelGlobal.h"
 
+#include <QMetaType>
+
 /**
  * Data of one object on the image; what it holds is known to the manipulator of its type. Owned by
  * ZtKernelData.
@@ -16,3 +18,5 @@ public:
     ZtKernelObjectData(const ZtKernelObjectData &) = delete;
     ZtKernelObjectData &operator=(const ZtKernelObjectData &) = delete;
 };
+
+Q_DECLARE_METATYPE(const ZtKernelObjectData *)

@@ -26,5 +26,5 @@ signals:
     void signalAppAboutToClose();   ///< last chance to write settings
 
 private:
-    ZtSignalCenter() = default;
+    ZtSignalCenter();
 };

@@ -44,8 +44,7 @@ public:
     bool addCell(int row, int valueIndex, double number, const QString &numberText, const ZtUnit &unit,
                  const ZtTablePlace &place = ZtTablePlace());
 
-    /** The finished type; null, with a message and a place in \a fault, when a row has the same value twice.
-     */
+    /** The finished type; null, with message and place in \a fault, when a row has the same value twice. */
     std::shared_ptr<const ZtImportedType> build(ZtFault *fault);
 
 private:

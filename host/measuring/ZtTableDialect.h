@@ -14,7 +14,7 @@ public:
     /**
      * The separator - comma, semicolon or tab - that cuts the first rows into as many fields as the header
      * has most consistently. \a decimalComma says that commas are known to be decimal marks, so the others
-     * come first.
+     * come first. Among equals the comma loses, as it may as well be a decimal mark.
      */
     static char findSeparator(std::string_view text, bool decimalComma);
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "blocks/textdocument/KvTextDocumentNodeWidget.h"
 
+#include "blocks/textdocument/KvRichTextGuard.h"
 #include "blocks/textdocument/KvTextDocumentNodeCfg.h"
 #include "report/KvBaseDisplayWidgetSignals.h"
 #include "templates/KvReportFont.h"
@@ -87,7 +88,7 @@ void KvTextDocumentNodeWidget::refreshText()
     if (const KvTemplateContext *context = m_cfg->context())
         context->keywords().expand(text);
     const QSignalBlocker blocker(this);
-    setHtml(text);
+    setHtml(KvRichTextGuard::tamed(text));
     updateHeight();
 }
 

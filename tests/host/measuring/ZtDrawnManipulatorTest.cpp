@@ -1,0 +1,366 @@
+// SPDX-License-Identifier: MIT
+#include "support/StatReportTest.h"
+
+#include "host/measuring/Polygon.h"
+#include "kernel/ZtAppSettings.h"
+#include "kernel/ZtKernelData.h"
+#include "kernel/ZtKernelObjectDataDescr.h"
+#include "measuring/ZtCalibration.h"
+#include "measuring/ZtDrawnManipulator.h"
+#include "measuring/ZtDrawnObjectData.h"
+#include "measuring/ZtDrawnType.h"
+#include "measuring/ZtUnitSettings.h"
+
+#include <QImage>
+#include <QPainter>
+
+#include <cmath>
+#include <limits>
+#include <memory>
+
+Q_DECLARE_METATYPE(QPolygonF)
+
+namespace {
+
+const double pi = std::acos(-1.0);
+const double half = std::sqrt(0.5);
+
+/// A manipulator with a calibration of its own.
+struct Measured
+{
+    explicit Measured(int type, double micrometresPerPixel = 0.0)
+        : calibration(std::make_shared<ZtCalibration>(micrometresPerPixel))
+        , manipulator(*ZtDrawnType::find(type), calibration)
+    {}
+
+    std::shared_ptr<ZtCalibration> calibration;
+    ZtDrawnManipulator manipulator;
+};
+
+QPolygonF samplePoints(const ZtDrawnType &type)
+{
+    const QPolygonF all = polygon({{30, 60}, {90, 60}, {60, 90}});
+    return all.mid(0, qMin(type.maximumPoints, all.size()));
+}
+
+/// Draws an object and tells how many pixels are much brighter or darker than the plain picture.
+struct Drawing
+{
+    Drawing(int type, const QPolygonF &points, const QColor &background, double zoom = 1.0,
+            const QString &text = QString())
+    {
+        QImage image(120, 120, QImage::Format_RGB32);
+        image.fill(background);
+        QPainter painter(&image);
+        painter.scale(zoom, zoom);
+        const QTransform before = painter.worldTransform();
+        const Measured measured(type);
+        const ZtDrawnObjectData object(points, text);
+        measured.manipulator.draw(&painter, 1, &object);
+        leavesPainterAlone = painter.worldTransform() == before && painter.pen() == QPen();
+        painter.end();
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x) {
+                const int grey = qGray(image.pixel(x, y));
+                bright += grey > 150 ? 1 : 0;
+                dark += grey < 100 ? 1 : 0;
+            }
+        }
+    }
+
+    int bright = 0;
+    int dark = 0;
+    bool leavesPainterAlone = false;
+};
+
+} // namespace
+
+class ZtDrawnManipulatorTest : public StatReportTest
+{
+    Q_OBJECT
+private slots:
+    void init();
+    void hasTheTypes_data();
+    void hasTheTypes();
+    void measures_data();
+    void measures();
+    void followsTheCalibration();
+    void readsInPixelsWithoutCalibration();
+    void countsShares();
+    void refusesPoints_data();
+    void refusesPoints();
+    void knowsNoOtherValues();
+    void drawsVisibly_data();
+    void drawsVisibly();
+    void drawsNothingItCannotMeasure();
+    void keepsLabelsOnThePicture();
+    void namesObjects();
+};
+
+void ZtDrawnManipulatorTest::init()
+{
+    StatReportTest::init();
+    ZtUnitSettings::getInstance();
+    ZtAppSettings::getInstance()->setStoragePath(QString());
+}
+
+void ZtDrawnManipulatorTest::hasTheTypes_data()
+{
+    QTest::addColumn<int>("id");
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QStringList>("values");
+    const auto list = [](const char *names) { return QString::fromLatin1(names).split(QLatin1Char(',')); };
+    QTest::newRow("rectangle") << 66651 << "Rectangle" << list("Width,Height,Area");
+    QTest::newRow("line") << 66653 << "Line" << list("Length");
+    QTest::newRow("arc") << 66655 << "Arc" << list("Angle,Arc length");
+    QTest::newRow("polygon") << 66656 << "Polygon" << list("Area,Perimeter");
+    QTest::newRow("polyline") << 66658 << "Polyline" << list("Length");
+    QTest::newRow("parallel distance") << 66659 << "Parallel distance" << list("Distance");
+    QTest::newRow("counter") << 66741 << "Counter" << list("Count,Share");
+    QTest::newRow("circle") << 66755 << "Circle" << list("Diameter,Area");
+    QTest::newRow("text note") << int(ZtDrawnType::TextNote) << "Text note" << QStringList();
+    QTest::newRow("scale bar") << int(ZtDrawnType::ScaleBar) << "Scale bar" << QStringList();
+}
+
+void ZtDrawnManipulatorTest::hasTheTypes()
+{
+    QFETCH(int, id);
+    QFETCH(QString, name);
+    QFETCH(QStringList, values);
+    const ZtDrawnType *type = ZtDrawnType::find(id);
+    QVERIFY(type);
+    QVERIFY(ZtDrawnType::findKey(QLatin1String(type->key)) == type);
+    QCOMPARE(ZtDrawnType::all().size(), std::size_t(10));
+    const Measured measured(id);
+    QCOMPARE(measured.manipulator.objectTypeId(), id);
+    QCOMPARE(measured.manipulator.objectTypeName(1), name);
+    QCOMPARE(measured.manipulator.getValueNames(), values);
+    QCOMPARE(measured.manipulator.typeFlags(0), values.isEmpty() ? 0 : 0x200);
+}
+
+void ZtDrawnManipulatorTest::measures_data()
+{
+    QTest::addColumn<int>("type");
+    QTest::addColumn<QPolygonF>("points");
+    QTest::addColumn<QString>("value");
+    QTest::addColumn<double>("expected"); // with 2 micrometres per pixel
+    QTest::addColumn<int>("kind");
+    QTest::addColumn<QString>("text");
+    const int length = ZtGsManipulator::Length;
+    const int area = ZtGsManipulator::Area;
+    const int angle = ZtGsManipulator::Angle;
+    const QString um = QStringLiteral(" \u03BCm");
+    const QString um2 = QStringLiteral(" \u03BCm\u00B2");
+    const QString degree = QStringLiteral(" \u00B0");
+    const QPolygonF corners = polygon({{10, 20}, {40, 5}});
+    QTest::newRow("rectangle, width") << 66651 << corners << "Width" << 60.0 << length << "60.000" + um;
+    QTest::newRow("rectangle, height") << 66651 << corners << "Height" << 30.0 << length << "30.000" + um;
+    QTest::newRow("rectangle, area") << 66651 << corners << "Area" << 1800.0 << area << "1800.0" + um2;
+    QTest::newRow("rectangle of no size")
+        << 66651 << polygon({{1, 1}, {1, 1}}) << "Area" << 0.0 << area << QStringLiteral("0.000 nm\u00B2");
+    QTest::newRow("rectangle without height")
+        << 66651 << polygon({{1, 1}, {5, 1}}) << "Width" << 8.0 << length << "8.000" + um;
+    QTest::newRow("line") << 66653 << polygon({{0, 0}, {3, 4}}) << "Length" << 10.0 << length
+                          << "10.000" + um;
+    QTest::newRow("line of no length")
+        << 66653 << polygon({{3, 4}, {3, 4}}) << "Length" << 0.0 << length << "0.000 nm";
+    QTest::newRow("arc, angle") << 66655 << polygon({{100, 0}, {100 * half, 100 * half}, {0, 100}}) << "Angle"
+                                << 90.0 << angle << "90.000" + degree;
+    QTest::newRow("arc, length") << 66655 << polygon({{100, 0}, {100 * half, 100 * half}, {0, 100}})
+                                 << "Arc length" << 100.0 * pi << length << "314.16" + um;
+    QTest::newRow("arc, the long way") << 66655 << polygon({{100, 0}, {-100 * half, -100 * half}, {0, 100}})
+                                       << "Angle" << 270.0 << angle << "270.00" + degree;
+    QTest::newRow("straight arc, angle")
+        << 66655 << polygon({{0, 0}, {1, 1}, {3, 3}}) << "Angle" << 0.0 << angle << "0.000" + degree;
+    QTest::newRow("straight arc, length")
+        << 66655 << polygon({{0, 0}, {3, 4}, {6, 8}}) << "Arc length" << 20.0 << length << "20.000" + um;
+    const QPolygonF triangle = polygon({{0, 0}, {3, 0}, {3, 4}});
+    QTest::newRow("polygon, area") << 66656 << triangle << "Area" << 24.0 << area << "24.000" + um2;
+    QTest::newRow("polygon, perimeter")
+        << 66656 << triangle << "Perimeter" << 24.0 << length << "24.000" + um;
+    QTest::newRow("flat polygon") << 66656 << polygon({{0, 0}, {3, 3}, {6, 6}}) << "Area" << 0.0 << area
+                                  << QStringLiteral("0.000 nm\u00B2");
+    QTest::newRow("polyline") << 66658 << triangle << "Length" << 14.0 << length << "14.000" + um;
+    QTest::newRow("parallel distance")
+        << 66659 << polygon({{0, 0}, {4, 3}, {0, 5}}) << "Distance" << 8.0 << length << "8.000" + um;
+    QTest::newRow("parallel distance, base of one point")
+        << 66659 << polygon({{0, 0}, {0, 0}, {3, 4}}) << "Distance" << 10.0 << length << "10.000" + um;
+    QTest::newRow("counter") << 66741 << polygon({{0, 0}, {1, 1}, {1, 1}}) << "Count" << 3.0
+                             << int(ZtGsManipulator::Count) << "3 pcs";
+    QTest::newRow("empty counter") << 66741 << QPolygonF() << "Count" << 0.0 << int(ZtGsManipulator::Count)
+                                   << "0 pcs";
+    QTest::newRow("empty counter, share")
+        << 66741 << QPolygonF() << "Share" << 0.0 << int(ZtGsManipulator::Percentage) << "0.000 %";
+    QTest::newRow("circle, diameter")
+        << 66755 << polygon({{5, 5}, {8, 9}}) << "Diameter" << 20.0 << length << "20.000" + um;
+    QTest::newRow("circle, area") << 66755 << polygon({{5, 5}, {8, 9}}) << "Area" << 100.0 * pi << area
+                                  << "314.16" + um2;
+    QTest::newRow("circle of no size")
+        << 66755 << polygon({{5, 5}, {5, 5}}) << "Area" << 0.0 << area << QStringLiteral("0.000 nm\u00B2");
+}
+
+void ZtDrawnManipulatorTest::measures()
+{
+    QFETCH(int, type);
+    QFETCH(QPolygonF, points);
+    QFETCH(QString, value);
+    QFETCH(double, expected);
+    QFETCH(int, kind);
+    const Measured measured(type, 2.0);
+    const ZtDrawnObjectData object(points);
+    int measuredKind = -1;
+    const QVariant result = measured.manipulator.value(value, &object, measuredKind);
+    QCOMPARE(measuredKind, kind);
+    QCOMPARE(int(result.type()), int(kind == ZtGsManipulator::Count ? QVariant::Int : QVariant::Double));
+    QVERIFY2(std::abs(result.toDouble() - expected) <= 1e-9 * qMax(1.0, expected),
+             qPrintable(result.toString()));
+    QTEST(measured.manipulator.valueText(value, &object), "text");
+}
+
+void ZtDrawnManipulatorTest::followsTheCalibration()
+{
+    const Measured measured(ZtDrawnType::Line, 1.0);
+    const ZtDrawnObjectData object(polygon({{0, 0}, {100, 0}}));
+    QCOMPARE(measured.manipulator.valueText(QStringLiteral("Length"), &object),
+             QStringLiteral("100.00 \u03BCm"));
+    *measured.calibration = ZtCalibration(25.0);
+    QCOMPARE(measured.manipulator.valueText(QStringLiteral("Length"), &object), QStringLiteral("2.500 mm"));
+}
+
+void ZtDrawnManipulatorTest::readsInPixelsWithoutCalibration()
+{
+    const ZtDrawnObjectData line(polygon({{0, 0}, {123.44, 0}}));
+    const Measured lines(ZtDrawnType::Line);
+    int kind = -1;
+    QCOMPARE(lines.manipulator.value(QStringLiteral("Length"), &line, kind).toDouble(), 123.44);
+    QCOMPARE(kind, int(ZtGsManipulator::NoKind));
+    QCOMPARE(lines.manipulator.valueText(QStringLiteral("Length"), &line), QStringLiteral("123.4 px"));
+
+    const ZtDrawnObjectData corners(polygon({{0, 0}, {10, 10}}));
+    const Measured rectangles(ZtDrawnType::Rectangle);
+    QCOMPARE(rectangles.manipulator.valueText(QStringLiteral("Area"), &corners),
+             QStringLiteral("100.0 px\u00B2"));
+
+    const ZtDrawnObjectData arc(polygon({{1, 0}, {half, half}, {0, 1}}));
+    const Measured arcs(ZtDrawnType::Arc);
+    arcs.manipulator.value(QStringLiteral("Angle"), &arc, kind);
+    QCOMPARE(kind, int(ZtGsManipulator::Angle));
+}
+
+void ZtDrawnManipulatorTest::countsShares()
+{
+    ZtKernelData *kernel = ZtKernelData::getInstance();
+    const auto calibration = std::make_shared<ZtCalibration>();
+    const ZtDrawnType &type = *ZtDrawnType::find(ZtDrawnType::Counter);
+    kernel->registerType(type.id, std::make_unique<ZtDrawnManipulator>(type, calibration),
+                         std::make_unique<ZtKernelObjectDataDescr>(type.id, QLatin1String(type.key)));
+    kernel->addObject(type.id, std::make_unique<ZtDrawnObjectData>(polygon({{0, 0}})));
+    kernel->addObject(type.id, std::make_unique<ZtDrawnObjectData>(polygon({{0, 0}, {1, 1}, {2, 2}})));
+    kernel->addObject(type.id, std::make_unique<ZtDrawnObjectData>());
+    const ZtGsManipulator *manipulator = kernel->getGsManipulator(type.id);
+    QStringList texts;
+    for (int id = 1; id <= 3; ++id)
+        texts.append(manipulator->valueText(QStringLiteral("Share"), kernel->object(type.id, id)));
+    kernel->unregisterType(type.id);
+    QCOMPARE(texts, (QStringList{QStringLiteral("25.000 %"), QStringLiteral("75.000 %"),
+                                 QStringLiteral("0.000 %")}));
+}
+
+void ZtDrawnManipulatorTest::refusesPoints_data()
+{
+    QTest::addColumn<int>("type");
+    QTest::addColumn<QPolygonF>("points");
+    const double nan = std::numeric_limits<double>::quiet_NaN();
+    const double infinity = std::numeric_limits<double>::infinity();
+    QTest::newRow("no points") << 66653 << QPolygonF();
+    QTest::newRow("too few") << 66656 << polygon({{0, 0}, {1, 1}});
+    QTest::newRow("too many") << 66651 << polygon({{0, 0}, {1, 1}, {2, 2}});
+    QTest::newRow("no number") << 66653 << polygon({{0, 0}, {nan, 1}});
+    QTest::newRow("infinite") << 66755 << polygon({{0, -infinity}, {1, 1}});
+    QTest::newRow("far outside of any picture") << 66741 << polygon({{0, 0}, {0, 1.1e9}});
+}
+
+void ZtDrawnManipulatorTest::refusesPoints()
+{
+    QFETCH(int, type);
+    QFETCH(QPolygonF, points);
+    QVERIFY(!ZtDrawnType::find(type)->acceptsPoints(points));
+    const Measured measured(type, 1.0);
+    const ZtDrawnObjectData object(points);
+    for (const QString &name : measured.manipulator.getValueNames()) {
+        int kind = -1;
+        QVERIFY(!measured.manipulator.value(name, &object, kind).isValid());
+        QCOMPARE(kind, int(ZtGsManipulator::NoKind));
+        QCOMPARE(measured.manipulator.valueText(name, &object), QString());
+    }
+}
+
+void ZtDrawnManipulatorTest::knowsNoOtherValues()
+{
+    const Measured measured(ZtDrawnType::Line, 1.0);
+    const ZtDrawnObjectData object(polygon({{0, 0}, {1, 1}}));
+    int kind = -1;
+    QVERIFY(!measured.manipulator.value(QStringLiteral("Weight"), &object, kind).isValid());
+    QCOMPARE(kind, 0);
+    QCOMPARE(measured.manipulator.valueText(QStringLiteral("Weight"), &object), QString());
+    QVERIFY(!measured.manipulator.value(QStringLiteral("Length"), nullptr, kind).isValid());
+    QCOMPARE(ZtDrawnType::find(1), static_cast<const ZtDrawnType *>(nullptr));
+}
+
+void ZtDrawnManipulatorTest::drawsVisibly_data()
+{
+    QTest::addColumn<int>("type");
+    for (const ZtDrawnType &type : ZtDrawnType::all())
+        QTest::newRow(type.key) << type.id;
+}
+
+void ZtDrawnManipulatorTest::drawsVisibly()
+{
+    QFETCH(int, type);
+    const QPolygonF points = samplePoints(*ZtDrawnType::find(type));
+    const QString text = QStringLiteral("Note");
+    const Drawing onBlack(type, points, Qt::black, 1.0, text);
+    const Drawing onWhite(type, points, Qt::white, 1.0, text);
+    const Drawing zoomed(type, points, Qt::black, 0.5, text);
+    QVERIFY2(onBlack.bright > 20, qPrintable(QString::number(onBlack.bright)));
+    QVERIFY2(onWhite.dark > 20, qPrintable(QString::number(onWhite.dark)));
+    QVERIFY2(zoomed.bright > 20, qPrintable(QString::number(zoomed.bright)));
+    QVERIFY(onBlack.leavesPainterAlone && zoomed.leavesPainterAlone);
+}
+
+void ZtDrawnManipulatorTest::drawsNothingItCannotMeasure()
+{
+    const double nan = std::numeric_limits<double>::quiet_NaN();
+    QCOMPARE(Drawing(ZtDrawnType::Line, polygon({{30, 30}}), Qt::black).bright, 0);
+    QCOMPARE(Drawing(ZtDrawnType::Line, polygon({{30, 30}, {nan, 30}}), Qt::black).bright, 0);
+    QCOMPARE(Drawing(ZtDrawnType::Counter, QPolygonF(), Qt::black).bright, 0);
+    QCOMPARE(Drawing(ZtDrawnType::TextNote, polygon({{30, 30}}), Qt::black).bright, 0);
+    QImage image(10, 10, QImage::Format_RGB32);
+    QPainter painter(&image);
+    Measured(ZtDrawnType::Line).manipulator.draw(&painter, 1, nullptr);
+}
+
+void ZtDrawnManipulatorTest::keepsLabelsOnThePicture()
+{
+    const QString text = QStringLiteral("WWWW");
+    const int inside = Drawing(ZtDrawnType::TextNote, polygon({{40, 60}}), Qt::black, 1.0, text).bright;
+    const QPolygonF corners = polygon({{0, 0}, {119, 0}, {0, 119}, {119, 119}});
+    for (const QPointF &corner : corners) {
+        const int atCorner = Drawing(ZtDrawnType::TextNote, polygon({corner}), Qt::black, 1.0, text).bright;
+        QVERIFY2(atCorner > inside * 3 / 4, qPrintable(QStringLiteral("%1 of %2").arg(atCorner).arg(inside)));
+    }
+    QCOMPARE(Drawing(ZtDrawnType::TextNote, polygon({{500, 500}}), Qt::black, 1.0, text).bright, 0);
+}
+
+void ZtDrawnManipulatorTest::namesObjects()
+{
+    Measured measured(ZtDrawnType::Circle);
+    QCOMPARE(measured.manipulator.getObjectName(7), QStringLiteral("Circle 7"));
+    measured.manipulator.setObjectName(7, QStringLiteral("Coin"));
+    measured.manipulator.retranslate();
+    QCOMPARE(measured.manipulator.getObjectName(7), QStringLiteral("Coin"));
+    QCOMPARE(measured.manipulator.getValueNames().size(), 2);
+}
+
+STATREPORT_TEST_MAIN(ZtDrawnManipulatorTest)
+#include "ZtDrawnManipulatorTest.moc"

@@ -1,0 +1,181 @@
+// SPDX-License-Identifier: MIT
+#include "support/StatReportTest.h"
+
+#include "measuring/ZtFault.h"
+#include "measuring/ZtStillImageSource.h"
+
+#include <QDir>
+#include <QFile>
+#include <QImage>
+#include <QImageReader>
+#include <QImageWriter>
+
+#include <cmath>
+
+#include <unistd.h>
+
+namespace {
+
+QString write(const QString &name, const QByteArray &bytes)
+{
+    QFile file(StatReportTest::temporaryPath(name));
+    if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size())
+        qCritical("cannot write %s", qPrintable(file.fileName()));
+    return file.fileName();
+}
+
+QString writePicture(const QString &name, int dotsPerMetreX, int dotsPerMetreY, const char *format = "png")
+{
+    QImage image(13, 7, QImage::Format_RGB32);
+    image.fill(Qt::red);
+    if (dotsPerMetreX > 0) {
+        image.setDotsPerMeterX(dotsPerMetreX);
+        image.setDotsPerMeterY(dotsPerMetreY);
+    }
+    const QString path = StatReportTest::temporaryPath(name);
+    if (!image.save(path, format, 100))
+        qCritical("cannot save %s", qPrintable(path));
+    return path;
+}
+
+bool isSupported(const QByteArray &format)
+{
+    return QImageReader::supportedImageFormats().contains(format) &&
+           QImageWriter::supportedImageFormats().contains(format);
+}
+
+} // namespace
+
+class ZtStillImageSourceTest : public StatReportTest
+{
+    Q_OBJECT
+private slots:
+    void loadsPictures_data();
+    void loadsPictures();
+    void readsTheContentNotTheSuffix();
+    void offersThePixelSize_data();
+    void offersThePixelSize();
+    void refuses_data();
+    void refuses();
+    void refusesUnreadableFiles();
+    void refusesHugePicturesBeforeDecoding();
+};
+
+void ZtStillImageSourceTest::loadsPictures_data()
+{
+    QTest::addColumn<QByteArray>("format");
+    QTest::newRow("PNG") << QByteArray("png");
+    QTest::newRow("JPEG") << QByteArray("jpg");
+    QTest::newRow("TIFF") << QByteArray("tiff");
+    QTest::newRow("BMP") << QByteArray("bmp");
+}
+
+void ZtStillImageSourceTest::loadsPictures()
+{
+    QFETCH(QByteArray, format);
+    if (!isSupported(format))
+        QSKIP("Qt has no plug-in for this format here");
+    const QString name = QStringLiteral("picture.") + QString::fromLatin1(format);
+    const QString path = writePicture(name, 1000000, 1000000, format.constData());
+    ZtFault fault;
+    const auto source = ZtStillImageSource::load(path, &fault);
+    QVERIFY2(source, qPrintable(fault.text()));
+    QVERIFY(fault.isNull());
+    QCOMPARE(source->frame().size(), QSize(13, 7));
+    QVERIFY(qRed(source->frame().pixel(6, 3)) > 250);
+    QCOMPARE(source->displayName(), name);
+    QCOMPARE(source->path(), path);
+}
+
+void ZtStillImageSourceTest::readsTheContentNotTheSuffix()
+{
+    const QString path = writePicture(QStringLiteral("a picture.jpg"), 0, 0, "png");
+    ZtFault fault;
+    QVERIFY(ZtStillImageSource::load(path, &fault));
+}
+
+void ZtStillImageSourceTest::offersThePixelSize_data()
+{
+    QTest::addColumn<int>("x");
+    QTest::addColumn<int>("y");
+    QTest::addColumn<double>("micrometres");
+    QTest::newRow("none stated") << 0 << 0 << 0.0;
+    QTest::newRow("one micrometre") << 1000000 << 1000000 << 1.0;
+    QTest::newRow("quarter of a micrometre") << 4000000 << 4000000 << 0.25;
+    QTest::newRow("300 dots per inch") << 11811 << 11811 << 1e6 / 11811;
+    QTest::newRow("72 dots per inch") << 2835 << 2835 << 0.0;
+    QTest::newRow("72 dots per inch, cut off") << 2834 << 2834 << 0.0;
+    QTest::newRow("96 dots per inch") << 3780 << 3780 << 0.0;
+    QTest::newRow("96 dots per inch, cut off") << 3779 << 3779 << 0.0;
+    QTest::newRow("144 dots per inch") << 5669 << 5669 << 0.0;
+    QTest::newRow("oblong pixels") << 1000000 << 500000 << 0.0;
+    QTest::newRow("rounded differently") << 100000 << 100001 << 10.0;
+}
+
+void ZtStillImageSourceTest::offersThePixelSize()
+{
+    QFETCH(int, x);
+    QFETCH(int, y);
+    QFETCH(double, micrometres);
+    ZtFault fault;
+    const auto source = ZtStillImageSource::load(writePicture(QStringLiteral("size.png"), x, y), &fault);
+    QVERIFY(source);
+    QCOMPARE(source->offeredCalibration().isCalibrated(), micrometres > 0.0);
+    QVERIFY(std::abs(source->offeredCalibration().micrometresPerPixel() - micrometres) < 1e-9);
+}
+
+void ZtStillImageSourceTest::refuses_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::addColumn<QString>("message");
+    QTest::newRow("missing") << temporaryPath(QStringLiteral("missing.png")) << "The picture does not exist";
+    QTest::newRow("no path") << ""
+                             << "The picture does not exist";
+    QTest::newRow("folder") << QFileInfo(temporaryPath(QStringLiteral("x"))).path()
+                            << "This is a folder, not a picture";
+    QTest::newRow("empty") << write(QStringLiteral("empty.png"), QByteArray())
+                           << "The picture cannot be decoded";
+    QTest::newRow("text") << write(QStringLiteral("text.png"), "This is no picture")
+                          << "The picture cannot be decoded";
+    const QString cut = writePicture(QStringLiteral("cut.png"), 0, 0);
+    QFile file(cut);
+    file.resize(20);
+    QTest::newRow("cut off in the header") << cut << "The picture cannot be decoded";
+}
+
+void ZtStillImageSourceTest::refuses()
+{
+    QFETCH(QString, path);
+    QFETCH(QString, message);
+    ZtFault fault;
+    QVERIFY(!ZtStillImageSource::load(path, &fault));
+    QCOMPARE(fault.file, path);
+    QVERIFY2(fault.message.startsWith(message), qPrintable(fault.text()));
+}
+
+void ZtStillImageSourceTest::refusesUnreadableFiles()
+{
+    if (geteuid() == 0)
+        QSKIP("the superuser reads every file");
+    const QString path = writePicture(QStringLiteral("closed.png"), 0, 0);
+    QFile::setPermissions(path, QFileDevice::Permissions());
+    ZtFault fault;
+    QVERIFY(!ZtStillImageSource::load(path, &fault));
+    QCOMPARE(fault.message, QStringLiteral("The picture cannot be read"));
+}
+
+void ZtStillImageSourceTest::refusesHugePicturesBeforeDecoding()
+{
+    ZtFault fault;
+    const QString path = writePicture(QStringLiteral("large.png"), 0, 0);
+    QVERIFY(ZtStillImageSource::load(path, &fault, 13 * 7));
+    QVERIFY(!ZtStillImageSource::load(path, &fault, 13 * 7 - 1));
+    QCOMPARE(fault.message, QStringLiteral("The picture has 13 x 7 pixels, which is too many"));
+    // The header alone, which announces more pixels than there is memory for.
+    const QString huge = write(QStringLiteral("huge.pgm"), "P5 30000 30000 255\n");
+    QVERIFY(!ZtStillImageSource::load(huge, &fault));
+    QCOMPARE(fault.message, QStringLiteral("The picture has 30000 x 30000 pixels, which is too many"));
+}
+
+STATREPORT_TEST_MAIN(ZtStillImageSourceTest)
+#include "ZtStillImageSourceTest.moc"
