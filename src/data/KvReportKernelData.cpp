@@ -33,6 +33,15 @@ const ValueClassTable &valueClassTable()
     return table;
 }
 
+// Names seldom change from one rebuild to the next. Where the very same text is there already, counting its
+// users up and down again would take longer than the comparison.
+void assignText(QString &target, const QString &text)
+{
+    const QString &current = target;
+    if (current.constData() != text.constData() || current.size() != text.size())
+        target = text;
+}
+
 // A timer may be replaced inside its own timeout, so it must outlive the call that releases it.
 QSharedPointer<QTimer> makeTimer()
 {
@@ -244,15 +253,19 @@ int KvReportKernelData::fillObjectRecords(const ZtGsManipulator &manipulator, co
         KvMeasuredValue &record = records[count];
         record.valueText = std::move(text);
         record.measureKind = 0;
-        const QVariant value = manipulator.value(name, object, record.measureKind);
-        record.value = value;
+        record.value = manipulator.value(name, object, record.measureKind);
         record.valueClass = classes.at(i);
-        record.valueName = name;
+        assignText(record.valueName, name);
         record.objectType = manipulator.objectTypeId();
         record.objectId = id;
         // The object's own texts are the same for all its values: asked for with the first one recorded.
-        record.objectName = count == 0 ? manipulator.getObjectName(id) : records->objectName;
-        record.objectTypeName = count == 0 ? manipulator.objectTypeName(id) : records->objectTypeName;
+        if (count == 0) {
+            assignText(record.objectName, manipulator.getObjectName(id));
+            assignText(record.objectTypeName, manipulator.objectTypeName(id));
+        } else {
+            assignText(record.objectName, records->objectName);
+            assignText(record.objectTypeName, records->objectTypeName);
+        }
         ++count;
     }
     return count;
