@@ -4,6 +4,7 @@
 #include "measuring/ZtFault.h"
 
 #include <QDir>
+#include <QFile>
 #include <QFileInfo>
 #include <QImageReader>
 
@@ -26,7 +27,9 @@ bool isUsableFile(const QFileInfo &file, ZtFault *fault)
         return fail(ZtStillImageSource::tr("The picture does not exist"), fault);
     if (file.isDir())
         return fail(ZtStillImageSource::tr("This is a folder, not a picture"), fault);
-    return file.isReadable() || fail(ZtStillImageSource::tr("The picture cannot be read"), fault);
+    // Opened, not asked: permissions on paper say little about network folders and changed users.
+    return QFile(file.filePath()).open(QIODevice::ReadOnly) ||
+           fail(ZtStillImageSource::tr("The picture cannot be read"), fault);
 }
 
 bool isUsableSize(const QSize &size, qint64 pixelLimit, ZtFault *fault)
