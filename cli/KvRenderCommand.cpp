@@ -8,6 +8,7 @@
 #include "KvTemplateCheck.h"
 #include "KvTerminalProgress.h"
 
+#include "common/ZtAppStatus.h"
 #include "data/KvReportKernelData.h"
 #include "gui/ZtFontCoverage.h"
 #include "report/KvReportNode.h"
@@ -105,8 +106,10 @@ int KvRenderCommand::run()
     KvTemplateModel model(nullptr, &host.kernelData());
     model.setFactories(&host.blocks());
     model.setUserMessages(&messages);
+    const int entriesBefore = ZtStatusLog::getInstance()->entries().size();
     if (!model.load(templateFile.path()))
         return 1;
+    noteWarnings(entriesBefore);
     model.beginLiveUpdates();
     const auto endLive = qScopeGuard([&model]() { model.endLiveUpdates(); });
     noteMissingGlyphs(host, model);
@@ -123,6 +126,15 @@ bool KvRenderCommand::checkTemplate(KvCliHost &host, const QString &path, const 
     for (const QString &warning : check.warnings())
         m_output.note(displayName + QStringLiteral(": ") + warning);
     return true;
+}
+
+void KvRenderCommand::noteWarnings(int firstEntry) const
+{
+    const QVector<ZtStatusEntry> &entries = ZtStatusLog::getInstance()->entries();
+    for (int i = firstEntry; i < entries.size(); ++i) {
+        if (entries.at(i).category >= ZtAppStatus::Warning)
+            m_output.note(entries.at(i).message);
+    }
 }
 
 void KvRenderCommand::noteMissingGlyphs(KvCliHost &host, KvTemplateModel &model) const

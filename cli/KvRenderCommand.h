@@ -22,6 +22,8 @@ private:
     bool printToFile(KvTemplateModel &model, const QString &path) const;
     /** For targets that cannot be replaced: standard output and devices. */
     bool printThroughCopy(KvTemplateModel &model) const;
+    /** Notes what was logged as a warning or an error since the log had this many entries. */
+    void noteWarnings(int firstEntry) const;
     void noteMissingGlyphs(KvCliHost &host, KvTemplateModel &model) const;
     bool failToWrite(const QString &path, const QString &reason) const;
 

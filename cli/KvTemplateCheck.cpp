@@ -46,17 +46,28 @@ QJsonObject defaultConfig(KvBaseEditorNodeFactory &factory)
     return object;
 }
 
-// Why a configuration was refused: the first key that is missing or of another type than the block writes it
-// with.
-QString refusalOf(const QJsonObject &config, const QJsonObject &defaults)
+bool accepts(KvBaseEditorNodeFactory &factory, const QJsonObject &config)
 {
+    const std::unique_ptr<KvBaseEditorNodeCfg> cfg(factory.createConfig(nullptr));
+    return cfg->fromJson(config);
+}
+
+// Why a configuration was refused: the first key that the block would refuse even among its own defaults.
+QString refusalOf(const QJsonObject &config, KvBaseEditorNodeFactory &factory)
+{
+    const QJsonObject defaults = defaultConfig(factory);
     for (auto it = defaults.constBegin(); it != defaults.constEnd(); ++it) {
         const QJsonValue value = config.value(it.key());
+        QJsonObject probe = defaults;
+        probe[it.key()] = value; // takes the key away where the value is undefined
+        if (accepts(factory, probe))
+            continue;
         if (value.isUndefined())
             return QStringLiteral("\"%1\" is missing").arg(it.key());
         if (value.type() != it.value().type())
             return QStringLiteral("\"%1\" is %2, not %3")
                 .arg(it.key(), typeText(value), typeText(it.value()));
+        return QStringLiteral("\"%1\" has a value that the block refuses").arg(it.key());
     }
     return QStringLiteral("the block refuses its settings");
 }
@@ -198,7 +209,7 @@ bool KvTemplateCheck::checkConfig(const QString &place, const QString &typeName,
     const QJsonObject defaults = defaultConfig(factory);
     const std::unique_ptr<KvBaseEditorNodeCfg> cfg(factory.createConfig(nullptr));
     if (!cfg->fromJson(object))
-        return fail(place, refusalOf(object, defaults));
+        return fail(place, refusalOf(object, factory));
     m_contents.append(QStringLiteral("block \"%1\"").arg(typeName));
     for (auto it = object.constBegin(); it != object.constEnd(); ++it) {
         const QJsonValue expected = defaults.value(it.key());

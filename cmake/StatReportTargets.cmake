@@ -44,6 +44,47 @@ function(statreport_layer name)
   statreport_common_flags(${name})
 endfunction()
 
+# The plug-in module that a host loads at run time, in the folder "plugins" of the build.
+function(statreport_plugin name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;LIBS" ${ARGN})
+  add_library(${name} MODULE ${ARG_SOURCES})
+  target_include_directories(${name} PRIVATE ${PROJECT_SOURCE_DIR}/src)
+  target_link_libraries(${name} PRIVATE ${ARG_LIBS})
+  set_target_properties(${name} PROPERTIES
+    PREFIX ""
+    LIBRARY_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/plugins)
+  if(UNIX AND NOT APPLE)
+    # Visibility alone leaves out the inline code of Qt and of the standard library.
+    set(exports ${PROJECT_SOURCE_DIR}/cmake/plugin-exports.map)
+    target_link_options(${name} PRIVATE LINKER:--version-script=${exports})
+    set_target_properties(${name} PROPERTIES LINK_DEPENDS ${exports})
+  endif()
+  statreport_common_flags(${name})
+endfunction()
+
+# The languages of the user interface, by the names that the setting "GEN_Language" takes.
+set(STATREPORT_LANGUAGES English German French Spanish Italian Russian Japanese Korean Arabic ChineseSimple
+    ChineseTraditional Slovakian)
+
+# Compiles a target's translations into its resources: FOLDER/<language>.ts is found as ":/PREFIX/<language>.qm".
+function(statreport_translations name)
+  cmake_parse_arguments(ARG "" "PREFIX;FOLDER" "" ${ARGN})
+  set(output ${CMAKE_CURRENT_BINARY_DIR}/translations/${ARG_PREFIX})
+  set(ts_files "")
+  set(entries "")
+  foreach(language ${STATREPORT_LANGUAGES})
+    list(APPEND ts_files ${CMAKE_CURRENT_SOURCE_DIR}/${ARG_FOLDER}/${language}.ts)
+    string(APPEND entries "    <file>${language}.qm</file>\n")
+  endforeach()
+  set_source_files_properties(${ts_files} PROPERTIES OUTPUT_LOCATION ${output})
+  qt5_add_translation(qm_files ${ts_files} OPTIONS -silent)
+  file(CONFIGURE OUTPUT ${output}/${ARG_PREFIX}.qrc @ONLY
+    CONTENT "<RCC>\n  <qresource prefix=\"/${ARG_PREFIX}\">\n${entries}  </qresource>\n</RCC>\n")
+  # Not left to AUTORCC, which knows nothing of files that the build makes.
+  qt5_add_resources(resources ${output}/${ARG_PREFIX}.qrc)
+  target_sources(${name} PRIVATE ${resources})
+endfunction()
+
 function(statreport_executable name)
   cmake_parse_arguments(ARG "" "" "SOURCES;LIBS;PCH" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
@@ -52,6 +93,28 @@ function(statreport_executable name)
     target_precompile_headers(${name} PRIVATE ${ARG_PCH})
   endif()
   statreport_common_flags(${name})
+endfunction()
+
+# The meta-object code and resources of a test, made by one call of moc or rcc for each file that needs it: CMake's
+# own automatic step costs more per program than compiling it.
+function(statreport_test_generated result name)
+  set(generated)
+  foreach(source ${ARGN})
+    get_filename_component(base ${source} NAME_WE)
+    if(source MATCHES "\\.qrc$")
+      qt5_add_resources(generated ${source})
+      continue()
+    endif()
+    file(STRINGS ${source} objects REGEX "Q_OBJECT")
+    if(objects AND source MATCHES "\\.cpp$")
+      qt5_generate_moc(${source} ${CMAKE_CURRENT_BINARY_DIR}/${name}/${base}.moc TARGET ${name})
+      list(APPEND generated ${CMAKE_CURRENT_BINARY_DIR}/${name}/${base}.moc)
+    elseif(objects)
+      qt5_generate_moc(${source} ${CMAKE_CURRENT_BINARY_DIR}/${name}/moc_${base}.cpp TARGET ${name})
+      list(APPEND generated ${CMAKE_CURRENT_BINARY_DIR}/${name}/moc_${base}.cpp)
+    endif()
+  endforeach()
+  set(${result} ${generated} PARENT_SCOPE)
 endfunction()
 
 # A test program named after the class it tests; runs off-screen, from a folder of its own, in any order.
@@ -63,9 +126,13 @@ function(statreport_test name)
   if(NOT ARG_TIMEOUT)
     set(ARG_TIMEOUT 120)
   endif()
-  add_executable(${name} ${ARG_SOURCES})
+  statreport_test_generated(generated ${name} ${ARG_SOURCES})
+  list(FILTER ARG_SOURCES EXCLUDE REGEX "\\.qrc$")
+  add_executable(${name} ${ARG_SOURCES} ${generated})
+  target_include_directories(${name} PRIVATE ${CMAKE_CURRENT_BINARY_DIR}/${name})
   target_link_libraries(${name} PRIVATE statreport_testsupport ${ARG_LIBS})
-  set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/tests)
+  set_target_properties(${name} PROPERTIES
+    RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/tests AUTOMOC OFF AUTOUIC OFF AUTORCC OFF)
   target_precompile_headers(${name} REUSE_FROM statreport_testpch)
   statreport_common_flags(${name})
   add_test(NAME ${name} COMMAND ${name})

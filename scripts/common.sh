@@ -5,8 +5,8 @@ say() { printf '==> %s\n' "$*"; }
 
 # What a fresh Debian 12 lacks to build; each script adds what it needs beside it.
 BUILD_PACKAGES="g++ cmake ninja-build ccache qtbase5-dev libqt5svg5-dev qt5-image-formats-plugins \
-fonts-open-sans fonts-dejavu-core fonts-droid-fallback"
-TEST_PACKAGES="poppler-utils qpdf"
+qttools5-dev qttools5-dev-tools fonts-open-sans fonts-dejavu-core fonts-droid-fallback"
+TEST_PACKAGES="poppler-utils qpdf xvfb xauth xdotool"
 BENCH_PACKAGES="libbenchmark-dev"
 
 is_installed() {

@@ -170,6 +170,11 @@ def measurements_table(**settings):
     return {"name": "Measurement table", "config": {**config, **settings}}
 
 
+def camera_image(width_percent, render_measurements):
+    return {"name": "Camera Image View", "config": {"alignment": "132", "widthPercent": str(width_percent),
+                                                    "rotationAngles": "0", "renderMeasurements": render_measurements}}
+
+
 def template(nodes, header="", footer="", page_numbers=True):
     return {"config": {"pageWidth": 952, "marginWidth": 0.12}, "header": section(header, bool(header)),
             "footer": section(footer, bool(footer)), "pageNumbering": section("", page_numbers), "nodes": nodes}
@@ -192,7 +197,7 @@ def write_templates():
                   "distances between neighbouring holes, the rounding of the corner holes, the hole field as a whole, "
                   "and the diameter and area of each hole."))
     templates = {
-        "demo": template([title, measurements_table()], head, foot),
+        "demo": template([title, camera_image(80, True), measurements_table()], head, foot),
         "all-values": template([text_block(paragraph("Measured values", "font-size:20pt; font-weight:600;")),
                                 measurements_table()], "", foot),
         "by-value": template([measurements_table(orderColumn="Value", orderAscending=False,

@@ -149,6 +149,22 @@ QPalette QtAdvancedStylesheet::palette() const
     return palette;
 }
 
+namespace {
+
+/// Setting a style polishes and lays out every widget anew, which a change of the theme does not need.
+void setStyleOnce(QApplication *application)
+{
+    const char property[] = "acssStyle";
+    if (application->property(property).toBool())
+        return;
+    // A style sheet wraps the style, so the style comes first.
+    application->setStyleSheet(QString());
+    QApplication::setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
+    application->setProperty(property, true);
+}
+
+} // namespace
+
 void QtAdvancedStylesheet::applyTo(QApplication *application) const
 {
     if (application == nullptr)
@@ -157,9 +173,7 @@ void QtAdvancedStylesheet::applyTo(QApplication *application) const
     substituteFonts();
     QFont font(bodyFont);
     font.setPixelSize(bodyPixelSize);
-    // A style sheet wraps the style, so the style comes first.
-    application->setStyleSheet(QString());
-    QApplication::setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
+    setStyleOnce(application);
     QApplication::setPalette(palette());
     QApplication::setFont(font);
     application->setStyleSheet(styleSheet());

@@ -9,6 +9,7 @@
  */
 class ZtClassIndexTableReader : public ZtTableReader
 {
+    Q_DECLARE_TR_FUNCTIONS(ZtTableImport)
 public:
     using ZtTableReader::ZtTableReader;
 

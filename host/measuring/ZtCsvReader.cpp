@@ -7,10 +7,11 @@
 
 namespace {
 
-QString tr(const char *text)
+/// Gives the functions of this file a tr() whose context can be seen by the tool that collects the texts.
+class Text
 {
-    return QCoreApplication::translate("ZtCsvReader", text);
-}
+    Q_DECLARE_TR_FUNCTIONS(ZtCsvReader)
+};
 
 bool isBlank(char c)
 {
@@ -123,7 +124,7 @@ bool ZtCsvReader::readQuotedField(ZtCsvRow *row)
         quote = m_text.find('"', quote + 2);
     }
     if (quote == std::string_view::npos)
-        return fail(firstLine, row->fields.size() + 1, tr("A quoted text does not end"));
+        return fail(firstLine, row->fields.size() + 1, Text::tr("A quoted text does not end"));
     const std::string_view inside = m_text.substr(start, quote - start);
     m_line += lineBreaks(inside);
     if (hasDoubled)
@@ -132,7 +133,7 @@ bool ZtCsvReader::readQuotedField(ZtCsvRow *row)
     m_position = quote + 1;
     skipBlanks();
     if (!isFieldEnd())
-        return fail(m_line, row->fields.size(), tr("There is text after a closing quote"));
+        return fail(m_line, row->fields.size(), Text::tr("There is text after a closing quote"));
     return true;
 }
 

@@ -7,7 +7,7 @@
 
 namespace {
 
-// All lengths in device pixels.
+// All lengths in device-independent pixels.
 constexpr double haloWidth = 4.0;
 constexpr double lineWidth = 1.6;
 constexpr double markerArm = 5.0;
@@ -19,11 +19,10 @@ const QColor haloColor(20, 20, 20, 190);
 const QColor lineColor(255, 214, 64);
 const QColor labelColor(255, 255, 255);
 
-QPen cosmeticPen(const QColor &color, double width)
+// Not cosmetic, as such pens are thin on screens with more than one pixel per device-independent one.
+QPen linePen(const QColor &color, double width)
 {
-    QPen pen(color, width, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin);
-    pen.setCosmetic(true);
-    return pen;
+    return QPen(color, width, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin);
 }
 
 // The nearest place where a box can be seen; its upper left corner where it does not fit.
@@ -62,9 +61,9 @@ void ZtDrawnObjectPainter::strokeOnDevice(const QPainterPath &path) const
     m_painter->setWorldTransform(QTransform());
     m_painter->setRenderHint(QPainter::Antialiasing);
     m_painter->setBrush(Qt::NoBrush);
-    m_painter->setPen(cosmeticPen(haloColor, haloWidth));
+    m_painter->setPen(linePen(haloColor, haloWidth));
     m_painter->drawPath(path);
-    m_painter->setPen(cosmeticPen(lineColor, lineWidth));
+    m_painter->setPen(linePen(lineColor, lineWidth));
     m_painter->drawPath(path);
     m_painter->restore();
 }

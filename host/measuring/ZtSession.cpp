@@ -14,10 +14,11 @@
 
 namespace {
 
-QString tr(const char *text)
+/// Gives the functions of this file a tr() whose context can be seen by the tool that collects the texts.
+class Text
 {
-    return QCoreApplication::translate("ZtSession", text);
-}
+    Q_DECLARE_TR_FUNCTIONS(ZtSession)
+};
 
 bool fail(const QString &message, ZtFault *fault)
 {
@@ -29,26 +30,26 @@ bool failParse(const QByteArray &bytes, const QJsonParseError &error, ZtFault *f
 {
     fault->line = static_cast<int>(bytes.left(error.offset).count('\n')) + 1;
     if (error.error == QJsonParseError::DeepNesting)
-        return fail(tr("The file is nested too deeply"), fault);
-    return fail(tr("The file is not valid JSON (%1)").arg(error.errorString()), fault);
+        return fail(Text::tr("The file is nested too deeply"), fault);
+    return fail(Text::tr("The file is not valid JSON (%1)").arg(error.errorString()), fault);
 }
 
 bool readBytes(const QString &path, QByteArray *bytes, ZtFault *fault)
 {
     QFile file(path);
     if (!QFileInfo::exists(path))
-        return fail(tr("The file does not exist"), fault);
+        return fail(Text::tr("The file does not exist"), fault);
     if (QFileInfo(path).isDir())
-        return fail(tr("This is a folder, not a file"), fault);
+        return fail(Text::tr("This is a folder, not a file"), fault);
     if (!file.open(QIODevice::ReadOnly))
-        return fail(tr("The file cannot be read (%1)").arg(file.errorString()), fault);
+        return fail(Text::tr("The file cannot be read (%1)").arg(file.errorString()), fault);
     if (file.size() > ZtSession::maximumBytes)
-        return fail(tr("The file is too large for a session"), fault);
+        return fail(Text::tr("The file is too large for a session"), fault);
     *bytes = ztReadAtMost(&file, ZtSession::maximumBytes + 1);
     if (bytes->size() > ZtSession::maximumBytes)
-        return fail(tr("The file is too large for a session"), fault);
+        return fail(Text::tr("The file is too large for a session"), fault);
     if (file.error() != QFileDevice::NoError)
-        return fail(tr("The file cannot be read (%1)").arg(file.errorString()), fault);
+        return fail(Text::tr("The file cannot be read (%1)").arg(file.errorString()), fault);
     return true;
 }
 
@@ -67,13 +68,13 @@ bool ZtSession::parse(const QByteArray &bytes, const QString &path, ZtSession *s
     *fault = ZtFault();
     fault->file = path;
     if (bytes.trimmed().isEmpty())
-        return fail(tr("The file is empty"), fault);
+        return fail(Text::tr("The file is empty"), fault);
     QJsonParseError error;
     const QJsonDocument document = QJsonDocument::fromJson(bytes, &error);
     if (error.error != QJsonParseError::NoError)
         return failParse(bytes, error, fault);
     if (!document.isObject())
-        return fail(tr("The file is not a session"), fault);
+        return fail(Text::tr("The file is not a session"), fault);
     ZtSessionReader reader(path);
     if (reader.read(document.object(), session))
         return true;
@@ -95,5 +96,5 @@ bool ZtSession::save(const QString &path, ZtFault *fault) const
     const QByteArray bytes = toJson(path);
     if (file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() && file.commit())
         return true;
-    return fail(tr("The file cannot be written (%1)").arg(file.errorString()), fault);
+    return fail(Text::tr("The file cannot be written (%1)").arg(file.errorString()), fault);
 }

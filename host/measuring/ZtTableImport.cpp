@@ -21,10 +21,11 @@
 
 namespace {
 
-QString tr(const char *text)
+/// Gives the functions of this file a tr() whose context can be seen by the tool that collects the texts.
+class Text
 {
-    return QCoreApplication::translate("ZtTableImport", text);
-}
+    Q_DECLARE_TR_FUNCTIONS(ZtTableImport)
+};
 
 bool fail(const QString &message, ZtFault *fault)
 {
@@ -35,7 +36,7 @@ bool fail(const QString &message, ZtFault *fault)
 bool failTooLarge(qint64 maximumBytes, ZtFault *fault)
 {
     const double megabytes = static_cast<double>(maximumBytes) / (1024.0 * 1024.0);
-    return fail(tr("The file is larger than %1 MB").arg(megabytes), fault);
+    return fail(Text::tr("The file is larger than %1 MB").arg(megabytes), fault);
 }
 
 // What one QByteArray can hold, with room for its text in another encoding.
@@ -72,11 +73,11 @@ bool readText(std::string_view text, const ZtTableImportOptions &options, ZtImpo
     ZtCsvRow firstRow;
     if (!rows.next(&firstRow)) {
         *fault = rows.fault();
-        return !fault->isNull() ? false : fail(tr("The file is empty"), fault);
+        return !fault->isNull() ? false : fail(Text::tr("The file is empty"), fault);
     }
     if (!isColumnHeader(firstRow)) {
         fault->line = firstRow.line;
-        return fail(tr("The first line does not name the columns"), fault);
+        return fail(Text::tr("The first line does not name the columns"), fault);
     }
     const bool detected =
         options.decimalMark == ZtTableImportOptions::DetectMark && ZtTableDialect::hasDecimalComma(&rows);
@@ -110,11 +111,11 @@ bool ZtTableImport::readFile(const QString &path, const ZtTableImportOptions &op
     *fault = ZtFault();
     fault->file = path;
     if (!QFileInfo::exists(path))
-        return fail(tr("The file does not exist"), fault);
+        return fail(Text::tr("The file does not exist"), fault);
     if (QFileInfo(path).isDir())
-        return fail(tr("This is a folder, not a file"), fault);
+        return fail(Text::tr("This is a folder, not a file"), fault);
     if (!file.open(QIODevice::ReadOnly))
-        return fail(tr("The file cannot be read (%1)").arg(file.errorString()), fault);
+        return fail(Text::tr("The file cannot be read (%1)").arg(file.errorString()), fault);
     return readDevice(&file, path, options, table, fault);
 }
 
@@ -124,12 +125,12 @@ bool ZtTableImport::readDevice(QIODevice *device, const QString &fileName,
     *fault = ZtFault();
     fault->file = fileName;
     if (!device->isReadable())
-        return fail(tr("The table is not open for reading"), fault);
+        return fail(Text::tr("The table is not open for reading"), fault);
     const qint64 limit = qMin(options.maximumBytes, largestFile);
     const QByteArray bytes = ztReadAtMost(device, limit + 1);
     const auto *file = qobject_cast<QFileDevice *>(device);
     if (file && file->error() != QFileDevice::NoError)
-        return fail(tr("The file cannot be read (%1)").arg(file->errorString()), fault);
+        return fail(Text::tr("The file cannot be read (%1)").arg(file->errorString()), fault);
     if (bytes.size() > limit)
         return failTooLarge(limit, fault);
     return parse(bytes, fileName, options, table, fault);

@@ -10,10 +10,11 @@
 
 namespace {
 
-QString tr(const char *text)
+/// Gives the functions of this file a tr() whose context can be seen by the tool that collects the texts.
+class Text
 {
-    return QCoreApplication::translate("ZtTextDecoder", text);
-}
+    Q_DECLARE_TR_FUNCTIONS(ZtTextDecoder)
+};
 
 // Lines end with LF, CR LF or CR.
 int lineOfByte(const QByteArray &bytes, int position)
@@ -74,7 +75,7 @@ bool fromUtf16(const QByteArray &bytes, QByteArray *utf8, ZtFault *fault)
     // Qt hands single surrogates through; they have no UTF-8 form.
     const bool hasLoneSurrogate = !text.isValidUtf16();
     if (state.invalidChars > 0 || state.remainingChars > 0 || hasLoneSurrogate) {
-        fault->message = tr("The file is not valid UTF-16 text");
+        fault->message = Text::tr("The file is not valid UTF-16 text");
         return false;
     }
     *utf8 = text.toUtf8();
@@ -87,7 +88,7 @@ bool checkUtf8(const QByteArray &bytes, ZtFault *fault)
     if (invalid < 0)
         return true;
     fault->line = lineOfByte(bytes, invalid);
-    fault->message = tr("The text is not valid UTF-8");
+    fault->message = Text::tr("The text is not valid UTF-8");
     return false;
 }
 
@@ -124,7 +125,7 @@ bool ZtTextDecoder::toUtf8(const QByteArray &bytes, QByteArray *utf8, ZtFault *f
     const int nul = utf8->indexOf('\0');
     if (nul >= 0) {
         fault->line = lineOfByte(*utf8, nul);
-        fault->message = tr("The file is not a text file: it holds a NUL character");
+        fault->message = Text::tr("The file is not a text file: it holds a NUL character");
         return false;
     }
     return checkUtf8(*utf8, fault);

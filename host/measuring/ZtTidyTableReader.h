@@ -6,6 +6,7 @@
 /** Reads tables with one value per row: columns for the value and its name, and for type, object and unit. */
 class ZtTidyTableReader : public ZtTableReader
 {
+    Q_DECLARE_TR_FUNCTIONS(ZtTableImport)
 public:
     using ZtTableReader::ZtTableReader;
 

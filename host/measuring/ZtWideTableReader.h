@@ -11,6 +11,7 @@
  */
 class ZtWideTableReader : public ZtTableReader
 {
+    Q_DECLARE_TR_FUNCTIONS(ZtTableImport)
 public:
     using ZtTableReader::ZtTableReader;
 

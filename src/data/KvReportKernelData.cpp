@@ -107,6 +107,14 @@ void KvReportKernelData::setActive(bool active)
     startCameraTimer();
 }
 
+void KvReportKernelData::setCameraImageWithDataWanted(bool wanted)
+{
+    if (wanted)
+        ++m_withDataWishes;
+    else if (m_withDataWishes > 0)
+        --m_withDataWishes;
+}
+
 void KvReportKernelData::connectHost()
 {
     ZtSignalCenter *center = ZtSignalCenter::getInstance();
@@ -121,19 +129,32 @@ void KvReportKernelData::connectHost()
     connect(settings, SIGNAL(signalValuesModified(QStringList, QList<QVariant>)), this,
                              SLOT(slotSettingsModified(QStringList, QList<QVariant>)));
     connect(settings, SIGNAL(signalProfileChanged()), this, SLOT(slotProfileChanged()));
-    m_connectedImage = m_kernelData->kernelImage();
-    if (m_connectedImage) {
-        // Direct: aHandled is a reference that the host reads when the emission returns.
-        connect(m_connectedImage, SIGNAL(signalImageCompleted(FrameData, bool &)), this,
-                                         SLOT(slotImageFragmentReady(FrameData, bool &)),
-                                              Qt::DirectConnection);
-    }
+    connectImage();
 }
 
 void KvReportKernelData::disconnectHost()
 {
     disconnect(ZtSignalCenter::getInstance(), nullptr, this, nullptr);
     disconnect(ZtAppSettings::getInstance(), nullptr, this, nullptr);
+    disconnectImage();
+}
+
+void KvReportKernelData::connectImage()
+{
+    iZTKernelImage *image = m_kernelData->kernelImage();
+    if (!isActive() || image == m_connectedImage)
+        return;
+    disconnectImage();
+    m_connectedImage = image;
+    if (!image)
+        return;
+    // Direct: aHandled is a reference that the host reads when the emission returns.
+    connect(image, SIGNAL(signalImageCompleted(FrameData,bool&)), this,
+                          SLOT(slotImageFragmentReady(FrameData,bool&)), Qt::DirectConnection);
+}
+
+void KvReportKernelData::disconnectImage()
+{
     // Not the kernel's image of now: the host may have installed another one in the meantime.
     if (m_connectedImage)
         disconnect(m_connectedImage, nullptr, this, nullptr);
@@ -328,6 +349,7 @@ void KvReportKernelData::requestCameraImage()
 
 void KvReportKernelData::slotDelayedPrepareCameraImage()
 {
+    connectImage();
     if (hasCameraReceivers())
         requestCameraImage();
 }
@@ -337,7 +359,7 @@ void KvReportKernelData::slotImageFragmentReady(FrameData aFrameData, bool &aHan
     if (aFrameData.image && !aFrameData.image->isNull()) {
         m_cameraImage = QPixmap::fromImage(aFrameData.image->getQImage(QRect()));
         emit signalCameraImageChanged();
-        if (m_withDataWanted) {
+        if (isCameraImageWithDataWanted()) {
             QTransform toFrame;
             toFrame.translate(-aFrameData.rect.left(), -aFrameData.rect.top());
             toFrame.scale(aFrameData.scale, aFrameData.scale);

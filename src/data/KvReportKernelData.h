@@ -45,8 +45,12 @@ public:
     QPixmap cameraImage() const { return m_cameraImage; }
     /** The camera image with the measurement objects drawn on it; made only while it is wanted. */
     QPixmap cameraImageWithData() const { return m_cameraImageWithData; }
-    void setCameraImageWithDataWanted(bool wanted) { m_withDataWanted = wanted; }
-    bool isCameraImageWithDataWanted() const { return m_withDataWanted; }
+    /**
+     * Reference-counted: whoever wants the image with measurements calls it with true, and with false when it
+     * no longer does. A surplus false is ignored.
+     */
+    void setCameraImageWithDataWanted(bool wanted);
+    bool isCameraImageWithDataWanted() const { return m_withDataWishes > 0; }
 
     /** The last read "MeasurementLabelsSignDigits"; 0 (automatic) until the first activation. */
     uint signDigits() const { return m_signDigits; }
@@ -80,6 +84,9 @@ public slots:
 private:
     void connectHost();
     void disconnectHost();
+    /** Receives the frames of the kernel's image, while active; the host may install another at any time. */
+    void connectImage();
+    void disconnectImage();
     void startCameraTimer();
     void stopCameraTimer();
     bool readSignDigits();
@@ -106,6 +113,6 @@ private:
     QPixmap m_cameraImage;
     QPixmap m_cameraImageWithData;
     qint64 m_refreshDelay = 10;
-    bool m_withDataWanted = false;
+    int m_withDataWishes = 0;
     QPointer<iZTKernelImage> m_connectedImage; ///< the one whose frames are received while active
 };

@@ -1,54 +1,35 @@
 // SPDX-License-Identifier: MIT
 #include "editor/KvEditorToolWidget.h"
 
-#include "gui/acss.h"
 #include "templates/KvBaseEditorNodeFactory.h"
 
 #include <QApplication>
 #include <QDrag>
-#include <QHBoxLayout>
-#include <QLabel>
 #include <QMimeData>
 #include <QMouseEvent>
 
 namespace {
-constexpr int kIconExtent = 24;
-constexpr int kIconMode = 6;
-constexpr int kMargin = 4;
-constexpr int kSpacing = 8;
-} // namespace
+constexpr QSize kDotsSize(24, 24);
+}
 
 KvEditorToolWidget::KvEditorToolWidget(KvBaseEditorNodeFactory *factory, QWidget *parent)
-    : QFrame(parent)
+    : KvEditorPaletteRow(parent)
     , m_factory(factory)
-    , m_iconLabel(new QLabel(this))
-    , m_nameLabel(new QLabel(this))
 {
-    auto *dotsLabel = new QLabel(this);
-    const QSize dotsSize(kIconExtent, kIconExtent);
-    dotsLabel->setPixmap(acss::createPixmap(kIconMode, QStringLiteral("Icons/ToolIconDots.svg"), dotsSize));
-    auto *row = new QHBoxLayout(this);
-    row->setContentsMargins(kMargin, kMargin, kMargin, kMargin);
-    row->setSpacing(kSpacing);
-    row->addWidget(m_iconLabel);
-    row->addWidget(m_nameLabel, 1);
-    row->addWidget(dotsLabel);
+    setCursor(Qt::OpenHandCursor);
+    setMark(QStringLiteral("Icons/ToolIconDots.svg"), kDotsSize);
+    retranslate();
 }
 
-QString KvEditorToolWidget::text() const
+void KvEditorToolWidget::retranslate()
 {
-    return m_nameLabel->text();
+    setToolTip(tr("Drag onto the page, or press Enter to append"));
 }
 
-void KvEditorToolWidget::setText(const QString &text)
+void KvEditorToolWidget::activate()
 {
-    m_nameLabel->setText(text);
-    setAccessibleName(text);
-}
-
-void KvEditorToolWidget::setIcon(const QIcon &icon)
-{
-    m_iconLabel->setPixmap(icon.pixmap(kIconExtent, kIconExtent));
+    KvEditorPaletteRow::activate();
+    emit signalToolActivated(m_factory->name());
 }
 
 void KvEditorToolWidget::mousePressEvent(QMouseEvent *event)
@@ -66,11 +47,35 @@ void KvEditorToolWidget::mouseMoveEvent(QMouseEvent *event)
     startDrag();
 }
 
+void KvEditorToolWidget::mouseReleaseEvent(QMouseEvent *event)
+{
+    Q_UNUSED(event)
+    m_isPressed = false;
+}
+
+void KvEditorToolWidget::mouseDoubleClickEvent(QMouseEvent *event)
+{
+    if (event->button() == Qt::LeftButton)
+        activate();
+}
+
 void KvEditorToolWidget::startDrag()
 {
     auto *drag = new QDrag(this);
     drag->setMimeData(m_factory->mimeData());
     drag->setPixmap(m_factory->dragPixmap());
     drag->setHotSpot(m_pressPosition);
+    runDrag(drag);
+}
+
+void KvEditorToolWidget::runDrag(QDrag *drag)
+{
     drag->exec(Qt::CopyAction);
+}
+
+void KvEditorToolWidget::changeEvent(QEvent *event)
+{
+    KvEditorPaletteRow::changeEvent(event);
+    if (event->type() == QEvent::LanguageChange)
+        retranslate();
 }

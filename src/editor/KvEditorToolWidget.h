@@ -1,14 +1,19 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QFrame>
+#include "editor/KvEditorPaletteRow.h"
+
 #include <QPoint>
 
 class KvBaseEditorNodeFactory;
-class QLabel;
+class QDrag;
 
-/** Row of the editor's palette for one block type: icon, name, and dots that say "drag me". */
-class KvEditorToolWidget : public QFrame
+/**
+ * Row of the editor's palette for one block type: icon, name, and dots that say "drag me".
+ *
+ * Dragged it offers a new block of its type; a double click or Enter asks for one at the template's end.
+ */
+class KvEditorToolWidget : public KvEditorPaletteRow
 {
     Q_OBJECT
 public:
@@ -16,20 +21,26 @@ public:
     explicit KvEditorToolWidget(KvBaseEditorNodeFactory *factory, QWidget *parent = nullptr);
 
     KvBaseEditorNodeFactory *factory() const { return m_factory; }
-    QString text() const;
-    void setText(const QString &text);
-    void setIcon(const QIcon &icon);
+
+signals:
+    void signalToolActivated(const QString &aTypeName);
 
 protected:
+    /** Runs a drag until the drop. */
+    virtual void runDrag(QDrag *drag);
+
+    void activate() override;
     void mousePressEvent(QMouseEvent *event) override;
     void mouseMoveEvent(QMouseEvent *event) override;
+    void mouseReleaseEvent(QMouseEvent *event) override;
+    void mouseDoubleClickEvent(QMouseEvent *event) override;
+    void changeEvent(QEvent *event) override;
 
 private:
+    void retranslate();
     void startDrag();
 
     KvBaseEditorNodeFactory *m_factory;
-    QLabel *m_iconLabel;
-    QLabel *m_nameLabel;
     QPoint m_pressPosition;
     bool m_isPressed = false;
 };

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QMetaType>
 #include <QString>
 
 #include <memory>
@@ -39,3 +40,5 @@ private:
 
     std::unique_ptr<KvBaseDisplayWidgetSignals> m_signals;
 };
+
+Q_DECLARE_METATYPE(KvBaseDisplayWidget *)

@@ -1,10 +1,13 @@
 // SPDX-License-Identifier: MIT
 #include "report/KvPageSectionWidget.h"
 
+#include "report/KvBaseDisplayWidgetSignals.h"
 #include "templates/KvPageSectionsCfg.h"
 #include "templates/KvTemplateContext.h"
 
 #include <QScopedValueRollback>
+
+#include <utility>
 
 KvPageSectionWidget::KvPageSectionWidget(QWidget *displayParent, KvPageSectionsCfg *section)
     : KvTextDocumentNodeWidget(displayParent, section)
@@ -15,6 +18,7 @@ KvPageSectionWidget::KvPageSectionWidget(QWidget *displayParent, KvPageSectionsC
 
 void KvPageSectionWidget::fitToWidth(int width)
 {
+    m_sizeUnannounced = false;
     setFixedWidth(width);
     ensurePolished();
     document()->setTextWidth(width);
@@ -23,15 +27,31 @@ void KvPageSectionWidget::fitToWidth(int width)
 
 void KvPageSectionWidget::slotTemplateModified()
 {
-    if (!m_updating)
-        refreshText();
+    // Keywords would be expanded under the user's hands, and stored so with the next key. The sections of all
+    // pages hear of each key typed anywhere in the template: most have nothing new to show.
+    if (m_updating || isEditing() || isUpToDate())
+        return;
+    const int heightBefore = height();
+    refreshText();
+    if (height() == heightBefore || m_sizeUnannounced)
+        return;
+    // Later, since the same happens to the section on all other pages: the first to announce it has the view
+    // measure them all.
+    m_sizeUnannounced = true;
+    QMetaObject::invokeMethod(this, "slotAnnounceSize", Qt::QueuedConnection);
 }
 
-void KvPageSectionWidget::applyContent()
+void KvPageSectionWidget::slotAnnounceSize()
+{
+    if (std::exchange(m_sizeUnannounced, false))
+        emit displaySignals()->signalWidgetChanged();
+}
+
+void KvPageSectionWidget::applyContent(Change change)
 {
     // Taking the text over marks the template modified, which must not replace the text that is being typed.
     const QScopedValueRollback<bool> guard(m_updating, true);
-    KvTextDocumentNodeWidget::applyContent();
+    KvTextDocumentNodeWidget::applyContent(change);
 }
 
 void KvPageSectionWidget::resizeEvent(QResizeEvent *event)

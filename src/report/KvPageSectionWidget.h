@@ -17,13 +17,17 @@ public:
     void fitToWidth(int width);
 
 public slots:
-    /** Shows the section with the current keyword values, unless the change comes from this widget. */
+    /** Shows the section with the current keyword values, unless it is edited in this widget. */
     void slotTemplateModified();
 
 protected:
-    void applyContent() override;
+    void applyContent(Change change) override;
     void resizeEvent(QResizeEvent *event) override;
+
+private slots:
+    void slotAnnounceSize();
 
 private:
     bool m_updating = false;
+    bool m_sizeUnannounced = false; ///< the text has another height than it was measured with
 };

@@ -11,6 +11,8 @@
 #include <QJsonObject>
 #include <QMimeData>
 
+#include <utility>
+
 const char KvReportNode::MimeFormat[] = "application/x-meeditorpreviewlistmodeldatalist";
 
 KvReportNode::KvReportNode(QWidget *displayParent, KvBaseEditorNodeFactory *factory,
@@ -24,10 +26,7 @@ KvReportNode::KvReportNode(QWidget *displayParent, KvBaseEditorNodeFactory *fact
 
 KvReportNode::~KvReportNode()
 {
-    if (!m_displayWidget)
-        return;
-    m_displayWidget->displaySignals()->disconnect(this);
-    delete m_displayWidget;
+    resetDisplayWidget();
 }
 
 QString KvReportNode::typeName() const
@@ -44,6 +43,14 @@ KvBaseDisplayWidget *KvReportNode::displayWidget()
                                                               SLOT(slotDisplayWidgetDestroyed()));
     }
     return m_displayWidget;
+}
+
+void KvReportNode::resetDisplayWidget()
+{
+    if (!m_displayWidget)
+        return;
+    m_displayWidget->displaySignals()->disconnect(this);
+    delete std::exchange(m_displayWidget, nullptr);
 }
 
 void KvReportNode::slotDisplayWidgetDestroyed()

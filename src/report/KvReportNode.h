@@ -38,6 +38,9 @@ public:
     /** The display widget, made on first use. */
     KvBaseDisplayWidget *displayWidget();
 
+    /** Deletes the display widget; the next use makes another one from the present configuration. */
+    void resetDisplayWidget();
+
     /** Appends {"name", "config"} to \a nodes; false (nothing appended) when the configuration fails to write
      * itself. */
     bool toJson(QJsonArray &nodes) const;

@@ -77,6 +77,16 @@ KvPageSectionWidget *KvReportPage::footerWidget() const
     return m_footerWidget;
 }
 
+KvReportProxyWidgetItem *KvReportPage::sectionItemAt(const QPointF &point) const
+{
+    // The topmost one first.
+    for (KvReportProxyWidgetItem *item : {m_pageCountItem, m_headerItem, m_footerItem}) {
+        if (item && QRectF(item->scenePos(), item->size()).contains(point))
+            return item;
+    }
+    return nullptr;
+}
+
 void KvReportPage::addSheet()
 {
     auto *sheet = new QGraphicsRectItem(m_pageRect);
@@ -191,4 +201,12 @@ void KvReportPage::setPageTotal(int total)
     m_pageCountWidget->adjustSize();
     m_pageCountItem->resize(m_pageCountWidget->size());
     placePageNumber();
+}
+
+void KvReportPage::detachSections()
+{
+    for (KvPageSectionWidget *widget : {headerWidget(), footerWidget()}) {
+        if (widget)
+            QObject::disconnect(m_model->context(), nullptr, widget, nullptr);
+    }
 }

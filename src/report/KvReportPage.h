@@ -32,10 +32,14 @@ public:
 
     KvPageSectionWidget *headerWidget() const;
     KvPageSectionWidget *footerWidget() const;
+    /** The header, footer or page number under a point of the scene, or null. */
+    KvReportProxyWidgetItem *sectionItemAt(const QPointF &point) const;
 
-    /** Measures and places header, footer and page number anew, and recomputes the content rectangle. */
+    /** Measures and places header and footer anew, and recomputes the content rectangle. */
     void updateSections();
     void setPageTotal(int total);
+    /** From now on header and footer no longer follow the template; for a page that is about to go. */
+    void detachSections();
 
     /** Distance between pages on screen, and of the column from the scene's edges, in pixels. */
     static constexpr int Gap = 20;

@@ -29,6 +29,10 @@ bool KvReportPrinter::print(const QString &fileName)
     QPdfWriter writer(fileName);
     writer.setResolution(kResolution);
     writer.setPageMargins(QMarginsF(0, 0, 0, 0));
+    // Until the last page is painted: views of the template keep their hands off the pieces meanwhile.
+    KvTemplateContext *context = m_model->context();
+    context->setPrinting(true);
+    const auto endPrinting = qScopeGuard([context]() { context->setPrinting(false); });
     layOut();
     return render(writer);
 }
@@ -55,9 +59,6 @@ QRect KvReportPrinter::startPage()
 
 void KvReportPrinter::layOutNodes()
 {
-    KvTemplateContext *context = m_model->context();
-    context->setPrinting(true);
-    const auto endPrinting = qScopeGuard([context]() { context->setPrinting(false); });
     KvPageFlow flow([this](int) { return startPage(); });
     for (KvReportNode *node : m_model->nodes()) {
         KvBaseDisplayWidget *displayWidget = node->displayWidget();
@@ -83,6 +84,8 @@ bool KvReportPrinter::render(QPdfWriter &writer)
     painter.setRenderHint(QPainter::LosslessImageRendering);
     reportProgress(0);
     for (int i = 0; i < m_pages.size(); ++i) {
+        if (m_progress && m_progress->isCancelled())
+            return false;
         if (i > 0)
             writer.newPage();
         m_scenes[static_cast<std::size_t>(i)]->render(&painter, target, m_pages.at(i)->pageRect(),

@@ -29,7 +29,10 @@ public:
     /** Told page by page; not owned, may be null. */
     void setProgress(KvPrintProgress *progress) { m_progress = progress; }
 
-    /** False when painting into the file could not begin, as when it cannot be opened for writing. */
+    /**
+     * False when painting into the file could not begin, as when it cannot be opened for writing, and when
+     * the progress was cancelled; the pages before that are in the file then.
+     */
     bool print(const QString &fileName);
 
     int pageCount() const { return m_pages.size(); }

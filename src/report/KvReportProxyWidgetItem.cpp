@@ -11,7 +11,10 @@
 
 KvReportProxyWidgetItem::KvReportProxyWidgetItem(QGraphicsItem *parent)
     : QGraphicsProxyWidget(parent)
-{}
+{
+    // What is selected has the keyboard. Tab leads out of the pages, not once through all that is on them.
+    setFocusPolicy(Qt::ClickFocus);
+}
 
 KvReportProxyWidgetItem *KvReportProxyWidgetItem::createForPiece(KvReportNode *node, int index)
 {

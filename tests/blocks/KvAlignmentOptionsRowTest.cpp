@@ -3,9 +3,11 @@
 
 #include "PanelProbe.h"
 #include "blocks/common/KvAlignmentOptionsRow.h"
+#include "gui/QtAdvancedStylesheet.h"
 #include "gui/acss.h"
 
 #include <QPushButton>
+#include <QStyleOptionButton>
 
 class KvAlignmentOptionsRowTest : public StatReportTest
 {
@@ -18,6 +20,8 @@ private slots:
     void checksTheButtonOfAnAlignment();
     void clicksAreForwarded_data();
     void clicksAreForwarded();
+    void iconsAreWhole_data();
+    void iconsAreWhole();
 };
 
 void KvAlignmentOptionsRowTest::initTestCase()
@@ -101,6 +105,41 @@ void KvAlignmentOptionsRowTest::clicksAreForwarded()
     QCOMPARE(left.count(), button == 0 ? 1 : 0);
     QCOMPARE(center.count(), button == 1 ? 1 : 0);
     QCOMPARE(right.count(), button == 2 ? 1 : 0);
+}
+
+void KvAlignmentOptionsRowTest::iconsAreWhole_data()
+{
+    QTest::addColumn<QString>("theme");
+    QTest::addColumn<bool>("focused");
+    for (const QString &theme : acss::QtAdvancedStylesheet::getInstance()->themes()) {
+        QTest::addRow("%s", qPrintable(theme)) << theme << false;
+        QTest::addRow("%s, focused", qPrintable(theme)) << theme << true;
+    }
+}
+
+void KvAlignmentOptionsRowTest::iconsAreWhole()
+{
+    QFETCH(QString, theme);
+    QFETCH(bool, focused);
+    auto *themes = acss::QtAdvancedStylesheet::getInstance();
+    themes->setCurrentTheme(theme);
+    themes->applyTo(qApp);
+    {
+        KvAlignmentOptionsRow row;
+        QVERIFY(PanelProbe::show(&row));
+        for (QPushButton *button : PanelProbe::controls<QPushButton>(&row)) {
+            QCOMPARE(button->size(), QSize(32, 32));
+            QStyleOptionButton option;
+            option.initFrom(button);
+            option.features = QStyleOptionButton::None;
+            option.state.setFlag(QStyle::State_HasFocus, focused);
+            const QRect contents =
+                button->style()->subElementRect(QStyle::SE_PushButtonContents, &option, button);
+            QVERIFY(contents.contains(QRect(QPoint(4, 4), QSize(24, 24))));
+        }
+    }
+    themes->setCurrentTheme(QStringLiteral("Dark"));
+    qApp->setStyleSheet(QString());
 }
 
 STATREPORT_TEST_MAIN(KvAlignmentOptionsRowTest)

@@ -12,6 +12,8 @@ private slots:
     void splits();
     void joins_data();
     void joins();
+    void indexesFollowTheNames_data();
+    void indexesFollowTheNames();
 };
 
 void KvColumnsTextTest::splits_data()
@@ -50,6 +52,22 @@ void KvColumnsTextTest::joins()
     QCOMPARE(KvColumnsText::split(text), columns);
     if (columns.isEmpty())
         QCOMPARE(text, QString());
+}
+
+void KvColumnsTextTest::indexesFollowTheNames_data()
+{
+    QTest::addColumn<QSet<QString>>("columns");
+    QTest::addColumn<QVector<int>>("indexes");
+    QTest::newRow("nothing") << QSet<QString>{} << QVector<int>{};
+    QTest::newRow("one") << QSet<QString>{"Average"} << QVector<int>{2};
+    QTest::newRow("several") << QSet<QString>{"Average", "Min"} << QVector<int>{0, 2};
+    QTest::newRow("unknown ones") << QSet<QString>{"min", "Max", ""} << QVector<int>{1};
+}
+
+void KvColumnsTextTest::indexesFollowTheNames()
+{
+    QFETCH(QSet<QString>, columns);
+    QTEST(KvColumnsText::indexes({"Min", "Max", "Average"}, columns), "indexes");
 }
 
 STATREPORT_TEST_MAIN(KvColumnsTextTest)

@@ -13,7 +13,11 @@ private slots:
     void keepsOrdinaryText();
     void flattensDeepTables();
     void breaksOverlongWords();
+    void breaksOverlongPlainWords();
     void keepsEntitiesWhole();
+    void flattensDeepElements();
+    void cutsHugeNumbers_data();
+    void cutsHugeNumbers();
     void endsInTime_data();
     void endsInTime();
 };
@@ -29,6 +33,15 @@ void KvRichTextGuardTest::keepsOrdinaryText_data()
     QTest::newRow("long picture")
         << QStringLiteral("<img src=\"data:image/png;base64, %1\"/>").arg(QString(100000, QLatin1Char('A')));
     QTest::newRow("longest word") << QString(KvRichTextGuard::LongestWord, QLatin1Char('a'));
+    QTest::newRow("colours") << QStringLiteral("<p style=\"color:#999999; background:#123456\">1234567</p>");
+    QTest::newRow("no tag at all") << QStringLiteral("5 < 1234567 > 3 <b>and 1234567</b> < 7654321");
+    QTest::newRow("numbers of five digits") << QStringLiteral("<img width=\"99999\" height='12345'/>");
+    QTest::newRow("long fractions") << QStringLiteral("<p style=\"font-size:11.99999999pt\">a</p>");
+    QTest::newRow("addresses of digits") << QStringLiteral(
+        "<img src=\"data:image/png;base64, 123456789/1234567+000000=\" /><a href='1234567'>a</a>");
+    QTest::newRow("as deep as can be") << QStringLiteral("<span>").repeated(KvRichTextGuard::DeepestElement);
+    QTest::newRow("one after the other") << QStringLiteral("<div><b>a</b></div>").repeated(2000);
+    QTest::newRow("paragraphs without end") << QStringLiteral("<p>a<br>").repeated(2000);
     QTest::newRow("word of a table's name") << QStringLiteral("<tablecloth>").repeated(20);
 }
 
@@ -59,6 +72,16 @@ void KvRichTextGuardTest::breaksOverlongWords()
     QCOMPARE(QString(tamed).remove(QChar(0x200B)), QStringLiteral("<p>") + word + QStringLiteral("</p>"));
 }
 
+void KvRichTextGuardTest::breaksOverlongPlainWords()
+{
+    const QString ordinary = QStringLiteral("<p>5 &lt; 7</p> ").repeated(5000);
+    QCOMPARE(KvRichTextGuard::tamedPlain(ordinary), ordinary);
+    const QString tag = QLatin1Char('<') + QString(KvRichTextGuard::LongestWord, QLatin1Char('a'));
+    const QString tamed = KvRichTextGuard::tamedPlain(tag);
+    QCOMPARE(tamed.count(QChar(0x200B)), 20);
+    QCOMPARE(QString(tamed).remove(QChar(0x200B)), tag);
+}
+
 void KvRichTextGuardTest::keepsEntitiesWhole()
 {
     const QString word = QStringLiteral("&amp;").repeated(KvRichTextGuard::LongestWord);
@@ -69,11 +92,50 @@ void KvRichTextGuardTest::keepsEntitiesWhole()
              QString(KvRichTextGuard::LongestWord, QLatin1Char('&')));
 }
 
+void KvRichTextGuardTest::flattensDeepElements()
+{
+    const int depth = 2 * KvRichTextGuard::DeepestElement;
+    const QString html = QStringLiteral("<DIV>in").repeated(depth) + QStringLiteral("most") +
+                         QStringLiteral("</div>").repeated(depth) + QStringLiteral("<b>after</b>");
+    const QString tamed = KvRichTextGuard::tamed(html);
+    QCOMPARE(tamed.count(QStringLiteral("<DIV>")), KvRichTextGuard::DeepestElement);
+    QCOMPARE(tamed.count(QStringLiteral("</div>")), KvRichTextGuard::DeepestElement);
+    QCOMPARE(tamed.count(QStringLiteral("in")), depth);
+    QVERIFY(tamed.contains(QStringLiteral("most")));
+    QVERIFY(tamed.endsWith(QStringLiteral("<b>after</b>")));
+}
+
+void KvRichTextGuardTest::cutsHugeNumbers_data()
+{
+    QTest::addColumn<QString>("html");
+    QTest::addColumn<QString>("tamed");
+    QTest::newRow("attribute") << "<table cellpadding=2000000000 border=\"1\">1000000"
+                               << "<table cellpadding=32767 border=\"1\">1000000";
+    QTest::newRow("beside a picture") << "<img src=\"data:image/png;base64, 1234567\" height=\"100000\" />"
+                                      << "<img src=\"data:image/png;base64, 1234567\" height=\"32767\" />";
+    QTest::newRow("before a picture") << "<img width='1000000' SRC='1234567' height='1000000'>"
+                                      << "<img width='32767' SRC='1234567' height='32767'>";
+    QTest::newRow("style") << "<p style=\"margin-top:-999999999px; color:#123456\">"
+                           << "<p style=\"margin-top:-32767px; color:#123456\">";
+}
+
+void KvRichTextGuardTest::cutsHugeNumbers()
+{
+    QFETCH(QString, html);
+    QTEST(KvRichTextGuard::tamed(html), "tamed");
+}
+
 void KvRichTextGuardTest::endsInTime_data()
 {
     QTest::addColumn<QString>("html");
     QTest::newRow("tables") << QStringLiteral("<table><tr><td>").repeated(3000) + QLatin1Char('x');
     QTest::newRow("word") << QString(1000000, QLatin1Char('a'));
+    QTest::newRow("elements") << QStringLiteral("<div>").repeated(200000) + QLatin1Char('x');
+    QTest::newRow("formats") << QStringLiteral("<b><i>").repeated(100000) + QLatin1Char('x');
+    QTest::newRow("padding") << QStringLiteral("<table cellpadding=\"2000000000\"><tr><td>x");
+    QTest::newRow("numbers") << QStringLiteral("<p ") + QStringLiteral("a=1000000 ").repeated(200000) +
+                                    QStringLiteral(">x");
+    QTest::newRow("picture") << QStringLiteral("<img height=\"20000000\" />x");
 }
 
 void KvRichTextGuardTest::endsInTime()

@@ -7,11 +7,10 @@
 #include "MetaMethods.h"
 #include "PanelProbe.h"
 #include "TableProbe.h"
+#include "TableSpies.h"
 #include "blocks/measurementstable/KvStatisticsMeasurementsTableNodeCfg.h"
 #include "blocks/measurementstable/KvStatisticsMeasurementsTableOptionsWidget.h"
 #include "blocks/measurementstable/KvStatisticsMeasurementsTableWidget.h"
-#include "report/KvBaseDisplayWidgetSignals.h"
-#include "templates/KvTemplateContext.h"
 
 #include <QCheckBox>
 #include <QComboBox>
@@ -36,23 +35,6 @@ QVector<FakeRow> threeRows()
             {QStringLiteral("Corner"), QStringLiteral("Arc"), QStringLiteral("angle"), 100.0,
              QStringLiteral("100°")}};
 }
-
-/** Counts what a table tells layout and window. */
-struct TableSpies
-{
-    TableSpies(const Table &table, const KvTemplateContext *context)
-        : pieces(table.displaySignals(), SIGNAL(signalSubWidgetsChanged()))
-                 , changed(table.displaySignals(), SIGNAL(signalWidgetChanged()))
-                           , config(table.displaySignals(),
-                                    SIGNAL(signalWidgetConfigChanged(const KvBaseEditorNodeCfg *)))
-                                    , modified(context, SIGNAL(signalTemplateModified()))
-    {}
-
-    QSignalSpy pieces;
-    QSignalSpy changed;
-    QSignalSpy config;
-    QSignalSpy modified;
-};
 
 } // namespace
 

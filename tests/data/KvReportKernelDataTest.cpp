@@ -164,7 +164,11 @@ private slots:
     void framesWithoutAPictureChangeNothing_data();
     void framesWithoutAPictureChangeNothing();
     void measurementsAreDrawnWhenWanted();
+    void wishesForMeasurementsAreCounted();
     void aReplacedImageIsLetGo();
+    void anImageInstalledLateIsFollowed();
+    void anImageIsFollowedWithoutListeners();
+    void noImageIsFollowedWhileInactive();
 
     void rebuildIsLinear();
 
@@ -1030,6 +1034,80 @@ void KvReportKernelDataTest::aReplacedImageIsLetGo()
     dying.reset();
     data.setActive(false);
     QVERIFY(!data.isActive());
+}
+
+void KvReportKernelDataTest::wishesForMeasurementsAreCounted()
+{
+    FakeImage image;
+    m_kernel->setKernelImage(&image);
+    KvReportKernelData data;
+    data.setCameraImageWithDataWanted(false); // one too many
+    data.setCameraImageWithDataWanted(true);
+    QVERIFY(data.isCameraImageWithDataWanted());
+    data.setCameraImageWithDataWanted(true);
+    data.setCameraImageWithDataWanted(false);
+    QVERIFY(data.isCameraImageWithDataWanted());
+    data.setActive(true);
+    QVERIFY(!data.cameraImageWithData().isNull());
+    data.setCameraImageWithDataWanted(false);
+    QVERIFY(!data.isCameraImageWithDataWanted());
+    QSignalSpy withData(&data, SIGNAL(signalCameraImageWithDataChanged()));
+    image.deliver();
+    QCOMPARE(withData.count(), 0);
+}
+
+void KvReportKernelDataTest::anImageInstalledLateIsFollowed()
+{
+    FakeImage first;
+    FakeImage second;
+    KvReportKernelData data;
+    QSignalSpy frames(&data, SIGNAL(signalCameraImageChanged()));
+    data.setActive(true);
+    QCOMPARE(frames.count(), 0);
+    m_kernel->setKernelImage(&first);
+    data.slotDelayedPrepareCameraImage();
+    QCOMPARE(frames.count(), 1);
+    data.slotDelayedPrepareCameraImage(); // connected once
+    QCOMPARE(frames.count(), 2);
+
+    m_kernel->setKernelImage(&second);
+    QVERIFY(frames.wait(5000)); // the timer finds it
+    QVERIFY(second.handled);
+    first.deliver();
+    QVERIFY(!first.handled);
+    m_kernel->setKernelImage(nullptr);
+    data.slotDelayedPrepareCameraImage();
+    second.deliver();
+    QVERIFY(!second.handled);
+}
+
+void KvReportKernelDataTest::anImageIsFollowedWithoutListeners()
+{
+    FakeImage image;
+    KvReportKernelData data;
+    data.setActive(true);
+    m_kernel->setKernelImage(&image);
+    data.slotDelayedPrepareCameraImage();
+    QCOMPARE(image.requests, 0);
+    image.deliver(); // a frame of its own accord
+    QVERIFY(image.handled);
+    QVERIFY(!data.cameraImage().isNull());
+}
+
+void KvReportKernelDataTest::noImageIsFollowedWhileInactive()
+{
+    FakeImage image;
+    m_kernel->setKernelImage(&image);
+    KvReportKernelData data;
+    const QSignalSpy frames(&data, SIGNAL(signalCameraImageChanged()));
+    data.slotDelayedPrepareCameraImage();
+    QCOMPARE(image.requests, 1);
+    QVERIFY(!image.handled);
+    data.setActive(true);
+    data.setActive(false);
+    data.slotDelayedPrepareCameraImage();
+    QVERIFY(!image.handled);
+    QCOMPARE(frames.count(), 1); // that of the activation
 }
 
 void KvReportKernelDataTest::rebuildIsLinear()

@@ -38,8 +38,15 @@ private slots:
     void isATextOfItsSection();
     void followsTheTemplate();
     void rendersOncePerAnnouncement();
+    void rendersOnlyWhatIsNew_data();
+    void rendersOnlyWhatIsNew();
     void typingIsNotOverwritten();
     void typingReachesTheOtherPages();
+    void hasThePanelOfATextUnderItsName();
+    void placeholdersStayWhileEdited();
+    void endOfEditingReachesTheOtherPages();
+    void growingIsAnnouncedOnce();
+    void measuringSettlesTheAnnouncement();
     void textSpansTheWidth();
     void fitsToAWidth_data();
     void fitsToAWidth();
@@ -87,7 +94,7 @@ void KvHeaderFooterWidgetTest::followsTheTemplate()
 void KvHeaderFooterWidgetTest::rendersOncePerAnnouncement()
 {
     FakeReport report;
-    report.model()->header()->setText(QStringLiteral("top"));
+    report.model()->header()->setText(QStringLiteral("by ${PROGRAM_NAME}"));
     std::vector<std::unique_ptr<CountedHeader>> headers;
     for (int i = 0; i < 3; ++i)
         headers.push_back(std::make_unique<CountedHeader>(nullptr, report.model()->header()));
@@ -98,9 +105,37 @@ void KvHeaderFooterWidgetTest::rendersOncePerAnnouncement()
     const int perRefresh =
         CountedHeader::countRefreshes(headers[0]->document(), [&]() { headers[0]->refreshText(); });
     QVERIFY(perRefresh > 0);
+    for (std::size_t i = 0; i < headers.size(); ++i) {
+        ZtAppSettings::setProgramInfo(QStringLiteral("Program %1").arg(i), QString(), QString());
+        QCOMPARE(CountedHeader::countRefreshes(headers[i]->document(), announce), perRefresh);
+    }
     for (const std::unique_ptr<CountedHeader> &header : headers)
-        QCOMPARE(CountedHeader::countRefreshes(header->document(), announce), perRefresh);
+        QCOMPARE(header->toPlainText(), QStringLiteral("by Program 2"));
+    ZtAppSettings::setProgramInfo(QString(), QString(), QString());
     QCOMPARE(modified.count(), 3);
+}
+
+void KvHeaderFooterWidgetTest::rendersOnlyWhatIsNew_data()
+{
+    QTest::addColumn<QString>("html");
+    QTest::newRow("plain") << "top";
+    QTest::newRow("keyword") << "by ${PROGRAM_NAME}";
+    QTest::newRow("empty") << "";
+}
+
+void KvHeaderFooterWidgetTest::rendersOnlyWhatIsNew()
+{
+    QFETCH(QString, html);
+    FakeReport report;
+    report.model()->header()->setText(html);
+    const CountedHeader header(nullptr, report.model()->header());
+    const auto announce = [&report]() { emit report.model()->context()->signalTemplateModified(); };
+    // Each key that is typed anywhere in the template announces itself, and every page has a header.
+    QCOMPARE(CountedHeader::countRefreshes(header.document(), announce), 0);
+    report.model()->header()->setText(QStringLiteral("new"));
+    QVERIFY(CountedHeader::countRefreshes(header.document(), announce) > 0);
+    QCOMPARE(header.toPlainText(), QStringLiteral("new"));
+    QCOMPARE(CountedHeader::countRefreshes(header.document(), announce), 0);
 }
 
 void KvHeaderFooterWidgetTest::typingIsNotOverwritten()
@@ -134,6 +169,103 @@ void KvHeaderFooterWidgetTest::typingReachesTheOtherPages()
     QCOMPARE(first->toPlainText(), QStringLiteral("hello"));
     QCOMPARE(second->toPlainText(), QStringLiteral("hello"));
     QCOMPARE(footer->toPlainText(), QString());
+}
+
+void KvHeaderFooterWidgetTest::hasThePanelOfATextUnderItsName()
+{
+    FakeReport report;
+    const std::unique_ptr<KvHeaderWidget> header(report.model()->createHeaderWidget());
+    const std::unique_ptr<KvFooterWidget> footer(report.model()->createFooterWidget());
+    QWidget side;
+    const auto heading = [&side](KvPageSectionWidget *section) {
+        const std::unique_ptr<QWidget> panel(section->createOptionsWidget(&side, true));
+        return panel->inherits("KvTextDocumentNodeOptionsWidget")
+                   ? panel->findChild<QLabel *>(QStringLiteral("sideHeader"))->text()
+                   : QString();
+    };
+    QCOMPARE(heading(header.get()), QStringLiteral("Header"));
+    QCOMPARE(heading(footer.get()), QStringLiteral("Footer"));
+}
+
+void KvHeaderFooterWidgetTest::placeholdersStayWhileEdited()
+{
+    FakeReport report;
+    report.model()->header()->setText(QStringLiteral("${CREATION_TIME}"));
+    const std::unique_ptr<KvHeaderWidget> edited(report.model()->createHeaderWidget());
+    const std::unique_ptr<KvHeaderWidget> other(report.model()->createHeaderWidget());
+    auto panel = std::make_unique<QWidget>();
+    edited->createOptionsWidget(panel.get(), true);
+    edited->show();
+    QVERIFY(QTest::qWaitForWindowExposed(edited.get()));
+    edited->moveCursor(QTextCursor::End);
+    for (const QChar c : QStringLiteral(" h!")) {
+        QTest::keyClick(edited.get(), c.toLatin1());
+        QVERIFY(edited->toPlainText().startsWith(QStringLiteral("${CREATION_TIME}")));
+        QVERIFY(edited->textCursor().atEnd());
+    }
+    // Changes elsewhere in the template do not touch it either.
+    emit report.model()->context()->signalTemplateModified();
+    QCOMPARE(edited->toPlainText(), QStringLiteral("${CREATION_TIME} h!"));
+    QVERIFY(edited->textCursor().atEnd());
+    QVERIFY(report.model()->header()->text().contains(QStringLiteral("${CREATION_TIME} h!")));
+    QVERIFY(other->toPlainText().endsWith(QStringLiteral(" h!")));
+    QVERIFY(!other->toPlainText().contains(QLatin1Char('$')));
+
+    panel.reset();
+    QVERIFY(!edited->toPlainText().contains(QLatin1Char('$')));
+    QVERIFY(edited->toPlainText().endsWith(QStringLiteral(" h!")));
+    QVERIFY(report.model()->header()->text().contains(QStringLiteral("${CREATION_TIME} h!")));
+}
+
+void KvHeaderFooterWidgetTest::endOfEditingReachesTheOtherPages()
+{
+    FakeReport report;
+    report.model()->header()->setText(QStringLiteral("top"));
+    const std::unique_ptr<KvHeaderWidget> edited(report.model()->createHeaderWidget());
+    const std::unique_ptr<KvHeaderWidget> other(report.model()->createHeaderWidget());
+    auto panel = std::make_unique<QWidget>();
+    edited->createOptionsWidget(panel.get(), true);
+    {
+        const QSignalBlocker blocker(edited.get());
+        edited->insertPlainText(QStringLiteral("on "));
+    }
+    QCOMPARE(other->toPlainText(), QStringLiteral("top"));
+    panel.reset();
+    QCOMPARE(edited->toPlainText(), QStringLiteral("on top"));
+    QCOMPARE(other->toPlainText(), QStringLiteral("on top"));
+    QVERIFY(report.model()->isModified());
+}
+
+void KvHeaderFooterWidgetTest::growingIsAnnouncedOnce()
+{
+    FakeReport report;
+    const std::unique_ptr<KvHeaderWidget> header(report.model()->createHeaderWidget());
+    QSignalSpy changed(header->displaySignals(), SIGNAL(signalWidgetChanged()));
+    for (const char *text : {"<p>1</p><p>2</p>", "<p>1</p><p>2</p><p>3</p>"}) {
+        report.model()->header()->setText(QString::fromLatin1(text));
+        emit report.model()->context()->signalTemplateModified();
+    }
+    QCOMPARE(changed.count(), 0); // the sections of all pages hear of the change first
+    QCoreApplication::processEvents();
+    QCOMPARE(changed.count(), 1);
+    // The same height needs no announcement.
+    report.model()->header()->setText(QStringLiteral("<p>4</p><p>5</p><p>6</p>"));
+    emit report.model()->context()->signalTemplateModified();
+    QCoreApplication::processEvents();
+    QCOMPARE(changed.count(), 1);
+}
+
+void KvHeaderFooterWidgetTest::measuringSettlesTheAnnouncement()
+{
+    FakeReport report;
+    const std::unique_ptr<KvHeaderWidget> header(report.model()->createHeaderWidget());
+    header->fitToWidth(700);
+    const QSignalSpy changed(header->displaySignals(), SIGNAL(signalWidgetChanged()));
+    report.model()->header()->setText(QStringLiteral("<p>1</p><p>2</p>"));
+    emit report.model()->context()->signalTemplateModified();
+    header->fitToWidth(700);
+    QCoreApplication::processEvents();
+    QCOMPARE(changed.count(), 0);
 }
 
 void KvHeaderFooterWidgetTest::textSpansTheWidth()

@@ -20,6 +20,7 @@ private slots:
     void passesTheDisplayParent();
     void forgetsADeletedDisplayWidget();
     void deletesItsDisplayWidget();
+    void makesTheDisplayWidgetAnew();
     void livesWithoutADisplayWidget();
     void writesNameAndConfig();
     void appendsNothingOnFailure();
@@ -93,6 +94,30 @@ void KvReportNodeTest::deletesItsDisplayWidget()
     QVERIFY(shown.displayWidget());
     parent.reset();
     QVERIFY(shown.displayWidget());
+}
+
+void KvReportNodeTest::makesTheDisplayWidgetAnew()
+{
+    FakeReport report;
+    KvReportNode *node = report.addFake({10, 20});
+    node->resetDisplayWidget(); // there is none yet
+    QCOMPARE(report.fakeFactory()->widgetsMade(), 0);
+    KvBaseDisplayWidget *before = node->displayWidget();
+    QVERIFY(before->subWidgetAt(0));
+    QVERIFY(before->subWidgetAt(1));
+    // Whoever listens to its end finds the block without a widget, not with the dying one.
+    bool wasTold = false;
+    connect(before->displaySignals(), &QObject::destroyed, this, [&]() { wasTold = true; });
+    node->resetDisplayWidget();
+    QVERIFY(wasTold);
+    QCOMPARE(FakePiece::alive(), 0);
+    QCOMPARE(report.fakeFactory()->widgetsMade(), 1);
+    FakeReport::fakeCfg(node)->setHeights({30});
+    QVERIFY(node->displayWidget());
+    QCOMPARE(report.fakeFactory()->widgetsMade(), 2);
+    QCOMPARE(node->displayWidget()->subWidgetCount(), 1);
+    QCOMPARE(node->displayWidget(), node->displayWidget());
+    QCOMPARE(report.fakeFactory()->widgetsMade(), 2);
 }
 
 void KvReportNodeTest::livesWithoutADisplayWidget()

@@ -71,6 +71,7 @@ private slots:
     void updatesItsSections();
     void survivesOddPages_data();
     void survivesOddPages();
+    void findsSections();
 };
 
 void KvReportPageTest::standsInAColumn_data()
@@ -382,6 +383,41 @@ void KvReportPageTest::survivesOddPages()
         QVERIFY(page->pageRect().height() >= 0);
         QCOMPARE(pageCountOf(*page)->text(), QStringLiteral("301/301"));
     }
+}
+
+void KvReportPageTest::findsSections()
+{
+    FakeReport report;
+    fillSections(report.model());
+    QGraphicsScene scene;
+    auto *bare = new KvReportPage(report.model(), 0, false);
+    scene.addItem(bare);
+    QVERIFY(!bare->sectionItemAt(QPointF(300, 50)));
+    QVERIFY(!bare->sectionItemAt(QPointF(971 - 42, 1365 - 32)));
+
+    report.model()->setHeaderEnabled(true);
+    report.model()->setFooterEnabled(true);
+    report.model()->setPageNumberingEnabled(true);
+    auto *page = new KvReportPage(report.model(), 1, false);
+    scene.addItem(page);
+    page->setPageTotal(2);
+    const QRect rect = page->pageRect();
+    const auto widgetAt = [page](const QPointF &point) {
+        const KvReportProxyWidgetItem *item = page->sectionItemAt(point);
+        return item ? item->widget() : nullptr;
+    };
+    QCOMPARE(widgetAt(QPointF(300, rect.top() + 25)), page->headerWidget());
+    QCOMPARE(widgetAt(QPointF(300, page->contentRect().bottom() + 5)), page->footerWidget());
+    // The page number stands over the footer.
+    const KvReportProxyWidgetItem *number = itemOf(*page, pageCountOf(*page));
+    QVERIFY(number);
+    QCOMPARE(page->sectionItemAt(number->scenePos() + QPointF(1, 1)), number);
+    for (const QPointF &point :
+         {QPointF(300, rect.top() + 10), QPointF(300, rect.top() + 600), QPointF(300, rect.bottom() - 5),
+          QPointF(10, rect.top() + 25), QPointF(300, 50)})
+        QVERIFY(!page->sectionItemAt(point));
+    for (const KvReportProxyWidgetItem *item : childrenOf<KvReportProxyWidgetItem>(*page))
+        QVERIFY(!item->belongsToBlock());
 }
 
 STATREPORT_TEST_MAIN(KvReportPageTest)

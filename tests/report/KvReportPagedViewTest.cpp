@@ -1,43 +1,19 @@
 // SPDX-License-Identifier: MIT
 #include "report/KvReportPagedView.h"
+#include "PagedViewTools.h"
 #include "PdfFile.h"
 #include "report/KvHeaderWidget.h"
-#include "report/KvNodeWrapperWidget.h"
 #include "report/KvPageCountWidget.h"
 #include "report/KvReportPage.h"
-#include "report/KvReportProxyWidgetItem.h"
 #include "support/FakeReport.h"
 #include "support/StatReportTest.h"
 
 #include <QGraphicsScene>
 #include <QScrollBar>
 
+using namespace PagedViewTools;
+
 namespace {
-
-QVector<QPoint> placesOf(const KvReportPagedView &view)
-{
-    QVector<QPoint> places;
-    for (const KvReportProxyWidgetItem *item : view.pieceItems())
-        places.append(item->scenePos().toPoint());
-    return places;
-}
-
-QWidget *pieceOf(const KvReportProxyWidgetItem *item)
-{
-    auto *wrapper = qobject_cast<KvNodeWrapperWidget *>(item->widget());
-    return wrapper ? wrapper->piece() : nullptr;
-}
-
-// Whether every item shows its piece.
-bool showsAllPieces(const KvReportPagedView &view)
-{
-    for (const KvReportProxyWidgetItem *item : view.pieceItems()) {
-        const QWidget *piece = pieceOf(item);
-        if (!piece || piece->parentWidget() != item->widget() || !piece->isVisible() || piece->height() == 0)
-            return false;
-    }
-    return true;
-}
 
 QStringList pageNumbersOf(const KvReportPagedView &view)
 {
@@ -50,27 +26,6 @@ QStringList pageNumbersOf(const KvReportPagedView &view)
         }
     }
     return numbers;
-}
-
-void deliverQueuedCalls()
-{
-    QCoreApplication::sendPostedEvents();
-    QCoreApplication::processEvents();
-    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
-}
-
-void showView(KvReportPagedView &view, const QSize &size)
-{
-    view.resize(size);
-    view.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&view));
-    deliverQueuedCalls();
-}
-
-// Top of a page's content without sections, for pages of the default width.
-int contentTop(int page)
-{
-    return 40 + page * 1366;
 }
 
 const char kBigHeader[] = "<p style='font-size:40px'>Header</p>";

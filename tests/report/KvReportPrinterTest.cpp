@@ -24,6 +24,31 @@ private:
     QVector<QPair<int, int>> m_noted;
 };
 
+// Cancels when a number of pages is written, and notes whether the template knew of the print all the time.
+class CancellingProgress : public KvPrintProgress
+{
+public:
+    CancellingProgress(const KvTemplateContext *context, int pages)
+        : m_context(context)
+        , m_pages(pages)
+    {}
+    void pageWritten(int done, int) override
+    {
+        m_done = done;
+        m_isPrinting &= m_context->isPrinting();
+    }
+    bool isCancelled() const override { return m_done >= m_pages; }
+
+    int done() const { return m_done; }
+    bool wasPrinting() const { return m_isPrinting; }
+
+private:
+    const KvTemplateContext *m_context;
+    int m_pages;
+    int m_done = 0;
+    bool m_isPrinting = true;
+};
+
 // A piece knows whether it is made for paper.
 class PrintAwareBlock : public FakeBlockWidget
 {
@@ -126,6 +151,8 @@ private slots:
     void printsTwice();
     void leavesTheWidgetsToTheirBlocks();
     void tellsItsProgress();
+    void stopsWhenCancelled_data();
+    void stopsWhenCancelled();
     void tellsThatItPrints();
     void printsWithThePageWidthOfTheFile();
     void survivesOddTemplates_data();
@@ -514,6 +541,41 @@ void KvReportPrinterTest::tellsItsProgress()
     QCOMPARE(report.model()->print(pdfPath("progress"), &progress), 1);
     using Step = QPair<int, int>;
     QCOMPARE(progress.noted(), QVector<Step>({Step(0, 3), Step(1, 3), Step(2, 3), Step(3, 3)}));
+}
+
+void KvReportPrinterTest::stopsWhenCancelled_data()
+{
+    QTest::addColumn<int>("after");
+    QTest::addColumn<int>("result");
+    QTest::addColumn<int>("written");
+    QTest::newRow("before the first page") << 0 << 0 << 0;
+    QTest::newRow("after the first page") << 1 << 0 << 1;
+    QTest::newRow("after the second page") << 2 << 0 << 2;
+    // Too late: the file is complete.
+    QTest::newRow("after the last page") << 3 << 1 << 3;
+    QTest::newRow("never") << 4 << 1 << 3;
+}
+
+void KvReportPrinterTest::stopsWhenCancelled()
+{
+    QFETCH(int, after);
+    QFETCH(int, written);
+    FakeReport report;
+    KvReportNode *node = report.addFake({1000, 1000, 1000});
+    CancellingProgress progress(report.model()->context(), after);
+    const QString path = pdfPath("cancelled");
+    QTEST(report.model()->print(path, &progress), "result");
+    QCOMPARE(progress.done(), written);
+    QVERIFY(progress.wasPrinting());
+    QVERIFY(!report.model()->context()->isPrinting());
+    // What is left behind is a file that can be read, and blocks that can be printed again.
+    const PdfFile pdf(path);
+    QVERIFY(pdf.isSound());
+    QCOMPARE(pdf.pageCount(), qMax(written, 1));
+    QCOMPARE(FakePiece::alive(), 3);
+    QVERIFY(!FakeReport::fakeWidget(node)->piece(0)->parentWidget());
+    QCOMPARE(report.model()->print(path), 1);
+    QCOMPARE(PdfFile(path).pageCount(), 3);
 }
 
 void KvReportPrinterTest::tellsThatItPrints()

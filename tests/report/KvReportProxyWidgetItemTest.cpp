@@ -28,6 +28,8 @@ void KvReportProxyWidgetItemTest::startsEmpty()
     QVERIFY(!item.belongsToBlock());
     QCOMPARE(item.cacheMode(), QGraphicsItem::NoCache);
     QVERIFY(!item.graphicsEffect());
+    // Tab passes it by.
+    QCOMPARE(item.focusPolicy(), Qt::ClickFocus);
     item.adjustToPiece();
 }
 

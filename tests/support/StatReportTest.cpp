@@ -23,10 +23,13 @@ WarningState &warningState()
     return state;
 }
 
-// The offscreen platform says this of every window that is shown; it means nothing.
+// The offscreen platform says the one of every window that is shown. The other comes from an X server without a
+// window manager when a window wants the keyboard before it is mapped. Neither means anything.
 bool isPlatformNoise(const QString &message)
 {
-    return message == QLatin1String("This plugin does not support propagateSizeHints()");
+    return message == QLatin1String("This plugin does not support propagateSizeHints()") ||
+           (message.startsWith(QLatin1String("QXcbConnection: XCB error: 8 (BadMatch)")) &&
+            message.contains(QLatin1String("(SetInputFocus)")));
 }
 
 bool takeAnnounced(const QString &message)

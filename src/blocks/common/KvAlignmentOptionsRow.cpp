@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "blocks/common/KvAlignmentOptionsRow.h"
 
+#include "blocks/common/KvBaseOptionsWidget.h"
 #include "gui/acss.h"
 
 #include <QHBoxLayout>
@@ -9,7 +10,6 @@
 namespace {
 constexpr int kIconExtent = 24;
 constexpr int kIconMode = 6;
-constexpr int kSpacing = 4;
 } // namespace
 
 KvAlignmentOptionsRow::KvAlignmentOptionsRow(QWidget *parent)
@@ -17,7 +17,7 @@ KvAlignmentOptionsRow::KvAlignmentOptionsRow(QWidget *parent)
 {
     auto *row = new QHBoxLayout(this);
     row->setContentsMargins(0, 0, 0, 0);
-    row->setSpacing(kSpacing);
+    row->setSpacing(KvBaseOptionsWidget::ControlSpacing);
     m_leftButton =
         addButton(QStringLiteral("Icons/IconAlignLeft.svg"), tr("Align left"), SIGNAL(signalLeftClicked()));
     m_centerButton = addButton(QStringLiteral("Icons/IconAlignCenter.svg"), tr("Align center"),
@@ -32,7 +32,8 @@ QPushButton *KvAlignmentOptionsRow::addButton(const QString &iconPath, const QSt
 {
     auto *button = new QPushButton(this);
     button->setCheckable(true);
-    button->setFixedSize(kIconExtent, kIconExtent);
+    button->setProperty("iconOnly", true);
+    button->setFixedSize(KvBaseOptionsWidget::IconButtonExtent, KvBaseOptionsWidget::IconButtonExtent);
     button->setIconSize(QSize(kIconExtent, kIconExtent));
     button->setIcon(acss::createIcon(kIconMode, iconPath, QSize(kIconExtent, kIconExtent)));
     button->setToolTip(text);

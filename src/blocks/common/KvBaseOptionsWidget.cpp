@@ -20,6 +20,7 @@ KvBaseOptionsWidget::KvBaseOptionsWidget(const QString &heading, QWidget *parent
     m_rows->setAlignment(Qt::AlignTop);
     auto *header = new QLabel(heading, this);
     header->setObjectName(QStringLiteral("sideHeader"));
+    header->setProperty("groupTitle", true);
     m_rows->addWidget(header);
 }
 

@@ -1,14 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "blocks/common/KvWidthOptionsRow.h"
 
+#include "blocks/common/KvBaseOptionsWidget.h"
+
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QSignalBlocker>
 #include <QSpinBox>
-
-namespace {
-constexpr int kSpacing = 8;
-}
 
 KvWidthOptionsRow::KvWidthOptionsRow(QWidget *parent)
     : QWidget(parent)
@@ -16,6 +14,9 @@ KvWidthOptionsRow::KvWidthOptionsRow(QWidget *parent)
 {
     auto *label = new QLabel(tr("W", "short for width"), this);
     label->setBuddy(m_spinBox);
+    label->setMinimumWidth(KvBaseOptionsWidget::LabelWidth);
+    label->setAlignment(Qt::AlignCenter);
+    m_spinBox->setFixedWidth(KvBaseOptionsWidget::FieldWidth);
     m_spinBox->setRange(1, 100);
     m_spinBox->setSuffix(QStringLiteral("%"));
     m_spinBox->setButtonSymbols(QAbstractSpinBox::NoButtons);
@@ -24,7 +25,7 @@ KvWidthOptionsRow::KvWidthOptionsRow(QWidget *parent)
 
     auto *row = new QHBoxLayout(this);
     row->setContentsMargins(0, 0, 0, 0);
-    row->setSpacing(kSpacing);
+    row->setSpacing(KvBaseOptionsWidget::ControlSpacing);
     row->addWidget(label);
     row->addWidget(m_spinBox);
     row->addStretch(1);

@@ -1,10 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "blocks/measurementstable/KvStatisticsMeasurementsTableOptionsWidget.h"
 
-#include "blocks/common/KvAlignmentOptionsRow.h"
-#include "blocks/common/KvChoiceOptionsRow.h"
-#include "blocks/common/KvColumnsOptionsRow.h"
-#include "blocks/common/KvWidthOptionsRow.h"
 #include "blocks/measurementstable/KvStatisticsMeasurementsTableNodeCfg.h"
 
 #include <QComboBox>
@@ -22,48 +18,16 @@ constexpr int kSpacing = 4;
 
 KvStatisticsMeasurementsTableOptionsWidget::KvStatisticsMeasurementsTableOptionsWidget(
     KvStatisticsMeasurementsTableNodeCfg *cfg, QWidget *parent, bool withPlacement)
-    : KvBaseOptionsWidget(tr("Measurements table"), parent)
+    : KvThemedOptionsWidget(tr("Measurements table"), parent)
     , m_cfg(cfg)
 {
-    qRegisterMetaType<Qt::Alignment>("Qt::Alignment");
-    qRegisterMetaType<QSet<QString>>("QSet<QString>");
     if (withPlacement)
         addPlacementRows();
     addThemeRow();
-    addColumnsRow();
+    addColumnsRow(KvStatisticsMeasurementsTableNodeCfg::columnNames(),
+                  &KvStatisticsMeasurementsTableNodeCfg::columnLabel);
     addOrderRow();
     setFromConfig(cfg);
-}
-
-void KvStatisticsMeasurementsTableOptionsWidget::addPlacementRows()
-{
-    m_widthRow = new KvWidthOptionsRow(this);
-    addRow(m_widthRow);
-    connect(m_widthRow, SIGNAL(signalWidthChanged(int)), this, SLOT(slotWidthEdited(int)));
-    m_alignmentRow = new KvAlignmentOptionsRow(this);
-    addRow(m_alignmentRow);
-    connect(m_alignmentRow, SIGNAL(signalLeftClicked()), this, SLOT(slotAlignLeftClicked()));
-    connect(m_alignmentRow, SIGNAL(signalCenterClicked()), this, SLOT(slotAlignCenterClicked()));
-    connect(m_alignmentRow, SIGNAL(signalRightClicked()), this, SLOT(slotAlignRightClicked()));
-}
-
-void KvStatisticsMeasurementsTableOptionsWidget::addThemeRow()
-{
-    m_themeRow = new KvChoiceOptionsRow(tr("Color theme:"), {tr("Dark"), tr("Light")}, this);
-    addRow(m_themeRow);
-    connect(m_themeRow, SIGNAL(signalToggled()), this, SLOT(slotThemeToggled()));
-}
-
-void KvStatisticsMeasurementsTableOptionsWidget::addColumnsRow()
-{
-    const QStringList &names = KvStatisticsMeasurementsTableNodeCfg::columnNames();
-    QStringList labels;
-    for (const QString &name : names)
-        labels.append(KvStatisticsMeasurementsTableNodeCfg::columnLabel(name));
-    m_columnsRow = new KvColumnsOptionsRow(names, labels, this);
-    addRow(m_columnsRow);
-    connect(m_columnsRow, SIGNAL(signalColumnStateChanged(QString, int)), this,
-                                 SLOT(slotColumnStateChanged(QString, int)));
 }
 
 void KvStatisticsMeasurementsTableOptionsWidget::addOrderRow()
@@ -97,12 +61,9 @@ void KvStatisticsMeasurementsTableOptionsWidget::setFromConfig(const KvBaseEdito
     if (!tableCfg)
         return;
     const QSignalBlocker blocker(this);
-    if (m_widthRow)
-        m_widthRow->setWidthPercent(tableCfg->widthPercent());
-    if (m_alignmentRow)
-        m_alignmentRow->setAlignment(tableCfg->alignment());
-    m_themeRow->setChoice(tableCfg->themeIndex());
-    m_columnsRow->setColumns(tableCfg->columns());
+    showPlacement(tableCfg->widthPercent(), tableCfg->alignment());
+    showTheme(tableCfg->themeIndex());
+    showColumns(tableCfg->columns());
 
     const QSignalBlocker orderBlocker(m_orderBox);
     m_orderBox->setCurrentIndex(0);
@@ -115,7 +76,7 @@ void KvStatisticsMeasurementsTableOptionsWidget::setFromConfig(const KvBaseEdito
 
 void KvStatisticsMeasurementsTableOptionsWidget::selectAlignment(Qt::Alignment alignment)
 {
-    m_alignmentRow->setAlignment(alignment);
+    showAlignment(alignment);
     if (!m_cfg)
         return;
     m_cfg->setAlignment(alignment);
@@ -148,7 +109,7 @@ void KvStatisticsMeasurementsTableOptionsWidget::slotAlignRightClicked()
 
 void KvStatisticsMeasurementsTableOptionsWidget::slotThemeToggled()
 {
-    const int theme = m_themeRow->choice();
+    const int theme = chosenTheme();
     if (!m_cfg || theme < 0)
         return;
     m_cfg->setTheme(theme);
@@ -159,13 +120,8 @@ void KvStatisticsMeasurementsTableOptionsWidget::slotColumnStateChanged(const QS
 {
     if (!m_cfg)
         return;
-    QSet<QString> columns = m_cfg->columns();
-    if (aState == Qt::Checked)
-        columns.insert(aName);
-    else
-        columns.remove(aName);
-    m_cfg->setColumns(columns);
-    emit signalColumnsChanged(columns);
+    m_cfg->setColumns(changedColumns(m_cfg->columns(), aName, aState));
+    emit signalColumnsChanged(m_cfg->columns());
 }
 
 void KvStatisticsMeasurementsTableOptionsWidget::slotOrderBySelected()

@@ -1,24 +1,19 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "blocks/common/KvBaseOptionsWidget.h"
+#include "blocks/common/KvThemedOptionsWidget.h"
 #include "charts/KvChartThemes.h"
 
 #include <QPointer>
-#include <QSet>
 
-class KvAlignmentOptionsRow;
-class KvChoiceOptionsRow;
-class KvColumnsOptionsRow;
 class KvStatisticsMeasurementsTableNodeCfg;
-class KvWidthOptionsRow;
 class QComboBox;
 
 /**
  * Options panel of the measurements table: width, alignment, theme, columns, order of the rows. Every change
  * is written to the configuration and then announced.
  */
-class KvStatisticsMeasurementsTableOptionsWidget : public KvBaseOptionsWidget
+class KvStatisticsMeasurementsTableOptionsWidget : public KvThemedOptionsWidget
 {
     Q_OBJECT
 public:
@@ -47,16 +42,9 @@ private slots:
     void slotWidthEdited(int aWidth);
 
 private:
-    void addPlacementRows();
-    void addThemeRow();
-    void addColumnsRow();
     void addOrderRow();
     void selectAlignment(Qt::Alignment alignment);
 
     QPointer<KvStatisticsMeasurementsTableNodeCfg> m_cfg; ///< the block may die before its panel
-    KvWidthOptionsRow *m_widthRow = nullptr;
-    KvAlignmentOptionsRow *m_alignmentRow = nullptr;
-    KvChoiceOptionsRow *m_themeRow = nullptr;
-    KvColumnsOptionsRow *m_columnsRow = nullptr;
     QComboBox *m_orderBox = nullptr;
 };

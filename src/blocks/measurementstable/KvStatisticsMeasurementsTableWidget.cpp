@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "blocks/measurementstable/KvStatisticsMeasurementsTableWidget.h"
 
+#include "blocks/common/KvColumnsText.h"
 #include "blocks/measurementstable/KvMeasurementsOrder.h"
 #include "blocks/measurementstable/KvStatisticsMeasurementsTableOptionsWidget.h"
 #include "blocks/table/KvTableFonts.h"
 #include "data/KvReportKernelData.h"
 #include "data/KvStatisticsEngine.h"
-#include "templates/KvTemplateContext.h"
 
 namespace {
 
@@ -27,13 +27,9 @@ KvStatisticsMeasurementsTableWidget::KvStatisticsMeasurementsTableWidget(
     : KvStatisticsBaseTableWidget(displayParent, cfg)
     , m_cfg(cfg)
     , m_announcedOptions(cfg->options())
-    , m_announcedTheme(cfg->themeIndex())
 {
     setFonts(KvTableFonts::header(), KvTableFonts::body());
-    connect(&engine(), SIGNAL(signalMeasurementsListUpdated()), this, SLOT(slotUpdateTableContents()));
-    connect(cfg->themes(), SIGNAL(signalThemeChanged()), this, SLOT(slotUpdateTableContents()));
-    if (KvTemplateContext *context = cfg->context())
-        connect(context, SIGNAL(signalContentHeightChanged()), this, SLOT(slotContentHeightChanged()));
+    connectSources();
     slotUpdateTableContents();
 }
 
@@ -45,13 +41,7 @@ QString KvStatisticsMeasurementsTableWidget::displayName() const
 QWidget *KvStatisticsMeasurementsTableWidget::createOptionsWidget(QWidget *parent, bool withPlacement)
 {
     auto *options = new KvStatisticsMeasurementsTableOptionsWidget(m_cfg, parent, withPlacement);
-    connect(options, SIGNAL(signalWidthChanged(int)), this, SLOT(slotWidthChanged(int)));
-    connect(options, SIGNAL(signalAlignmentChanged(Qt::Alignment)), this,
-                            SLOT(slotAlignmentChanged(Qt::Alignment)));
-    connect(options, SIGNAL(signalThemeChanged(kvCharts::KvChartThemes::ThemeType)), this,
-                            SLOT(slotThemeChanged(kvCharts::KvChartThemes::ThemeType)));
-    connect(options, SIGNAL(signalColumnsChanged(QSet<QString>)), this,
-                            SLOT(slotColumnsChanged(QSet<QString>)));
+    connectOptions(options);
     connect(options, SIGNAL(signalOrderByChanged(QString, bool)), this,
                             SLOT(slotOrderBySelected(QString, bool)));
     return options;
@@ -70,23 +60,12 @@ Qt::Alignment KvStatisticsMeasurementsTableWidget::alignment() const
 void KvStatisticsMeasurementsTableWidget::slotUpdateTableContents()
 {
     startUpdate();
-    const QVector<int> columns = shownColumns();
+    const QVector<int> columns =
+        KvColumnsText::indexes(KvStatisticsMeasurementsTableNodeCfg::columnNames(), m_cfg->columns());
     fillHeader(columns);
     if (!columns.isEmpty())
         fillBody(columns);
     finishUpdate();
-}
-
-QVector<int> KvStatisticsMeasurementsTableWidget::shownColumns() const
-{
-    const QStringList &names = KvStatisticsMeasurementsTableNodeCfg::columnNames();
-    const QSet<QString> selected = m_cfg->columns();
-    QVector<int> columns;
-    for (int i = 0; i < names.size(); ++i) {
-        if (selected.contains(names.at(i)))
-            columns.append(i);
-    }
-    return columns;
 }
 
 void KvStatisticsMeasurementsTableWidget::fillHeader(const QVector<int> &columns)
@@ -121,12 +100,7 @@ void KvStatisticsMeasurementsTableWidget::fillBody(const QVector<int> &columns)
 
 bool KvStatisticsMeasurementsTableWidget::takeOptionsChange()
 {
-    // The options panel has written the configuration already, so the configuration cannot tell what changed.
-    if (m_cfg->options() == m_announcedOptions)
-        return false;
-    m_announcedOptions = m_cfg->options();
-    announceConfigChanged();
-    return true;
+    return announceChange(m_cfg->options(), m_announcedOptions);
 }
 
 void KvStatisticsMeasurementsTableWidget::slotWidthChanged(int aWidth)
@@ -159,12 +133,7 @@ void KvStatisticsMeasurementsTableWidget::slotOrderBySelected(QString aColumnNam
 
 void KvStatisticsMeasurementsTableWidget::slotThemeChanged(kvCharts::KvChartThemes::ThemeType aTheme)
 {
-    // The themes object announces the change itself, which refills the table.
-    m_cfg->setTheme(static_cast<int>(aTheme));
-    if (m_cfg->themeIndex() == m_announcedTheme)
-        return;
-    m_announcedTheme = m_cfg->themeIndex();
-    announceConfigChanged();
+    changeTheme(static_cast<int>(aTheme));
 }
 
 void KvStatisticsMeasurementsTableWidget::slotContentHeightChanged()

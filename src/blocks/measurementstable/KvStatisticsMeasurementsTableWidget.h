@@ -32,7 +32,6 @@ protected:
     Qt::Alignment alignment() const override;
 
 private:
-    QVector<int> shownColumns() const;
     void fillHeader(const QVector<int> &columns);
     void fillBody(const QVector<int> &columns);
 
@@ -41,5 +40,4 @@ private:
 
     KvStatisticsMeasurementsTableNodeCfg *m_cfg;
     KvStatisticsMeasurementsTableNodeCfg::Options m_announcedOptions;
-    int m_announcedTheme;
 };

@@ -26,6 +26,7 @@ KvStatisticsBaseTableWidget::KvStatisticsBaseTableWidget(QWidget *displayParent,
                                                          KvStatisticsThemedNodeCfg *cfg)
     : m_engine(KvStatisticsEngine::instance())
     , m_cfg(cfg)
+    , m_announcedTheme(cfg->themeIndex())
     , m_displayParent(displayParent)
     , m_delegate(std::make_unique<KvBaseTableItemDelegate>(cfg->themes()))
     , m_contents(std::make_shared<KvTableContents>())
@@ -130,6 +131,25 @@ void KvStatisticsBaseTableWidget::setFonts(const QFont &headerFont, const QFont 
     m_contents->bodyFont = bodyFont;
 }
 
+void KvStatisticsBaseTableWidget::connectSources()
+{
+    connect(&m_engine, SIGNAL(signalMeasurementsListUpdated()), this, SLOT(slotUpdateTableContents()));
+    connect(m_cfg->themes(), SIGNAL(signalThemeChanged()), this, SLOT(slotUpdateTableContents()));
+    if (KvTemplateContext *context = m_cfg->context())
+        connect(context, SIGNAL(signalContentHeightChanged()), this, SLOT(slotContentHeightChanged()));
+}
+
+void KvStatisticsBaseTableWidget::connectOptions(QWidget *options)
+{
+    connect(options, SIGNAL(signalWidthChanged(int)), this, SLOT(slotWidthChanged(int)));
+    connect(options, SIGNAL(signalAlignmentChanged(Qt::Alignment)), this,
+                            SLOT(slotAlignmentChanged(Qt::Alignment)));
+    connect(options, SIGNAL(signalThemeChanged(kvCharts::KvChartThemes::ThemeType)), this,
+                            SLOT(slotThemeChanged(kvCharts::KvChartThemes::ThemeType)));
+    connect(options, SIGNAL(signalColumnsChanged(QSet<QString>)), this,
+                            SLOT(slotColumnsChanged(QSet<QString>)));
+}
+
 void KvStatisticsBaseTableWidget::reserve(int bodyRows, int columns)
 {
     m_contents->body.reserve(bodyRows, columns);
@@ -202,4 +222,10 @@ void KvStatisticsBaseTableWidget::announceConfigChanged()
     emit displaySignals()->signalWidgetConfigChanged(m_cfg);
     if (KvTemplateContext *context = m_cfg->context())
         emit context->signalTemplateModified();
+}
+
+void KvStatisticsBaseTableWidget::changeTheme(int theme)
+{
+    m_cfg->setTheme(theme);
+    announceChange(m_cfg->themeIndex(), m_announcedTheme);
 }

@@ -55,6 +55,12 @@ protected:
     KvStatisticsBaseTableWidget(QWidget *displayParent, KvStatisticsThemedNodeCfg *cfg);
 
     void setFonts(const QFont &headerFont, const QFont &bodyFont);
+    /** Connects measurements, theme and page height by name to slotUpdateTableContents() and
+     * slotContentHeightChanged(), which every table block declares. */
+    void connectSources();
+    /** Connects what the panels of all table blocks have by name to the block's slotWidthChanged(int),
+     * slotAlignmentChanged(), slotThemeChanged() and slotColumnsChanged(). */
+    void connectOptions(QWidget *options);
     /**
      * Empties the grid for a new filling, which finishUpdate() ends. Unlike clear() it leaves the pieces
      * alone: they are refilled at the end, and every reset of a piece costs as much as filling it.
@@ -71,6 +77,23 @@ protected:
     /** After the user changed an option: tells the window, which may save it, and marks the template
      * modified. */
     void announceConfigChanged();
+    /**
+     * Whether \a current differs from \a announced, which becomes equal to it; the change is announced then.
+     * The options panel has written to the configuration before, so the configuration cannot tell what
+     * changed.
+     */
+    template <typename Options>
+    bool announceChange(const Options &current, Options &announced)
+    {
+        if (current == announced)
+            return false;
+        announced = current;
+        announceConfigChanged();
+        return true;
+    }
+    /** Takes over the theme that the user chose and announces a real change. The themes object announces it
+     * itself, which refills the table. */
+    void changeTheme(int theme);
 
     /** Width of the table in percent of the width between the margins. */
     virtual int widthPercent() const = 0;
@@ -89,6 +112,7 @@ private:
 
     KvStatisticsEngine &m_engine;
     KvStatisticsThemedNodeCfg *m_cfg;
+    int m_announcedTheme;
     QPointer<QWidget> m_displayParent;
     std::unique_ptr<KvBaseTableItemDelegate> m_delegate;
     float m_scale = 1.0f; ///< reserved for zoomed tables; nothing reads it

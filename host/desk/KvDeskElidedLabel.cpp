@@ -1,0 +1,30 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskElidedLabel.h"
+
+#include <QPainter>
+#include <QStyle>
+
+QSize KvDeskElidedLabel::minimumSizeHint() const
+{
+    return QSize(fontMetrics().horizontalAdvance(QLatin1Char('m')) * 4, QLabel::minimumSizeHint().height());
+}
+
+QString KvDeskElidedLabel::shownText() const
+{
+    return fontMetrics().elidedText(text(), Qt::ElideRight, contentsRect().width());
+}
+
+void KvDeskElidedLabel::paintEvent(QPaintEvent *event)
+{
+    Q_UNUSED(event)
+    QPainter painter(this);
+    style()->drawItemText(&painter, contentsRect(),
+                          static_cast<int>(QStyle::visualAlignment(layoutDirection(), alignment())),
+                          palette(), isEnabled(), shownText(), foregroundRole());
+}
+
+void KvDeskElidedLabel::resizeEvent(QResizeEvent *event)
+{
+    QLabel::resizeEvent(event);
+    setToolTip(shownText() == text() ? QString() : text());
+}

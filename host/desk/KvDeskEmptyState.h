@@ -1,0 +1,25 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QWidget>
+
+class QAction;
+class QHBoxLayout;
+
+/** What a view shows while it has nothing to show: what to do next, and buttons that do it. Covers its
+ * parent. */
+class KvDeskEmptyState : public QWidget
+{
+    Q_OBJECT
+public:
+    KvDeskEmptyState(const QString &text, QWidget *parent);
+
+    /** Adds a button for an action, which has to live on; \a isPrimary draws it in the accent colour. */
+    void addAction(QAction *action, bool isPrimary);
+
+protected:
+    bool eventFilter(QObject *watched, QEvent *event) override;
+
+private:
+    QHBoxLayout *m_buttons = nullptr;
+};

@@ -1,0 +1,19 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QString>
+#include <QStringList>
+
+/** Tells what a file is to the program. */
+class KvDeskFileKind
+{
+public:
+    enum Kind { Session, Image, Table };
+
+    /** By the file's suffix; one that says nothing is told by the file's first bytes. */
+    static Kind of(const QString &path);
+
+    /** Patterns for file dialogs, such as "*.png". */
+    static QStringList imagePatterns();
+    static QStringList tablePatterns();
+};

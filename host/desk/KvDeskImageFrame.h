@@ -1,0 +1,39 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QImage>
+#include <QRectF>
+
+class QPainter;
+
+/**
+ * The picture behind the objects, drawn at any scale: averaged where it is reduced, smooth at about its own
+ * size, in plain pixels where it is enlarged.
+ */
+class KvDeskImageFrame
+{
+public:
+    /** \a sceneRect is where the picture lies in the scene. */
+    void set(const QImage &image, const QRectF &sceneRect);
+    void clear() { set(QImage(), QRectF()); }
+
+    bool isNull() const { return m_image.isNull(); }
+    const QImage &image() const { return m_image; }
+    QRectF sceneRect() const { return m_sceneRect; }
+    /** Whether these are the picture and the place that are set already. */
+    bool isSame(const QImage &image, const QRectF &sceneRect) const;
+
+    /**
+     * Draws the part of the picture in \a exposed, in scene coordinates.
+     * \param scale device pixels per scene unit
+     */
+    void draw(QPainter *painter, const QRectF &exposed, double scale) const;
+
+private:
+    const QImage &imageFor(double pixelScale) const;
+
+    QImage m_image;
+    QRectF m_sceneRect;
+    mutable QImage m_reduced; ///< the picture at half, a quarter, ... of its size; made when drawn
+    mutable int m_reduction = 0;
+};

@@ -1,0 +1,414 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskMainWindow.h"
+
+#include "KvDeskActions.h"
+#include "KvDeskEmptyState.h"
+#include "KvDeskFileCommands.h"
+#include "KvDeskImageView.h"
+#include "KvDeskRecentFiles.h"
+#include "KvDeskResources.h"
+#include "KvDeskSession.h"
+#include "KvDeskSettingsDialog.h"
+#include "KvDeskStatusBar.h"
+#include "KvDeskStatusLog.h"
+#include "KvDeskTheme.h"
+#include "KvDeskToolColumn.h"
+#include "KvDeskValueTable.h"
+#include "gui/KvToolBase.h"
+#include "gui/acss.h"
+#include "kernel/ZtAppSettings.h"
+#include "kernel/ZtSignalCenter.h"
+#include "measuring/ZtMeasuringDocument.h"
+
+#include <QAction>
+#include <QApplication>
+#include <QCloseEvent>
+#include <QDir>
+#include <QHBoxLayout>
+#include <QMenu>
+#include <QMenuBar>
+#include <QMessageBox>
+#include <QMimeData>
+#include <QSplitter>
+#include <QToolBar>
+#include <QToolButton>
+#include <QUrl>
+
+namespace {
+
+constexpr QSize firstSize(1280, 800);
+constexpr QSize smallestSize(800, 520);
+constexpr int valuesWidth = 416;
+constexpr int logHeight = 144;
+
+const char windowGroup[] = "DeskWindow";
+const char geometryKey[] = "geometry";
+const char stateKey[] = "state";
+const char imageSplitterKey[] = "imageSplitter";
+const char logSplitterKey[] = "logSplitter";
+const char valuesKey[] = "valuesVisible";
+const char logKey[] = "logVisible";
+const char toolsKey[] = "activeTools";
+
+QStringList localFiles(const QMimeData *data)
+{
+    QStringList files;
+    for (const QUrl &url : data->urls()) {
+        if (url.isLocalFile())
+            files.append(url.toLocalFile());
+    }
+    return files;
+}
+
+// Only what a user would call a window: no menus, tool tips or the like.
+bool isOpenWindow(const QWidget *widget)
+{
+    const bool isWindow = widget->windowType() == Qt::Window || widget->windowType() == Qt::Dialog ||
+                          widget->windowType() == Qt::Tool;
+    return isWindow && widget->isVisible();
+}
+
+} // namespace
+
+KvDeskMainWindow::KvDeskMainWindow(ZtMeasuringDocument *document, QWidget *parent)
+    : KvGuiMainWindowBase(parent)
+    , m_actions((KvDeskResources::ensure(), new KvDeskActions(this)))
+    , m_session(new KvDeskSession(document, this))
+    , m_files(new KvDeskFileCommands(m_session, this))
+{
+    setObjectName(QStringLiteral("DeskMainWindow"));
+    setWindowIcon(QIcon(acss::getPathSVG(QStringLiteral("Icons/measuringdesk"))));
+    setAcceptDrops(true);
+    // The tool bar stays: a context menu could only hide it.
+    setContextMenuPolicy(Qt::PreventContextMenu);
+    setMinimumSize(smallestSize);
+    createPanels();
+    createMenus();
+    createToolBar();
+    connectSignals();
+    connectActions();
+    m_imageView->setDocument(document);
+    restoreWindow();
+    slotStateChanged();
+    m_imageView->setFocus();
+}
+
+KvDeskMainWindow::~KvDeskMainWindow() = default;
+
+void KvDeskMainWindow::createPanels()
+{
+    m_toolColumn = new KvDeskToolColumn(this);
+    m_imageView = new KvDeskImageView(this);
+    m_imageView->emptyState()->addAction(m_actions->action(KvDeskActions::OpenImage), true);
+    m_imageView->emptyState()->addAction(m_actions->action(KvDeskActions::OpenSession), false);
+    m_valueTable = new KvDeskValueTable(this);
+    m_statusLog = new KvDeskStatusLog(this);
+    m_statusBar = new KvDeskStatusBar(this);
+    setStatusBar(m_statusBar);
+
+    m_imageSplitter = new QSplitter(Qt::Horizontal, this);
+    m_imageSplitter->addWidget(m_imageView);
+    m_imageSplitter->addWidget(m_valueTable);
+    m_imageSplitter->setChildrenCollapsible(false);
+    m_imageSplitter->setStretchFactor(0, 1);
+    m_imageSplitter->setSizes({firstSize.width() - valuesWidth, valuesWidth});
+    m_logSplitter = new QSplitter(Qt::Vertical, this);
+    m_logSplitter->addWidget(m_imageSplitter);
+    m_logSplitter->addWidget(m_statusLog);
+    m_logSplitter->setChildrenCollapsible(false);
+    m_logSplitter->setStretchFactor(0, 1);
+    m_logSplitter->setSizes({firstSize.height() - logHeight, logHeight});
+
+    auto *const central = new QWidget(this);
+    auto *const layout = new QHBoxLayout(central);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(0);
+    layout->addWidget(m_toolColumn);
+    layout->addWidget(m_logSplitter, 1);
+    setCentralWidget(central);
+    m_toolColumn->hide();
+}
+
+void KvDeskMainWindow::createMenus()
+{
+    using A = KvDeskActions;
+    const auto add = [this](QMenu *menu, std::initializer_list<A::Id> ids) {
+        for (const A::Id id : ids)
+            menu->addAction(m_actions->action(id));
+    };
+    QMenu *const file = menuBar()->addMenu(tr("&File"));
+    add(file, {A::NewSession, A::OpenSession});
+    m_recentMenu = file->addMenu(acss::createIcon(6, QStringLiteral("Icons/recent"), QSize(24, 24)),
+                                 tr("&Recent sessions"));
+    m_recentMenu->setToolTipsVisible(true);
+    add(file, {A::OpenImage, A::ImportTable});
+    file->addSeparator();
+    add(file, {A::SaveSession, A::SaveSessionAs});
+    file->addSeparator();
+    add(file, {A::Settings});
+    file->addSeparator();
+    add(file, {A::Quit});
+    QMenu *const view = menuBar()->addMenu(tr("&View"));
+    add(view, {A::ZoomIn, A::ZoomOut, A::ZoomFit, A::ZoomActual});
+    view->addSeparator();
+    add(view, {A::ShowValues, A::ShowLog});
+    view->addSeparator();
+    add(view, {A::ToggleTheme});
+    QMenu *const help = menuBar()->addMenu(tr("&Help"));
+    add(help, {A::About});
+}
+
+void KvDeskMainWindow::createToolBar()
+{
+    using A = KvDeskActions;
+    QToolBar *const bar = addToolBar(tr("Main tool bar"));
+    bar->setObjectName(QStringLiteral("MainToolBar"));
+    bar->setMovable(false);
+    bar->setIconSize(QSize(24, 24));
+    const auto add = [this, bar](std::initializer_list<A::Id> ids) {
+        for (const A::Id id : ids)
+            bar->addAction(m_actions->action(id));
+    };
+    add({A::OpenImage, A::OpenSession, A::SaveSession, A::ImportTable});
+    bar->addSeparator();
+    add({A::ZoomOut, A::ZoomIn, A::ZoomFit, A::ZoomActual});
+    auto *const space = new QWidget(bar);
+    space->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Preferred);
+    bar->addWidget(space);
+    add({A::ShowLog, A::ShowValues});
+    bar->addSeparator();
+    add({A::ToggleTheme, A::Settings});
+}
+
+void KvDeskMainWindow::connectSignals()
+{
+    connect(m_session, SIGNAL(signalStateChanged()), this, SLOT(slotStateChanged()));
+    connect(m_session->document(), SIGNAL(signalCalibrationChanged()), this, SLOT(slotImageStateChanged()));
+    connect(m_imageView, SIGNAL(signalFrameChanged()), this, SLOT(slotImageStateChanged()));
+    connect(m_imageView, SIGNAL(signalZoomChanged(double)), m_statusBar, SLOT(slotZoomChanged(double)));
+    connect(m_imageView, SIGNAL(signalPointerMoved(QPointF)), m_statusBar, SLOT(slotPointerMoved(QPointF)));
+    connect(m_imageView, SIGNAL(signalPointerLeft()), m_statusBar, SLOT(slotPointerLeft()));
+    connect(m_imageView, SIGNAL(signalObjectClicked(int,int)), m_valueTable, SLOT(slotSelectObject(int,int)));
+    connect(m_valueTable, SIGNAL(signalObjectSelected(int,int)), m_imageView,
+                                 SLOT(slotSelectObject(int,int)));
+    connect(m_valueTable, SIGNAL(signalCloseClicked()), this, SLOT(slotHideValues()));
+    connect(m_statusLog, SIGNAL(signalCloseClicked()), this, SLOT(slotHideLog()));
+    connect(m_recentMenu, SIGNAL(aboutToShow()), this, SLOT(slotFillRecentMenu()));
+    connect(m_recentMenu, SIGNAL(triggered(QAction*)), this, SLOT(slotRecentTriggered(QAction*)));
+    connect(ZtStatusLog::getInstance(), SIGNAL(signalEntryLogged(ZtStatusEntry)), this,
+                                               SLOT(slotEntryLogged(ZtStatusEntry)));
+}
+
+void KvDeskMainWindow::connectActions()
+{
+    using A = KvDeskActions;
+    const auto onTrigger = [this](A::Id id, QObject *receiver, const char *slot) {
+        connect(m_actions->action(id), SIGNAL(triggered()), receiver, slot);
+    };
+    onTrigger(A::NewSession, m_files, SLOT(slotNewSession()));
+    onTrigger(A::OpenImage, m_files, SLOT(slotOpenImage()));
+    onTrigger(A::OpenSession, m_files, SLOT(slotOpenSession()));
+    onTrigger(A::ImportTable, m_files, SLOT(slotImportTable()));
+    onTrigger(A::SaveSession, m_files, SLOT(slotSaveSession()));
+    onTrigger(A::SaveSessionAs, m_files, SLOT(slotSaveSessionAs()));
+    onTrigger(A::Quit, this, SLOT(close()));
+    onTrigger(A::ZoomIn, m_imageView, SLOT(slotZoomIn()));
+    onTrigger(A::ZoomOut, m_imageView, SLOT(slotZoomOut()));
+    onTrigger(A::ZoomFit, m_imageView, SLOT(slotZoomFit()));
+    onTrigger(A::ZoomActual, m_imageView, SLOT(slotZoomActual()));
+    onTrigger(A::ToggleTheme, this, SLOT(slotToggleTheme()));
+    onTrigger(A::Settings, this, SLOT(slotSettings()));
+    onTrigger(A::About, this, SLOT(slotAbout()));
+    connect(m_actions->action(A::ShowValues), SIGNAL(toggled(bool)), m_valueTable, SLOT(setVisible(bool)));
+    connect(m_actions->action(A::ShowLog), SIGNAL(toggled(bool)), m_statusLog, SLOT(setVisible(bool)));
+}
+
+void KvDeskMainWindow::placeTool(KvToolBase *tool)
+{
+    m_toolColumn->addTool(tool);
+    m_toolColumn->show();
+}
+
+void KvDeskMainWindow::restoreTools()
+{
+    ZtAppSettings::beginGroupAbsolute(QLatin1String(windowGroup));
+    const bool isFirstTime = !ZtAppSettings::contains(QLatin1String(toolsKey));
+    const QStringList active = ZtAppSettings::value(QLatin1String(toolsKey)).toStringList();
+    ZtAppSettings::endGroup();
+    const QList<KvToolBase *> all = tools();
+    for (KvToolBase *const tool : all) {
+        const bool isWanted = isFirstTime ? tool == all.first() : active.contains(tool->name());
+        if (isWanted && tool->isEnabled())
+            tool->getToolButton()->setChecked(true);
+    }
+}
+
+QStringList KvDeskMainWindow::activeTools() const
+{
+    QStringList names;
+    for (const KvToolBase *const tool : tools()) {
+        if (tool->isActivated())
+            names.append(tool->name());
+    }
+    return names;
+}
+
+void KvDeskMainWindow::restoreWindow()
+{
+    ZtAppSettings::beginGroupAbsolute(QLatin1String(windowGroup));
+    const auto bytes = [](const char *key) { return ZtAppSettings::value(QLatin1String(key)).toByteArray(); };
+    if (!restoreGeometry(bytes(geometryKey)))
+        resize(firstSize);
+    restoreState(bytes(stateKey));
+    m_imageSplitter->restoreState(bytes(imageSplitterKey));
+    m_logSplitter->restoreState(bytes(logSplitterKey));
+    const bool valuesVisible = ZtAppSettings::value(QLatin1String(valuesKey), true).toBool();
+    const bool logVisible = ZtAppSettings::value(QLatin1String(logKey), false).toBool();
+    ZtAppSettings::endGroup();
+    m_actions->action(KvDeskActions::ShowValues)->setChecked(valuesVisible);
+    m_valueTable->setVisible(valuesVisible);
+    m_actions->action(KvDeskActions::ShowLog)->setChecked(logVisible);
+    m_statusLog->setVisible(logVisible);
+}
+
+void KvDeskMainWindow::saveWindow() const
+{
+    ZtAppSettings::beginGroupAbsolute(QLatin1String(windowGroup));
+    ZtAppSettings::setValue(QLatin1String(geometryKey), saveGeometry());
+    ZtAppSettings::setValue(QLatin1String(stateKey), saveState());
+    ZtAppSettings::setValue(QLatin1String(imageSplitterKey), m_imageSplitter->saveState());
+    ZtAppSettings::setValue(QLatin1String(logSplitterKey), m_logSplitter->saveState());
+    ZtAppSettings::setValue(QLatin1String(valuesKey),
+                            m_actions->action(KvDeskActions::ShowValues)->isChecked());
+    ZtAppSettings::setValue(QLatin1String(logKey), m_actions->action(KvDeskActions::ShowLog)->isChecked());
+    ZtAppSettings::setValue(QLatin1String(toolsKey), activeTools());
+    ZtAppSettings::endGroup();
+}
+
+void KvDeskMainWindow::closeEvent(QCloseEvent *event)
+{
+    if (m_isClosed)
+        return;
+    if (!m_files->maybeSave() || !closeOtherWindows()) {
+        event->ignore();
+        return;
+    }
+    m_isClosed = true;
+    saveWindow();
+    emit ZtSignalCenter::getInstance()->signalAppAboutToClose();
+    event->accept();
+    emit signalClosed();
+}
+
+// The windows of plug-ins ask about unsaved changes of their own, and may hold the program back.
+bool KvDeskMainWindow::closeOtherWindows()
+{
+    QList<QPointer<QWidget>> windows;
+    for (QWidget *const widget : QApplication::topLevelWidgets()) {
+        if (widget != this && isOpenWindow(widget))
+            windows.append(widget);
+    }
+    for (const QPointer<QWidget> &other : qAsConst(windows)) {
+        if (other && !other->close())
+            return false;
+    }
+    return true;
+}
+
+void KvDeskMainWindow::dragEnterEvent(QDragEnterEvent *event)
+{
+    if (localFiles(event->mimeData()).isEmpty())
+        return;
+    event->setDropAction(Qt::CopyAction);
+    event->accept();
+}
+
+void KvDeskMainWindow::dropEvent(QDropEvent *event)
+{
+    event->setDropAction(Qt::CopyAction);
+    event->accept();
+    for (const QString &file : localFiles(event->mimeData()))
+        m_files->openFile(file);
+}
+
+void KvDeskMainWindow::slotStateChanged()
+{
+    //: %1 is the name of a session; [*] is replaced by a star when it has unsaved changes
+    setWindowTitle(tr("%1[*] - Measuring Desk").arg(m_session->displayName()));
+    setWindowModified(m_session->isModified());
+    setWindowFilePath(m_session->path());
+}
+
+void KvDeskMainWindow::slotImageStateChanged()
+{
+    m_statusBar->setImage(m_imageView->frame().image().size(),
+                          m_session->document()->calibration().micrometresPerPixel());
+    m_statusBar->slotZoomChanged(m_imageView->zoom());
+}
+
+void KvDeskMainWindow::slotFillRecentMenu()
+{
+    m_recentMenu->clear();
+    for (const QString &path : KvDeskRecentFiles::paths()) {
+        // An ampersand would underline the letter after it.
+        QAction *const action = m_recentMenu->addAction(
+            QFileInfo(path).fileName().replace(QLatin1Char('&'), QLatin1String("&&")));
+        action->setData(path);
+        action->setToolTip(QDir::toNativeSeparators(path));
+    }
+    if (m_recentMenu->isEmpty())
+        m_recentMenu->addAction(tr("None yet"))->setEnabled(false);
+}
+
+void KvDeskMainWindow::slotRecentTriggered(QAction *aAction)
+{
+    const QString path = aAction->data().toString();
+    if (!m_files->openSession(path) && !QFileInfo::exists(path))
+        KvDeskRecentFiles::remove(path);
+}
+
+void KvDeskMainWindow::slotHideValues()
+{
+    m_actions->action(KvDeskActions::ShowValues)->setChecked(false);
+}
+
+void KvDeskMainWindow::slotHideLog()
+{
+    m_actions->action(KvDeskActions::ShowLog)->setChecked(false);
+}
+
+void KvDeskMainWindow::slotToggleTheme()
+{
+    KvDeskTheme::toggle();
+}
+
+void KvDeskMainWindow::slotSettings()
+{
+    KvDeskSettingsDialog dialog(this);
+    dialog.exec();
+}
+
+void KvDeskMainWindow::slotAbout()
+{
+    QMessageBox::about(
+        this, tr("About Measuring Desk"),
+        tr("<b>Measuring Desk %1</b><p>Measures objects on images, and hosts plug-ins such as the "
+           "statistics reports.</p><p>%2, MIT licence</p>")
+            .arg(ZtAppSettings::getProgramVersion(), ZtAppSettings::getVendor()));
+}
+
+void KvDeskMainWindow::slotEntryLogged(const ZtStatusEntry &aEntry)
+{
+    const bool isProblem = aEntry.category == ZtAppStatus::Warning || aEntry.category == ZtAppStatus::Error;
+    if (aEntry.destination == ZtAppStatus::StatusPanel && isProblem)
+        m_actions->action(KvDeskActions::ShowLog)->setChecked(true);
+    // Later: whoever reports is in the middle of something.
+    if (aEntry.destination == ZtAppStatus::MessageBox)
+        QMetaObject::invokeMethod(this, "slotShowMessage", Qt::QueuedConnection,
+                                  Q_ARG(QString, aEntry.message));
+}
+
+void KvDeskMainWindow::slotShowMessage(const QString &aMessage)
+{
+    QMessageBox::warning(this, tr("Measuring Desk"), aMessage);
+}

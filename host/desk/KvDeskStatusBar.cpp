@@ -1,0 +1,145 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskStatusBar.h"
+
+#include "KvDeskElidedLabel.h"
+#include "KvDeskStatus.h"
+#include "gui/QtAdvancedStylesheet.h"
+#include "gui/acss.h"
+
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QVariant>
+#include <QtMath>
+
+namespace {
+
+constexpr int toolIconStyle = 6;
+constexpr QSize iconSize(16, 16);
+
+QLabel *caption(QWidget *parent)
+{
+    auto *const label = new QLabel(parent);
+    label->setProperty("caption", true);
+    // Numbers and units read from left to right in every language.
+    label->setLayoutDirection(Qt::LeftToRight);
+    return label;
+}
+
+} // namespace
+
+KvDeskStatusBar::KvDeskStatusBar(QWidget *parent)
+    : QStatusBar(parent)
+    , m_icon(new QLabel(this))
+    , m_category(new QLabel(this))
+    , m_message(new KvDeskElidedLabel(this))
+    , m_position(caption(this))
+    , m_image(caption(this))
+    , m_zoom(caption(this))
+{
+    setProperty("panel", true);
+    setSizeGripEnabled(false);
+    setContentsMargins(8, 0, 8, 0);
+    auto *const messageRow = new QWidget(this);
+    auto *const layout = new QHBoxLayout(messageRow);
+    layout->setContentsMargins(0, 4, 0, 4);
+    layout->setSpacing(8);
+    layout->addWidget(m_icon);
+    layout->addWidget(m_category);
+    layout->addWidget(m_message, 1);
+    addWidget(messageRow, 1);
+    for (QLabel *const label : {m_position, m_image, m_zoom}) {
+        label->setContentsMargins(8, 0, 8, 0);
+        addPermanentWidget(label);
+    }
+    const ZtStatusLog *const log = ZtStatusLog::getInstance();
+    connect(log, SIGNAL(signalEntryLogged(ZtStatusEntry)), this, SLOT(slotEntryLogged(ZtStatusEntry)));
+    connect(log, SIGNAL(signalCleared()), this, SLOT(slotCleared()));
+    connect(acss::QtAdvancedStylesheet::getInstance(), SIGNAL(currentThemeChanged(QString)), this,
+                                                              SLOT(slotThemeChanged()));
+    setImage(QSize(), 0.0);
+    showLastEntry();
+}
+
+void KvDeskStatusBar::showLastEntry()
+{
+    const QVector<ZtStatusEntry> &entries = ZtStatusLog::getInstance()->entries();
+    if (entries.isEmpty())
+        slotCleared();
+    else
+        showEntry(entries.last());
+}
+
+void KvDeskStatusBar::showEntry(const ZtStatusEntry &entry)
+{
+    m_icon->setPixmap(acss::createIcon(toolIconStyle, KvDeskStatus::iconPath(entry.category), iconSize)
+                          .pixmap(window()->windowHandle(), iconSize));
+    m_category->setText(KvDeskStatus::categoryName(entry.category));
+    QPalette colors = m_category->palette();
+    colors.setColor(QPalette::WindowText, KvDeskStatus::color(entry.category));
+    m_category->setPalette(colors);
+    m_message->setText(entry.message.simplified());
+}
+
+void KvDeskStatusBar::slotEntryLogged(const ZtStatusEntry &aEntry)
+{
+    showEntry(aEntry);
+}
+
+void KvDeskStatusBar::slotCleared()
+{
+    m_icon->setPixmap(QPixmap());
+    m_category->clear();
+    m_message->clear();
+}
+
+void KvDeskStatusBar::slotThemeChanged()
+{
+    showLastEntry();
+}
+
+QString KvDeskStatusBar::message() const
+{
+    return m_message->text();
+}
+
+void KvDeskStatusBar::setImage(const QSize &size, double pixelSize)
+{
+    QString text = size.isEmpty() ? QString() : tr("%1 × %2 px").arg(size.width()).arg(size.height());
+    if (!size.isEmpty() && pixelSize > 0.0)
+        text += tr(", %1 μm/px", "size of a pixel").arg(pixelSize, 0, 'g', 4);
+    m_image->setText(text);
+    m_image->setVisible(!text.isEmpty());
+    m_zoom->setVisible(!text.isEmpty());
+    slotPointerLeft();
+}
+
+QString KvDeskStatusBar::imageText() const
+{
+    return m_image->text();
+}
+
+QString KvDeskStatusBar::zoomText() const
+{
+    return m_zoom->text();
+}
+
+QString KvDeskStatusBar::positionText() const
+{
+    return m_position->text();
+}
+
+void KvDeskStatusBar::slotZoomChanged(double aZoom)
+{
+    m_zoom->setText(tr("%1 %", "zoom").arg(qRound(aZoom * 100.0)));
+}
+
+void KvDeskStatusBar::slotPointerMoved(QPointF aPosition)
+{
+    m_position->setText(
+        tr("x %1, y %2", "pixel below the pointer").arg(qFloor(aPosition.x())).arg(qFloor(aPosition.y())));
+}
+
+void KvDeskStatusBar::slotPointerLeft()
+{
+    m_position->clear();
+}

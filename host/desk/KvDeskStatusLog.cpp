@@ -1,0 +1,74 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskStatusLog.h"
+
+#include "KvDeskEmptyState.h"
+#include "KvDeskPanelHeader.h"
+#include "KvDeskStatusLogModel.h"
+#include "KvDeskTableView.h"
+#include "common/ZtAppStatus.h"
+#include "gui/QtAdvancedStylesheet.h"
+
+#include <QHeaderView>
+#include <QScrollBar>
+#include <QToolButton>
+
+KvDeskStatusLog::KvDeskStatusLog(QWidget *parent)
+    : KvDeskPanel(tr("Status log"), tr("Hide the status log"), parent)
+    , m_model(new KvDeskStatusLogModel(this))
+    , m_clearButton(header()->addButton(QStringLiteral("Icons/status-clear"), tr("Clear the status log")))
+{
+    createView();
+    setContent(m_view);
+    connectSignals();
+    slotRowsChanged();
+}
+
+void KvDeskStatusLog::createView()
+{
+    m_view = new KvDeskTableView(this);
+    m_view->setAccessibleName(tr("Status log"));
+    m_view->setModel(m_model);
+    m_view->setIconSize(QSize(16, 16));
+    m_view->horizontalHeader()->hide();
+    m_view->horizontalHeader()->setStretchLastSection(true);
+    m_view->setColumnWidth(KvDeskStatusLogModel::CategoryColumn, 112);
+    m_view->setColumnWidth(KvDeskStatusLogModel::TimeColumn, 72);
+    m_emptyState =
+        new KvDeskEmptyState(tr("Messages of the program and its plug-ins appear here"), m_view->viewport());
+}
+
+void KvDeskStatusLog::connectSignals()
+{
+    connect(m_clearButton, SIGNAL(clicked()), this, SLOT(slotClear()));
+    connect(m_model, SIGNAL(rowsAboutToBeInserted(QModelIndex,int,int)), this, SLOT(slotBeforeInsert()));
+    connect(m_model, SIGNAL(rowsInserted(QModelIndex,int,int)), this, SLOT(slotRowsChanged()));
+    connect(m_model, SIGNAL(modelReset()), this, SLOT(slotRowsChanged()));
+    connect(acss::QtAdvancedStylesheet::getInstance(), SIGNAL(currentThemeChanged(QString)), this,
+                                                              SLOT(slotThemeChanged()));
+}
+
+void KvDeskStatusLog::slotBeforeInsert()
+{
+    const QScrollBar *const bar = m_view->verticalScrollBar();
+    m_isAtEnd = bar->value() == bar->maximum();
+}
+
+void KvDeskStatusLog::slotRowsChanged()
+{
+    const bool isEmpty = m_model->rowCount() == 0;
+    m_emptyState->setVisible(isEmpty);
+    m_clearButton->setEnabled(!isEmpty);
+    if (m_isAtEnd)
+        m_view->scrollToBottom();
+}
+
+void KvDeskStatusLog::slotClear()
+{
+    m_isAtEnd = true;
+    ZtStatusLog::getInstance()->clear();
+}
+
+void KvDeskStatusLog::slotThemeChanged()
+{
+    m_view->viewport()->update();
+}

@@ -1,0 +1,88 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskCommandLine.h"
+#include "KvDeskFileCommands.h"
+#include "KvDeskLanguages.h"
+#include "KvDeskMainWindow.h"
+#include "KvDeskPlugins.h"
+#include "KvDeskResources.h"
+#include "KvDeskTheme.h"
+#include "KvDeskTranslation.h"
+#include "kernel/ZtAppSettings.h"
+#include "measuring/ZtMeasuringDocument.h"
+
+#include <QApplication>
+
+#include <cstdio>
+
+namespace {
+
+constexpr int usageError = 2;
+
+void setAttributes()
+{
+    // Reports are laid out alike whatever the screen's resolution.
+    QCoreApplication::setAttribute(Qt::AA_Use96Dpi);
+    QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
+    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+}
+
+QStringList wordsOf(int argc, char **argv)
+{
+    QStringList words;
+    for (int i = 0; i < argc; ++i)
+        words.append(QString::fromLocal8Bit(argv[i]));
+    return words;
+}
+
+void openFiles(const KvDeskCommandLine &commandLine, KvDeskFileCommands *files)
+{
+    if (!commandLine.session().isEmpty())
+        files->openSession(commandLine.session());
+    if (!commandLine.image().isEmpty())
+        files->openImage(commandLine.image());
+    if (!commandLine.table().isEmpty())
+        files->importTable(commandLine.table());
+    for (const QString &file : commandLine.files())
+        files->openFile(file);
+}
+
+int run(const KvDeskCommandLine &commandLine)
+{
+    KvDeskResources::ensure();
+    const KvDeskTranslation translation(KvDeskLanguages::effectiveName());
+    KvDeskTheme::apply(commandLine.theme().isEmpty() ? KvDeskTheme::stored() : commandLine.theme());
+    // At the end these go in the opposite order: plug-ins own windows that belong to the main window.
+    ZtMeasuringDocument document;
+    KvDeskMainWindow window(&document);
+    KvDeskPlugins plugins(&window);
+    plugins.load(KvDeskPlugins::folders(commandLine.pluginFolders()));
+    window.restoreTools();
+    QObject::connect(&window, SIGNAL(signalClosed()), qApp, SLOT(quit()));
+    window.show();
+    openFiles(commandLine, window.files());
+    return QApplication::exec();
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    // Before the application takes those that it knows, of which "--session" is one of ours.
+    const QStringList words = wordsOf(argc, argv);
+    const QString text = KvDeskCommandLine::requestedText(words);
+    if (!text.isEmpty()) {
+        std::fputs(qPrintable(text), stdout);
+        return 0;
+    }
+    setAttributes();
+    QApplication application(argc, argv);
+    ZtAppSettings::setProgramInfo(QStringLiteral("Measuring Desk"), QStringLiteral(STATREPORT_VERSION),
+                                  QStringLiteral("StatReport"));
+    const KvDeskCommandLine commandLine(words);
+    if (!commandLine.fault().isEmpty()) {
+        std::fprintf(stderr, "measuringdesk: %s (measuringdesk --help tells more)\n",
+                     qPrintable(commandLine.fault()));
+        return usageError;
+    }
+    return run(commandLine);
+}

@@ -1,0 +1,6 @@
+// SPDX-License-Identifier: MIT
+#include "charts/counterpie/KvStatisticsCounterPieNodeCfg.h"
+
+KvStatisticsCounterPieNodeCfg::KvStatisticsCounterPieNodeCfg(KvTemplateContext *context, QObject *parent)
+    : KvStatisticsChartNodeCfg(context, parent)
+{}

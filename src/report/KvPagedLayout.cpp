@@ -1,0 +1,280 @@
+// SPDX-License-Identifier: MIT
+#include "report/KvPagedLayout.h"
+
+#include "report/KvBaseDisplayWidget.h"
+#include "report/KvBaseDisplayWidgetSignals.h"
+#include "report/KvPageFlow.h"
+#include "report/KvPageSectionWidget.h"
+#include "report/KvReportNode.h"
+#include "report/KvReportPage.h"
+#include "report/KvReportProxyWidgetItem.h"
+#include "templates/KvTemplateModel.h"
+
+#include <QGraphicsRectItem>
+#include <QGraphicsScene>
+#include <QPen>
+
+#include <algorithm>
+#include <utility>
+
+namespace {
+
+const Qt::ConnectionType kQueuedUnique = Qt::ConnectionType(Qt::QueuedConnection | Qt::UniqueConnection);
+const Qt::ConnectionType kDirectUnique = Qt::ConnectionType(Qt::DirectConnection | Qt::UniqueConnection);
+
+constexpr int kMarkHeight = 40;
+constexpr int kMarkInset = 40; // narrower than the page by this
+constexpr qreal kMarkAlpha = 0.3;
+
+/** Place and size, as an item is hit; its bounding rectangle in the scene. */
+QRectF rectOf(const KvReportProxyWidgetItem *item)
+{
+    return QRectF(item->scenePos(), item->size());
+}
+
+} // namespace
+
+KvPagedLayout::KvPagedLayout(QGraphicsScene *scene, QObject *listener)
+    : m_scene(scene)
+    , m_listener(listener)
+{}
+
+KvPagedLayout::~KvPagedLayout()
+{
+    // Before the scene dies: its items let go of pieces that live on.
+    clear();
+}
+
+void KvPagedLayout::clear()
+{
+    m_pages.clear();
+    m_nodes.clear();
+    m_pieceItems.clear();
+    m_mark = nullptr;
+    m_droppedItems.clear();
+    m_scene->clear();
+}
+
+void KvPagedLayout::rebuild(KvTemplateModel *model, const KvReportNode *leftOut, OldItems fate)
+{
+    // The old items go last: pieces then move straight from their old frame into the new one. Every change of
+    // parent makes Qt polish the style sheets of all widgets in a piece, which takes most of the time of a
+    // rebuild.
+    QList<QGraphicsItem *> oldItems = m_scene->items();
+    const auto isChild = [](const QGraphicsItem *item) { return item->parentItem() != nullptr; };
+    oldItems.erase(std::remove_if(oldItems.begin(), oldItems.end(), isChild), oldItems.end());
+    m_model = model;
+    const QVector<KvReportPage *> oldPages = std::exchange(m_pages, {});
+    m_nodes.clear();
+    m_pieceItems.clear();
+    m_mark = nullptr;
+    // Blocks that split themselves have to know a page's content before they are asked for their pieces.
+    addPage();
+    for (KvReportNode *node : m_model->nodes()) {
+        if (node != leftOut)
+            addItemsOf(node);
+    }
+    place(Measuring::Nothing);
+    if (fate == OldItems::DeletedNow) {
+        qDeleteAll(oldItems);
+        m_droppedItems.clear();
+        return;
+    }
+    for (KvReportPage *page : oldPages)
+        page->detachSections();
+    for (QGraphicsItem *item : qAsConst(oldItems))
+        drop(item);
+}
+
+void KvPagedLayout::addItemsOf(KvReportNode *node)
+{
+    connectNode(node);
+    m_nodes.append(node);
+    KvBaseDisplayWidget *displayWidget = node->displayWidget();
+    const int pieces = displayWidget ? displayWidget->subWidgetCount() : 0;
+    for (int i = 0; i < pieces; ++i) {
+        if (KvReportProxyWidgetItem *item = KvReportProxyWidgetItem::createForPiece(node, i))
+            m_pieceItems.append(item);
+    }
+}
+
+void KvPagedLayout::connectNode(KvReportNode *node)
+{
+    KvBaseDisplayWidget *displayWidget = node->displayWidget();
+    if (!displayWidget)
+        return;
+    KvBaseDisplayWidgetSignals *displaySignals = displayWidget->displaySignals();
+    QObject::connect(displaySignals, SIGNAL(signalWidgetChanged()), m_listener,
+                                            SLOT(slotUpdateSceneWithSizes()), kDirectUnique);
+    // Queued: a block may announce new pieces from inside an event of a piece that the rebuild would delete.
+    QObject::connect(displaySignals, SIGNAL(signalSubWidgetsChanged()), m_listener,
+                                            SLOT(slotWidgetsListChanged()), kQueuedUnique);
+    QObject::connect(displaySignals, SIGNAL(signalFocusBackToPageView()), m_listener,
+                                            SLOT(slotFocusBackToPageView()), kDirectUnique);
+}
+
+KvReportPage *KvPagedLayout::addPage()
+{
+    auto *page = new KvReportPage(m_model, m_pages.size(), false);
+    m_pages.append(page);
+    m_scene->addItem(page);
+    for (KvPageSectionWidget *section : {page->headerWidget(), page->footerWidget()}) {
+        if (!section)
+            continue;
+        QObject::connect(section->displaySignals(), SIGNAL(signalWidgetChanged()), m_listener,
+                                                           SLOT(slotUpdateSceneWithSizes()));
+        QObject::connect(section->displaySignals(), SIGNAL(signalFocusBackToPageView()), m_listener,
+                                                           SLOT(slotFocusBackToPageView()));
+    }
+    return page;
+}
+
+QRect KvPagedLayout::contentRectOf(int page)
+{
+    return page < m_pages.size() ? m_pages.at(page)->contentRect() : addPage()->contentRect();
+}
+
+void KvPagedLayout::updateSizes()
+{
+    place(Measuring::All);
+}
+
+void KvPagedLayout::place(Measuring measuring)
+{
+    KvPageFlow flow([this, measuring](int page) {
+        if (measuring == Measuring::All && page < m_pages.size())
+            m_pages.at(page)->updateSections();
+        return contentRectOf(page);
+    });
+    bool isMarked = false;
+    const auto placeMarkBefore = [&](int index) {
+        if (index != m_dropIndex)
+            return;
+        showMarkAt(flow.placeMark(kMarkHeight).topLeft);
+        isMarked = true;
+    };
+    int nextItem = 0;
+    for (int i = 0; i < m_nodes.size(); ++i) {
+        placeMarkBefore(i);
+        for (; nextItem < m_pieceItems.size() && m_pieceItems.at(nextItem)->node() == m_nodes.at(i);
+             ++nextItem) {
+            KvReportProxyWidgetItem *item = m_pieceItems.at(nextItem);
+            if (measuring == Measuring::All)
+                item->adjustToPiece();
+            item->setPos(flow.place(item->pieceHeight()).topLeft);
+            if (!item->scene())
+                m_scene->addItem(item);
+        }
+    }
+    placeMarkBefore(m_nodes.size());
+    if (!isMarked) {
+        delete m_mark;
+        m_mark = nullptr;
+    }
+    dropPagesFrom(flow.pageCount());
+    finish();
+}
+
+void KvPagedLayout::showMarkAt(const QPoint &topLeft)
+{
+    if (!m_mark) {
+        const QColor accent(QStringLiteral("#00659D"));
+        QColor translucent = accent;
+        translucent.setAlphaF(kMarkAlpha);
+        m_mark = m_scene->addRect(QRectF(), QPen(accent), QBrush(translucent));
+    }
+    m_mark->setRect(0, 0, m_pages.first()->pageRect().width() - kMarkInset, kMarkHeight);
+    m_mark->setPos(topLeft);
+}
+
+void KvPagedLayout::dropPagesFrom(int count)
+{
+    while (m_pages.size() > count) {
+        m_pages.last()->detachSections();
+        drop(m_pages.takeLast());
+    }
+}
+
+void KvPagedLayout::drop(QGraphicsItem *item)
+{
+    m_scene->removeItem(item);
+    m_droppedItems.emplace_back(item);
+}
+
+void KvPagedLayout::deleteDroppedItems()
+{
+    m_droppedItems.clear();
+}
+
+void KvPagedLayout::finish()
+{
+    for (KvReportPage *page : qAsConst(m_pages))
+        page->setPageTotal(m_pages.size());
+    const QRect last = m_pages.last()->pageRect();
+    m_scene->setSceneRect(0, 0, last.right() + KvReportPage::Gap, last.bottom() + KvReportPage::Gap);
+}
+
+void KvPagedLayout::removeNode(const KvReportNode *node)
+{
+    m_nodes.removeAll(node);
+    for (int i = m_pieceItems.size() - 1; i >= 0; --i) {
+        if (m_pieceItems.at(i)->node() == node)
+            delete m_pieceItems.takeAt(i);
+    }
+}
+
+KvReportPage *KvPagedLayout::pageAt(const QPointF &point) const
+{
+    const auto found = std::find_if(m_pages.begin(), m_pages.end(),
+                                    [&point](const KvReportPage *page) { return page->contains(point); });
+    return found == m_pages.end() ? nullptr : *found;
+}
+
+KvReportProxyWidgetItem *KvPagedLayout::blockItemAt(const QPointF &point) const
+{
+    const auto found =
+        std::find_if(m_pieceItems.begin(), m_pieceItems.end(),
+                     [&point](const KvReportProxyWidgetItem *item) { return rectOf(item).contains(point); });
+    return found == m_pieceItems.end() ? nullptr : *found;
+}
+
+KvReportProxyWidgetItem *KvPagedLayout::itemAt(const QPointF &point) const
+{
+    // In the order in which they cover each other: sections are painted below blocks.
+    if (KvReportProxyWidgetItem *item = blockItemAt(point))
+        return item;
+    const KvReportPage *page = pageAt(point);
+    return page ? page->sectionItemAt(point) : nullptr;
+}
+
+KvReportProxyWidgetItem *KvPagedLayout::firstItemOf(const KvReportNode *node) const
+{
+    const auto found =
+        std::find_if(m_pieceItems.begin(), m_pieceItems.end(),
+                     [node](const KvReportProxyWidgetItem *item) { return item->node() == node; });
+    return found == m_pieceItems.end() ? nullptr : *found;
+}
+
+void KvPagedLayout::setDropIndex(int index)
+{
+    if (index == m_dropIndex)
+        return;
+    m_dropIndex = index;
+    if (m_model && !m_pages.isEmpty())
+        place(Measuring::Nothing);
+}
+
+QRectF KvPagedLayout::markRect() const
+{
+    return m_mark ? m_mark->rect().translated(m_mark->pos()) : QRectF();
+}
+
+int KvPagedLayout::dropIndexAt(qreal y) const
+{
+    const auto isBelow = [y](const KvReportProxyWidgetItem *item) {
+        const QRectF rect = rectOf(item);
+        return rect.top() + rect.height() * 0.5 > y;
+    };
+    const auto found = std::find_if(m_pieceItems.begin(), m_pieceItems.end(), isBelow);
+    return static_cast<int>(found - m_pieceItems.begin());
+}

@@ -1,0 +1,53 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskFileKind.h"
+
+#include "DeskFiles.h"
+
+class KvDeskFileKindTest : public StatReportTest
+{
+    Q_OBJECT
+
+private slots:
+    void kinds_data();
+    void kinds();
+    void patterns();
+};
+
+void KvDeskFileKindTest::kinds_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::addColumn<int>("kind");
+    const auto row = [](const char *name, const QString &path, KvDeskFileKind::Kind kind) {
+        QTest::newRow(name) << path << static_cast<int>(kind);
+    };
+    row("session", QStringLiteral("/none/a.json"), KvDeskFileKind::Session);
+    row("session in capitals", QStringLiteral("/none/a.JSON"), KvDeskFileKind::Session);
+    row("picture", QStringLiteral("/none/a.png"), KvDeskFileKind::Image);
+    row("picture in capitals", QStringLiteral("/none/a.JPG"), KvDeskFileKind::Image);
+    row("table", QStringLiteral("/none/a.csv"), KvDeskFileKind::Table);
+    row("results table", QStringLiteral("/none/a.xls"), KvDeskFileKind::Table);
+    row("nothing known", QStringLiteral("/none/a"), KvDeskFileKind::Table);
+    const QString png = DeskFiles::image(QStringLiteral("p.png"));
+    row("picture without a suffix", DeskFiles::text(QStringLiteral("picture"), DeskFiles::bytes(png)),
+        KvDeskFileKind::Image);
+    row("session without a suffix", DeskFiles::text(QStringLiteral("session"), " \n{}"),
+        KvDeskFileKind::Session);
+    row("table without a suffix", DeskFiles::text(QStringLiteral("data"), "a,b\n"), KvDeskFileKind::Table);
+}
+
+void KvDeskFileKindTest::kinds()
+{
+    QFETCH(QString, path);
+    QFETCH(int, kind);
+    QCOMPARE(static_cast<int>(KvDeskFileKind::of(path)), kind);
+}
+
+void KvDeskFileKindTest::patterns()
+{
+    QVERIFY(KvDeskFileKind::imagePatterns().contains(QStringLiteral("*.png")));
+    QVERIFY(KvDeskFileKind::imagePatterns().contains(QStringLiteral("*.jpg")));
+    QVERIFY(KvDeskFileKind::tablePatterns().contains(QStringLiteral("*.csv")));
+}
+
+STATREPORT_TEST_MAIN(KvDeskFileKindTest)
+#include "KvDeskFileKindTest.moc"

@@ -1,0 +1,462 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskMainWindow.h"
+
+#include "DeskFiles.h"
+#include "KvDeskActions.h"
+#include "KvDeskFileCommands.h"
+#include "KvDeskImageView.h"
+#include "KvDeskPanelHeader.h"
+#include "KvDeskRecentFiles.h"
+#include "KvDeskSession.h"
+#include "KvDeskStatusBar.h"
+#include "KvDeskStatusLog.h"
+#include "KvDeskTableView.h"
+#include "KvDeskTheme.h"
+#include "KvDeskToolColumn.h"
+#include "KvDeskValueTable.h"
+#include "KvDeskValueTableModel.h"
+#include "gui/KvToolBase.h"
+#include "gui/QtAdvancedStylesheet.h"
+#include "host/measuring/Polygon.h"
+#include "kernel/ZtAppSettings.h"
+#include "kernel/ZtSignalCenter.h"
+#include "measuring/ZtDrawnType.h"
+#include "measuring/ZtMeasuringDocument.h"
+#include "support/MessageBoxAnswerer.h"
+
+namespace {
+
+const QPolygonF diagonal = polygon({QPointF(0, 0), QPointF(10, 10)});
+
+/// A window of a plug-in that may refuse to close.
+class WindowThatStays : public QWidget
+{
+public:
+    explicit WindowThatStays(QWidget *parent)
+        : QWidget(parent, Qt::Window)
+    {}
+    bool isWilling = false;
+
+protected:
+    void closeEvent(QCloseEvent *event) override { event->setAccepted(isWilling); }
+};
+
+bool drop(QWidget *window, const QList<QUrl> &urls)
+{
+    QMimeData data;
+    data.setUrls(urls);
+    QDragEnterEvent enter(QPoint(10, 10), Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
+    enter.ignore();
+    QApplication::sendEvent(window, &enter);
+    if (!enter.isAccepted())
+        return false;
+    QDropEvent event(QPointF(10, 10), Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
+    QApplication::sendEvent(window, &event);
+    return event.isAccepted();
+}
+
+} // namespace
+
+class KvDeskMainWindowTest : public StatReportTest
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void cleanup();
+
+    void titleNamesTheSession();
+    void closingAsks_data();
+    void closingAsks();
+    void endIsAnnouncedOnce();
+    void endIsAnnouncedWhileEverythingLives();
+    void pluginWindowCanHoldTheProgramBack();
+    void pluginWindowsAreClosed();
+    void sessionIsReplacedOnlyWhenAllowed();
+    void dropsOpenFiles_data();
+    void dropsOpenFiles();
+    void dropsOfOtherThingsAreRefused();
+    void panelsDoNotTakeDrops();
+    void windowIsRemembered();
+    void panelsAreShownAndHidden();
+    void toolsComeIntoTheColumn();
+    void firstToolIsActiveAtFirst();
+    void activeToolsAreRemembered();
+    void selectionGoesBothWays();
+    void statusBarFollowsTheImage();
+    void warningForThePanelOpensIt();
+    void messageForABoxIsShown();
+    void recentSessions();
+    void missingRecentSessionIsForgotten();
+    void toggledTheme();
+    void everyButtonIsExplained();
+    void fitsIntoSmallScreens();
+
+private:
+    void open();
+    QAction *action(KvDeskActions::Id id) const { return m_window->actions()->action(id); }
+    void restart();
+
+    std::unique_ptr<ZtMeasuringDocument> m_document;
+    std::unique_ptr<KvDeskMainWindow> m_window;
+};
+
+void KvDeskMainWindowTest::init()
+{
+    StatReportTest::init();
+    ZtAppSettings::getInstance()->setStoragePath(QString());
+    ZtStatusLog::getInstance()->clear();
+    restart();
+}
+
+void KvDeskMainWindowTest::cleanup()
+{
+    m_window.reset();
+    m_document.reset();
+    StatReportTest::cleanup();
+}
+
+void KvDeskMainWindowTest::restart()
+{
+    m_window.reset();
+    m_document.reset();
+    m_document = std::make_unique<ZtMeasuringDocument>();
+    m_window = std::make_unique<KvDeskMainWindow>(m_document.get());
+    m_window->show();
+}
+
+void KvDeskMainWindowTest::open()
+{
+    QVERIFY(m_window->files()->openSession(DeskFiles::demoSession()));
+    m_window->valueTable()->model()->flush();
+    m_window->imageView()->flush();
+}
+
+void KvDeskMainWindowTest::titleNamesTheSession()
+{
+    QCOMPARE(m_window->windowTitle(), QStringLiteral("Untitled session[*] - Measuring Desk"));
+    open();
+    QCOMPARE(m_window->windowTitle(), QStringLiteral("demo.json[*] - Measuring Desk"));
+    QVERIFY(!m_window->isWindowModified());
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    QVERIFY(m_window->isWindowModified());
+}
+
+void KvDeskMainWindowTest::closingAsks_data()
+{
+    QTest::addColumn<bool>("isModified");
+    QTest::addColumn<int>("answer");
+    QTest::addColumn<bool>("isClosed");
+    QTest::newRow("unmodified") << false << static_cast<int>(QMessageBox::Cancel) << true;
+    QTest::newRow("save") << true << static_cast<int>(QMessageBox::Save) << true;
+    QTest::newRow("discard") << true << static_cast<int>(QMessageBox::Discard) << true;
+    QTest::newRow("cancel") << true << static_cast<int>(QMessageBox::Cancel) << false;
+}
+
+void KvDeskMainWindowTest::closingAsks()
+{
+    QFETCH(bool, isModified);
+    QFETCH(int, answer);
+    QFETCH(bool, isClosed);
+    QVERIFY(m_window->files()->saveSession(temporaryPath(QStringLiteral("closing.json"))));
+    if (isModified)
+        m_document->addObject(ZtDrawnType::Line, diagonal);
+    QSignalSpy about(ZtSignalCenter::getInstance(), SIGNAL(signalAppAboutToClose()));
+    QSignalSpy closed(m_window.get(), SIGNAL(signalClosed()));
+    const MessageBoxAnswerer answerer(static_cast<QMessageBox::StandardButton>(answer));
+    QCOMPARE(m_window->close(), isClosed);
+    QCOMPARE(answerer.boxes().size(), isModified ? 1 : 0);
+    QCOMPARE(about.count(), isClosed ? 1 : 0);
+    QCOMPARE(closed.count(), isClosed ? 1 : 0);
+    QCOMPARE(m_window->isVisible(), !isClosed);
+}
+
+void KvDeskMainWindowTest::endIsAnnouncedOnce()
+{
+    QSignalSpy about(ZtSignalCenter::getInstance(), SIGNAL(signalAppAboutToClose()));
+    action(KvDeskActions::Quit)->trigger();
+    QVERIFY(!m_window->isVisible());
+    QCOMPARE(about.count(), 1);
+    m_window->close();
+    m_window.reset();
+    QCOMPARE(about.count(), 1);
+}
+
+void KvDeskMainWindowTest::endIsAnnouncedWhileEverythingLives()
+{
+    open();
+    int objects = 0;
+    bool isVisible = false;
+    QObject receiver;
+    connect(ZtSignalCenter::getInstance(), &ZtSignalCenter::signalAppAboutToClose, &receiver, [&]() {
+        objects = m_window->session()->objectCount();
+        isVisible = m_window->isVisible();
+    });
+    m_window->close();
+    QCOMPARE(objects, 33);
+    QVERIFY(isVisible);
+}
+
+void KvDeskMainWindowTest::pluginWindowCanHoldTheProgramBack()
+{
+    WindowThatStays editor(m_window.get());
+    editor.show();
+    QSignalSpy about(ZtSignalCenter::getInstance(), SIGNAL(signalAppAboutToClose()));
+    QVERIFY(!m_window->close());
+    QVERIFY(m_window->isVisible());
+    QCOMPARE(about.count(), 0);
+    editor.isWilling = true;
+    QVERIFY(m_window->close());
+    QCOMPARE(about.count(), 1);
+}
+
+void KvDeskMainWindowTest::pluginWindowsAreClosed()
+{
+    QWidget statistics(m_window.get(), Qt::Window);
+    statistics.show();
+    QWidget hidden(m_window.get(), Qt::Window);
+    QVERIFY(m_window->close());
+    QVERIFY(!statistics.isVisible());
+}
+
+void KvDeskMainWindowTest::sessionIsReplacedOnlyWhenAllowed()
+{
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    {
+        const MessageBoxAnswerer answerer(QMessageBox::Cancel);
+        QVERIFY(drop(m_window.get(), {QUrl::fromLocalFile(DeskFiles::demoSession())}));
+        QCOMPARE(answerer.boxes().size(), 1);
+        QCOMPARE(m_window->session()->objectCount(), 1);
+    }
+    const MessageBoxAnswerer answerer(QMessageBox::Discard);
+    QVERIFY(drop(m_window.get(), {QUrl::fromLocalFile(DeskFiles::demoSession())}));
+    QCOMPARE(m_window->session()->objectCount(), 33);
+}
+
+void KvDeskMainWindowTest::dropsOpenFiles_data()
+{
+    QTest::addColumn<QStringList>("files");
+    QTest::addColumn<int>("objects");
+    QTest::addColumn<bool>("hasImage");
+    const QString image = DeskFiles::image(QStringLiteral("dropped image.png"));
+    const QString table = DeskFiles::table(QStringLiteral("dropped.csv"));
+    QTest::newRow("session") << QStringList(DeskFiles::demoSession()) << 33 << true;
+    QTest::newRow("image") << QStringList(image) << 0 << true;
+    QTest::newRow("table") << QStringList(table) << 2 << false;
+    QTest::newRow("both") << QStringList({image, table}) << 2 << true;
+}
+
+void KvDeskMainWindowTest::dropsOpenFiles()
+{
+    QFETCH(QStringList, files);
+    QFETCH(int, objects);
+    QFETCH(bool, hasImage);
+    QList<QUrl> urls;
+    for (const QString &file : qAsConst(files))
+        urls.append(QUrl::fromLocalFile(file));
+    QVERIFY(drop(m_window.get(), urls));
+    QCOMPARE(m_window->session()->objectCount(), objects);
+    QCOMPARE(!m_window->imageView()->frame().isNull(), hasImage);
+}
+
+void KvDeskMainWindowTest::dropsOfOtherThingsAreRefused()
+{
+    QVERIFY(!drop(m_window.get(), {}));
+    QVERIFY(!drop(m_window.get(), {QUrl(QStringLiteral("https://example.org/a.png"))}));
+}
+
+void KvDeskMainWindowTest::panelsDoNotTakeDrops()
+{
+    // Who takes drops keeps them from the window.
+    for (const QWidget *const widget : m_window->findChildren<QWidget *>())
+        QVERIFY2(!widget->acceptDrops() || widget->isWindow(), widget->metaObject()->className());
+}
+
+void KvDeskMainWindowTest::windowIsRemembered()
+{
+    m_window->resize(900, 600);
+    m_window->move(30, 40);
+    auto *const splitter = m_window->imageView()->parentWidget();
+    qobject_cast<QSplitter *>(splitter)->setSizes({500, 400});
+    action(KvDeskActions::ShowLog)->setChecked(true);
+    QCoreApplication::processEvents();
+    const QSize size = m_window->size();
+    const int width = m_window->valueTable()->width();
+    QVERIFY(m_window->close());
+
+    ZtAppSettings::beginGroupAbsolute(QStringLiteral("DeskWindow"));
+    QVERIFY(!ZtAppSettings::value(QStringLiteral("geometry")).toByteArray().isEmpty());
+    QVERIFY(!ZtAppSettings::value(QStringLiteral("state")).toByteArray().isEmpty());
+    ZtAppSettings::endGroup();
+
+    restart();
+    QTRY_COMPARE(m_window->size(), size);
+    QTRY_COMPARE(m_window->valueTable()->width(), width);
+    QVERIFY(m_window->statusLog()->isVisible());
+    QVERIFY(action(KvDeskActions::ShowLog)->isChecked());
+}
+
+void KvDeskMainWindowTest::panelsAreShownAndHidden()
+{
+    QVERIFY(m_window->valueTable()->isVisible());
+    QVERIFY(!m_window->statusLog()->isVisible());
+    action(KvDeskActions::ShowValues)->trigger();
+    QVERIFY(!m_window->valueTable()->isVisible());
+    action(KvDeskActions::ShowLog)->trigger();
+    QVERIFY(m_window->statusLog()->isVisible());
+    m_window->statusLog()->header()->closeButton()->click();
+    QVERIFY(!m_window->statusLog()->isVisible());
+    QVERIFY(!action(KvDeskActions::ShowLog)->isChecked());
+    action(KvDeskActions::ShowValues)->trigger();
+    m_window->valueTable()->header()->closeButton()->click();
+    QVERIFY(!action(KvDeskActions::ShowValues)->isChecked());
+}
+
+void KvDeskMainWindowTest::toolsComeIntoTheColumn()
+{
+    QVERIFY(!m_window->toolColumn()->isVisible());
+    const auto *const tool =
+        new KvToolBase(m_window.get(), QIcon(), QStringLiteral("Report"), QStringLiteral("report"), false);
+    QVERIFY(m_window->toolColumn()->isVisible());
+    QVERIFY(m_window->toolColumn()->isAncestorOf(tool->getToolButton()));
+    QVERIFY(m_window->toolColumn()->isAncestorOf(tool->panel()));
+}
+
+void KvDeskMainWindowTest::firstToolIsActiveAtFirst()
+{
+    const auto *const first =
+        new KvToolBase(m_window.get(), QIcon(), QStringLiteral("A"), QStringLiteral("a"), false);
+    const auto *const second =
+        new KvToolBase(m_window.get(), QIcon(), QStringLiteral("B"), QStringLiteral("b"), false);
+    QSignalSpy spy(first, SIGNAL(toolActivated(bool)));
+    m_window->restoreTools();
+    QVERIFY(first->isActivated());
+    QVERIFY(!second->isActivated());
+    QCOMPARE(spy.count(), 1);
+    QVERIFY(first->panel()->isVisible());
+}
+
+void KvDeskMainWindowTest::activeToolsAreRemembered()
+{
+    const auto addTools = [this]() {
+        QVector<KvToolBase *> tools;
+        for (const char *name : {"a", "b", "c"})
+            tools.append(
+                new KvToolBase(m_window.get(), QIcon(), QLatin1String(name), QLatin1String(name), false));
+        return tools;
+    };
+    QVector<KvToolBase *> tools = addTools();
+    tools.at(1)->getToolButton()->setChecked(true);
+    QVERIFY(m_window->close());
+    restart();
+    tools = addTools();
+    m_window->restoreTools();
+    QVERIFY(!tools.at(0)->isActivated());
+    QVERIFY(tools.at(1)->isActivated());
+    QVERIFY(!tools.at(2)->isActivated());
+}
+
+void KvDeskMainWindowTest::selectionGoesBothWays()
+{
+    open();
+    m_window->valueTable()->view()->selectRow(0);
+    QCOMPARE(m_window->imageView()->selectedObject(), (KvDeskObjectId{ZtDrawnType::Rectangle, 1}));
+    const QPoint rim = m_window->imageView()->mapFromScene(QPointF(217.8, 575));
+    QTest::mouseClick(m_window->imageView()->viewport(), Qt::LeftButton, Qt::NoModifier, rim);
+    QCOMPARE(m_window->valueTable()->selectedObject(), (KvDeskObjectId{ZtDrawnType::Rectangle, 2}));
+    QCOMPARE(m_window->valueTable()->view()->selectionModel()->selectedRows().size(), 3);
+}
+
+void KvDeskMainWindowTest::statusBarFollowsTheImage()
+{
+    QCOMPARE(m_window->deskStatusBar()->imageText(), QString());
+    open();
+    QCOMPARE(m_window->deskStatusBar()->imageText(), QStringLiteral("960 × 720 px, 12.5 μm/px"));
+    action(KvDeskActions::ZoomActual)->trigger();
+    QCOMPARE(m_window->deskStatusBar()->zoomText(), QStringLiteral("100 %"));
+    QCOMPARE(m_window->deskStatusBar()->message(), QStringLiteral("Session opened: demo.json (objects: 33)"));
+    m_document->clear();
+    QCOMPARE(m_window->deskStatusBar()->imageText(), QString());
+}
+
+void KvDeskMainWindowTest::warningForThePanelOpensIt()
+{
+    ZtAppStatus information(ZtAppStatus::Information);
+    information.setPreferredDestination(ZtAppStatus::StatusPanel);
+    information.setAndLogStatus(ZtAppStatus::Information, 0, QStringLiteral("Fine"), QString());
+    QVERIFY(!m_window->statusLog()->isVisible());
+    ZtAppStatus warning(2, 0);
+    warning.setPreferredDestination(4);
+    warning.setAndLogStatus(2, 0, QStringLiteral("No report template selected."), QString());
+    QVERIFY(m_window->statusLog()->isVisible());
+}
+
+void KvDeskMainWindowTest::messageForABoxIsShown()
+{
+    const MessageBoxAnswerer answerer;
+    ZtAppStatus error(ZtAppStatus::Error);
+    error.setPreferredDestination(ZtAppStatus::MessageBox);
+    error.setAndLogStatus(ZtAppStatus::Error, 0, QStringLiteral("It broke"), QString());
+    QTRY_COMPARE(answerer.boxes().size(), 1);
+    QCOMPARE(answerer.boxes().first().text, QStringLiteral("It broke"));
+}
+
+void KvDeskMainWindowTest::recentSessions()
+{
+    emit m_window->recentMenu()->aboutToShow();
+    QCOMPARE(m_window->recentMenu()->actions().size(), 1);
+    QCOMPARE(m_window->recentMenu()->actions().first()->text(), QStringLiteral("None yet"));
+    QVERIFY(!m_window->recentMenu()->actions().first()->isEnabled());
+    open();
+    m_window->session()->clear();
+    KvDeskRecentFiles::add(QStringLiteral("/x/this & that.json"));
+    emit m_window->recentMenu()->aboutToShow();
+    QCOMPARE(m_window->recentMenu()->actions().at(0)->text(), QStringLiteral("this && that.json"));
+    m_window->recentMenu()->actions().at(1)->trigger();
+    QCOMPARE(m_window->session()->path(), DeskFiles::demoSession());
+}
+
+void KvDeskMainWindowTest::missingRecentSessionIsForgotten()
+{
+    KvDeskRecentFiles::add(QStringLiteral("/none/gone.json"));
+    emit m_window->recentMenu()->aboutToShow();
+    const MessageBoxAnswerer answerer;
+    m_window->recentMenu()->actions().first()->trigger();
+    QCOMPARE(answerer.boxes().size(), 1);
+    QCOMPARE(KvDeskRecentFiles::paths(), QStringList());
+}
+
+void KvDeskMainWindowTest::toggledTheme()
+{
+    KvDeskTheme::apply(QStringLiteral("Dark"));
+    action(KvDeskActions::ToggleTheme)->trigger();
+    QCOMPARE(acss::QtAdvancedStylesheet::getInstance()->currentTheme(), QStringLiteral("Light"));
+    QCOMPARE(KvDeskTheme::stored(), QStringLiteral("Light"));
+    KvDeskTheme::apply(QStringLiteral("Dark"));
+}
+
+void KvDeskMainWindowTest::everyButtonIsExplained()
+{
+    int count = 0;
+    for (const QToolButton *const button : m_window->findChildren<QToolButton *>()) {
+        if (!button->isVisible())
+            continue;
+        ++count;
+        QVERIFY2(!button->toolTip().isEmpty(), qPrintable(button->objectName() + button->text()));
+        QVERIFY(!button->icon().isNull());
+    }
+    QVERIFY(count >= 12);
+}
+
+void KvDeskMainWindowTest::fitsIntoSmallScreens()
+{
+    new KvToolBase(m_window.get(), QIcon(), QStringLiteral("Report & Statistic"), QStringLiteral("report"),
+                   true);
+    action(KvDeskActions::ShowLog)->setChecked(true);
+    open();
+    QVERIFY(m_window->minimumSizeHint().width() <= 1024);
+    QVERIFY(m_window->minimumSizeHint().height() <= 640);
+}
+
+STATREPORT_TEST_MAIN(KvDeskMainWindowTest)
+#include "KvDeskMainWindowTest.moc"

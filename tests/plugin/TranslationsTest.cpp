@@ -1,0 +1,430 @@
+// SPDX-License-Identifier: MIT
+#include "support/StatReportTest.h"
+
+#include "repository/SourceTree.h"
+
+#include <QPluginLoader>
+#include <QProcess>
+#include <QSet>
+#include <QTranslator>
+#include <QXmlStreamReader>
+
+namespace {
+
+const QStringList languages{QStringLiteral("English"),
+                            QStringLiteral("German"),
+                            QStringLiteral("French"),
+                            QStringLiteral("Spanish"),
+                            QStringLiteral("Italian"),
+                            QStringLiteral("Russian"),
+                            QStringLiteral("Japanese"),
+                            QStringLiteral("Korean"),
+                            QStringLiteral("Arabic"),
+                            QStringLiteral("ChineseSimple"),
+                            QStringLiteral("ChineseTraditional"),
+                            QStringLiteral("Slovakian")};
+
+/// Folder of the sources and folder of their translations.
+const QVector<QPair<QString, QString>> products{
+    {QStringLiteral("src"), QStringLiteral("src/resources/translations")},
+    {QStringLiteral("host"), QStringLiteral("host/desk/translations")}};
+
+struct Message
+{
+    QString context;
+    QString source;
+    QStringList translations; ///< several for plurals
+    bool isPlural = false;
+    bool isFinished = true;
+
+    QString key() const { return context + QStringLiteral(": ") + source; }
+};
+
+void readTranslation(QXmlStreamReader &xml, Message *message)
+{
+    message->isFinished = xml.attributes().value(QLatin1String("type")) != QLatin1String("unfinished");
+    if (!message->isPlural) {
+        message->translations.append(xml.readElementText());
+        return;
+    }
+    while (xml.readNextStartElement())
+        message->translations.append(xml.readElementText());
+}
+
+Message readMessage(QXmlStreamReader &xml, const QString &context)
+{
+    Message message;
+    message.context = context;
+    message.isPlural = xml.attributes().value(QLatin1String("numerus")) == QLatin1String("yes");
+    while (xml.readNextStartElement()) {
+        if (xml.name() == QLatin1String("source"))
+            message.source = xml.readElementText();
+        else if (xml.name() == QLatin1String("translation"))
+            readTranslation(xml, &message);
+        else
+            xml.skipCurrentElement();
+    }
+    return message;
+}
+
+QVector<Message> readMessages(QIODevice *device)
+{
+    QVector<Message> messages;
+    QXmlStreamReader xml(device);
+    QString context;
+    while (!xml.atEnd()) {
+        if (xml.readNext() != QXmlStreamReader::StartElement)
+            continue;
+        if (xml.name() == QLatin1String("name"))
+            context = xml.readElementText();
+        else if (xml.name() == QLatin1String("message"))
+            messages.append(readMessage(xml, context));
+    }
+    return xml.hasError() ? QVector<Message>() : messages;
+}
+
+QVector<Message> readMessages(const QString &path)
+{
+    QFile file(path);
+    return file.open(QIODevice::ReadOnly) ? readMessages(&file) : QVector<Message>();
+}
+
+QStringList keys(const QVector<Message> &messages)
+{
+    QStringList result;
+    for (const Message &message : messages)
+        result.append(message.key());
+    result.sort();
+    return result;
+}
+
+/// What is in \a all, but not in \a some.
+QStringList missing(const QStringList &all, const QStringList &some)
+{
+    QStringList result(all);
+    for (const QString &key : some)
+        result.removeAll(key);
+    return result;
+}
+
+/// "%1", "%2" ... and "%n", each once, sorted.
+QStringList placeholders(const QString &text)
+{
+    static const QRegularExpression pattern(QStringLiteral("%L?(\\d{1,2}|n)"));
+    QSet<QString> found;
+    QRegularExpressionMatchIterator it = pattern.globalMatch(text);
+    while (it.hasNext())
+        found.insert(it.next().captured(1));
+    QStringList result(found.cbegin(), found.cend());
+    result.sort();
+    return result;
+}
+
+/// Messages with a translation that lost a placeholder or has one too many.
+QStringList placeholderFaults(const QVector<Message> &messages)
+{
+    QStringList faults;
+    for (const Message &message : messages) {
+        for (const QString &translation : message.translations) {
+            if (!translation.isEmpty() && placeholders(translation) != placeholders(message.source))
+                faults.append(message.key());
+        }
+    }
+    return faults;
+}
+
+/// Calls of translate() with a variable whose texts are not marked in the same file: lupdate does not see
+/// them.
+QStringList unmarkedTexts(const SourceTree::Files &files)
+{
+    static const QRegularExpression call(
+        QStringLiteral("translate\\(\\s*(?:\"(\\w+)\"|\\w+)\\s*,\\s*(?!\")[^\\s\"]"));
+    QStringList faults;
+    for (auto it = files.cbegin(); it != files.cend(); ++it) {
+        const bool isMarked = it.value().contains(QLatin1String("QT_TRANSLATE_NOOP")) ||
+                              it.value().contains(QLatin1String("QT_TR_NOOP"));
+        const QRegularExpressionMatch match = call.match(SourceTree::withoutComments(it.value()));
+        const bool isCall =
+            match.hasMatch() && it.value().contains(QLatin1String("QCoreApplication::translate"));
+        if (isCall && !isMarked)
+            faults.append(it.key());
+    }
+    return faults;
+}
+
+QByteArray lines(const QStringList &texts)
+{
+    return '\n' + texts.join(QLatin1Char('\n')).toUtf8();
+}
+
+} // namespace
+
+class TranslationsTest : public StatReportTest
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase();
+
+    void seesLostPlaceholders_data();
+    void seesLostPlaceholders();
+    void seesUnmarkedTexts_data();
+    void seesUnmarkedTexts();
+
+    void thePluginHoldsEveryLanguage_data();
+    void thePluginHoldsEveryLanguage();
+    void thePluginTranslatesToEnglish_data();
+    void thePluginTranslatesToEnglish();
+    void everyLanguageHasTheSameTexts_data();
+    void everyLanguageHasTheSameTexts();
+    void englishIsComplete();
+    void placeholdersAreKept_data();
+    void placeholdersAreKept();
+    void theTextsOfTheCodeAreThere_data();
+    void theTextsOfTheCodeAreThere();
+    void contextsAreTheAgreedOnes_data();
+    void contextsAreTheAgreedOnes();
+    void noTextHidesFromLupdate();
+
+private:
+    void addFiles();
+    QString path(const QString &folder, const QString &language) const
+    {
+        return sourcePath(QStringLiteral("%1/%2.ts").arg(folder, language));
+    }
+};
+
+void TranslationsTest::initTestCase()
+{
+    QPluginLoader loader(QStringLiteral(STATREPORT_PLUGIN));
+    QVERIFY2(loader.load(), qPrintable(loader.errorString()));
+}
+
+void TranslationsTest::seesLostPlaceholders_data()
+{
+    QTest::addColumn<QString>("source");
+    QTest::addColumn<QString>("translation");
+    QTest::addColumn<bool>("isFault");
+    QTest::newRow("kept") << QStringLiteral("%1 of %2") << QStringLiteral("%2: %1") << false;
+    QTest::newRow("not translated") << QStringLiteral("%1 of %2") << QString() << false;
+    QTest::newRow("lost") << QStringLiteral("%1 of %2") << QStringLiteral("%1 von 2") << true;
+    QTest::newRow("added") << QStringLiteral("Open") << QStringLiteral("Open %1") << true;
+    QTest::newRow("a count") << QStringLiteral("%n page(s)") << QStringLiteral("%n pages") << false;
+    QTest::newRow("a lost count") << QStringLiteral("%n page(s)") << QStringLiteral("pages") << true;
+    QTest::newRow("per cent") << QStringLiteral("100 %") << QStringLiteral("100%") << false;
+}
+
+void TranslationsTest::seesLostPlaceholders()
+{
+    QFETCH(QString, source);
+    QFETCH(QString, translation);
+    QFETCH(bool, isFault);
+    Message message;
+    message.source = source;
+    message.translations = QStringList(translation);
+    QCOMPARE(placeholderFaults({message}).size(), isFault ? 1 : 0);
+}
+
+void TranslationsTest::seesUnmarkedTexts_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<bool>("isFault");
+    const QString call = QStringLiteral("QCoreApplication::translate(");
+    QTest::newRow("a text") << call + QStringLiteral("\"KvA\", \"Open\");") << false;
+    QTest::newRow("a text on the next line") << call + QStringLiteral("\"KvA\",\n    \"Open\");") << false;
+    QTest::newRow("a variable") << call + QStringLiteral("\"KvA\", text);") << true;
+    QTest::newRow("a variable and a context") << call + QStringLiteral("context, text);") << true;
+    QTest::newRow("a marked one") << QStringLiteral("QT_TRANSLATE_NOOP(\"KvA\", \"Open\") ") + call +
+                                         QStringLiteral("\"KvA\", text);")
+                                  << false;
+    QTest::newRow("commented out") << QStringLiteral("// ") + call + QStringLiteral("\"KvA\", text);")
+                                   << false;
+    QTest::newRow("of a painter") << QStringLiteral("painter.translate(a, b);") << false;
+}
+
+void TranslationsTest::seesUnmarkedTexts()
+{
+    QFETCH(QString, text);
+    QFETCH(bool, isFault);
+    QCOMPARE(unmarkedTexts({{QStringLiteral("a.cpp"), text}}).size(), isFault ? 1 : 0);
+}
+
+void TranslationsTest::thePluginHoldsEveryLanguage_data()
+{
+    QTest::addColumn<QString>("language");
+    for (const QString &language : languages)
+        QTest::newRow(qPrintable(language)) << language;
+}
+
+void TranslationsTest::thePluginHoldsEveryLanguage()
+{
+    QFETCH(QString, language);
+    const QString resource = QStringLiteral(":/statreportingplugin/%1.qm").arg(language);
+    QVERIFY(QFile::exists(resource));
+    QTranslator translator;
+    QVERIFY(translator.load(resource));
+}
+
+void TranslationsTest::thePluginTranslatesToEnglish_data()
+{
+    QTest::addColumn<QByteArray>("context");
+    QTest::addColumn<QByteArray>("source");
+    QTest::addColumn<QString>("translation");
+    const auto row = [](const char *context, const char *source, const char *translation) {
+        QTest::addRow("%s: %s", context, source)
+            << QByteArray(context) << QByteArray(source) << QString::fromUtf8(translation);
+    };
+    row("StatReportingPlugin", "Statistics tools", "Report & Statistic");
+    row("StatReportingPlugin", "Select Template File", "Select Report Template File");
+    row("StatReportingPlugin", "Report Template File (*.rtp)", "Report Template File (*.rtp)");
+    row("StatReportingPlugin", "No report template selected.", "No report template selected.");
+    row("GuiStatReportingPluginUi", "Template:", "Template:");
+    row("KvBaseEditorNodeFactory", "Text Document", "Text Document");
+    row("KvReportKeywords", "Creation time", "Creation time");
+}
+
+void TranslationsTest::thePluginTranslatesToEnglish()
+{
+    QFETCH(QByteArray, context);
+    QFETCH(QByteArray, source);
+    QTranslator translator;
+    QVERIFY(translator.load(QStringLiteral(":/statreportingplugin/English.qm")));
+    QTEST(translator.translate(context.constData(), source.constData()), "translation");
+}
+
+void TranslationsTest::addFiles()
+{
+    QTest::addColumn<QString>("folder");
+    QTest::addColumn<QString>("language");
+    for (const auto &product : products) {
+        for (const QString &language : languages)
+            QTest::addRow("%s, %s", qPrintable(product.first), qPrintable(language))
+                << product.second << language;
+    }
+}
+
+void TranslationsTest::everyLanguageHasTheSameTexts_data()
+{
+    addFiles();
+}
+
+void TranslationsTest::everyLanguageHasTheSameTexts()
+{
+    QFETCH(QString, folder);
+    QFETCH(QString, language);
+    const QStringList english = keys(readMessages(path(folder, QStringLiteral("English"))));
+    const QStringList own = keys(readMessages(path(folder, language)));
+    QVERIFY(english.size() > 50);
+    QVERIFY2(missing(english, own).isEmpty(), lines(missing(english, own)));
+    QVERIFY2(missing(own, english).isEmpty(), lines(missing(own, english)));
+    QCOMPARE(QStringList(own).removeDuplicates(), 0);
+}
+
+void TranslationsTest::englishIsComplete()
+{
+    QStringList faults;
+    for (const auto &product : products) {
+        for (const Message &message : readMessages(path(product.second, QStringLiteral("English")))) {
+            const bool isEmpty = message.translations.isEmpty() || message.translations.contains(QString());
+            if (!message.isFinished || isEmpty || (message.isPlural && message.translations.size() != 2))
+                faults.append(message.key());
+        }
+    }
+    QVERIFY2(faults.isEmpty(), lines(faults));
+}
+
+void TranslationsTest::placeholdersAreKept_data()
+{
+    addFiles();
+}
+
+void TranslationsTest::placeholdersAreKept()
+{
+    QFETCH(QString, folder);
+    QFETCH(QString, language);
+    const QStringList faults = placeholderFaults(readMessages(path(folder, language)));
+    QVERIFY2(faults.isEmpty(), lines(faults));
+}
+
+void TranslationsTest::theTextsOfTheCodeAreThere_data()
+{
+    QTest::addColumn<QString>("sources");
+    QTest::addColumn<QString>("folder");
+    for (const auto &product : products)
+        QTest::newRow(qPrintable(product.first)) << product.first << product.second;
+}
+
+/// Fails after a change of texts until scripts/update-translations has run.
+void TranslationsTest::theTextsOfTheCodeAreThere()
+{
+    QFETCH(QString, sources);
+    QFETCH(QString, folder);
+    const QString extracted = temporaryPath(sources + QStringLiteral(".ts"));
+    QProcess lupdate;
+    lupdate.setWorkingDirectory(sourcePath(QString()));
+    lupdate.start(QStringLiteral(STATREPORT_LUPDATE),
+                  {QStringLiteral("-silent"), QStringLiteral("-locations"), QStringLiteral("none"),
+                   QStringLiteral("-extensions"), QStringLiteral("cpp,h,ui"), sources, QStringLiteral("-ts"),
+                   extracted});
+    QVERIFY(lupdate.waitForFinished(60000));
+    QCOMPARE(lupdate.exitCode(), 0);
+    // Texts that it cannot tell the context of are complaints here.
+    const QByteArray complaints = lupdate.readAllStandardError();
+    QVERIFY2(complaints.isEmpty(), complaints.constData());
+
+    const QStringList inCode = keys(readMessages(extracted));
+    const QStringList inFile = keys(readMessages(path(folder, QStringLiteral("English"))));
+    QVERIFY(inCode.size() > 50);
+    QVERIFY2(missing(inCode, inFile).isEmpty(), lines(missing(inCode, inFile)));
+    QVERIFY2(missing(inFile, inCode).isEmpty(), lines(missing(inFile, inCode)));
+}
+
+void TranslationsTest::contextsAreTheAgreedOnes_data()
+{
+    QTest::addColumn<QString>("context");
+    QTest::addColumn<QStringList>("texts");
+    QTest::newRow("plug-in") << QStringLiteral("StatReportingPlugin")
+                             << QStringList({QStringLiteral("No report template selected."),
+                                             QStringLiteral("Report Template File (*.rtp)"),
+                                             QStringLiteral("Select Template File"),
+                                             QStringLiteral("Statistics tools")});
+    QTest::newRow("panel") << QStringLiteral("GuiStatReportingPluginUi")
+                           << QStringList({QStringLiteral("Browse Templates"),
+                                           QStringLiteral("Exports current measurments to pdf file."),
+                                           QStringLiteral("Form"), QStringLiteral("Generate Report File"),
+                                           QStringLiteral("Open Statistics Window"),
+                                           QStringLiteral("Open Templates Editor"),
+                                           QStringLiteral("Opens Report Template Editor"),
+                                           QStringLiteral("Opens default template for report generation"),
+                                           QStringLiteral("Template:")});
+    QTest::newRow("keywords") << QStringLiteral("KvReportKeywords")
+                              << QStringList({QStringLiteral("Creation date (ISO)"),
+                                              QStringLiteral("Creation date (Text)"),
+                                              QStringLiteral("Creation time"), QStringLiteral("Program name"),
+                                              QStringLiteral("Program vendor"),
+                                              QStringLiteral("Program version")});
+}
+
+void TranslationsTest::contextsAreTheAgreedOnes()
+{
+    QFETCH(QString, context);
+    QFETCH(QStringList, texts);
+    QStringList found;
+    for (const Message &message : readMessages(path(products.at(0).second, QStringLiteral("English")))) {
+        if (message.context == context)
+            found.append(message.source);
+    }
+    found.sort();
+    QCOMPARE(found, texts);
+}
+
+void TranslationsTest::noTextHidesFromLupdate()
+{
+    const QStringList faults =
+        unmarkedTexts(SourceTree::read(sourcePath(QString()), {QStringLiteral("src"), QStringLiteral("host")},
+                                       {QStringLiteral("*.h"), QStringLiteral("*.cpp")}));
+    QVERIFY2(faults.isEmpty(), lines(faults));
+}
+
+STATREPORT_TEST_MAIN(TranslationsTest)
+#include "TranslationsTest.moc"
