@@ -4,6 +4,7 @@
 #include "blocks/KvReportBlocks.h"
 #include "blocks/textdocument/KvTextDocumentNodeCfg.h"
 #include "data/KvReportKernelData.h"
+#include "editor/KvReportTemplatesEditor.h"
 #include "report/KvBaseDisplayWidget.h"
 #include "report/KvPageFlow.h"
 #include "report/KvReportNode.h"
@@ -16,9 +17,11 @@
 
 #include <QCoreApplication>
 #include <QDragMoveEvent>
+#include <QElapsedTimer>
 #include <QMimeData>
 #include <QTextCursor>
 #include <QTextEdit>
+#include <QVector>
 
 namespace {
 
@@ -107,6 +110,39 @@ void EditedReport::moveMark()
     QDragMoveEvent event(position, Qt::CopyAction, data.get(), Qt::LeftButton, Qt::NoModifier);
     QCoreApplication::sendEvent(m_view->viewport(), &event);
     m_isOdd = !m_isOdd;
+    QCoreApplication::processEvents();
+}
+
+double openEditor()
+{
+    KvReportKernelData kernelData;
+    QElapsedTimer timer;
+    timer.start();
+    KvReportTemplatesEditor editor(&kernelData, nullptr);
+    editor.templateModel()->newTemplate();
+    editor.show();
+    QCoreApplication::processEvents();
+    return static_cast<double>(timer.nsecsElapsed()) / 1e6;
+}
+
+EditorFile::EditorFile(int blocks)
+    : m_kernelData(std::make_unique<KvReportKernelData>())
+    , m_editor(std::make_unique<KvReportTemplatesEditor>(m_kernelData.get(), nullptr))
+{
+    for (int i = 0; i < blocks; ++i) {
+        KvReportNode *node = m_editor->templateModel()->createNode(QLatin1String(kTextType), -1);
+        static_cast<KvTextDocumentNodeCfg *>(node->config())->setText(paragraphs(5));
+    }
+    m_editor->templateModel()->save(m_folder.filePath(QStringLiteral("bench.rtp")));
+    m_editor->show();
+    QCoreApplication::processEvents();
+}
+
+EditorFile::~EditorFile() = default;
+
+void EditorFile::load()
+{
+    m_editor->templateModel()->load(m_folder.filePath(QStringLiteral("bench.rtp")));
     QCoreApplication::processEvents();
 }
 

@@ -1,13 +1,14 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QVector>
+#include <QTemporaryDir>
 
 #include <memory>
 
 class KvBlockTypeList;
 class KvReportKernelData;
 class KvReportPagedView;
+class KvReportTemplatesEditor;
 class KvTemplateModel;
 class QTextEdit;
 
@@ -38,6 +39,26 @@ private:
     std::unique_ptr<KvTemplateModel> m_model;
     std::unique_ptr<KvReportPagedView> m_view;
     bool m_isOdd = false;
+};
+
+/** Milliseconds from nothing to a painted editor window with a new template; the first call is the one that
+ * counts. */
+double openEditor();
+
+/** The editor with a template file of many text blocks. */
+class EditorFile
+{
+public:
+    explicit EditorFile(int blocks);
+    ~EditorFile();
+
+    /** Loads the file, lays it out and paints. */
+    void load();
+
+private:
+    std::unique_ptr<KvReportKernelData> m_kernelData;
+    std::unique_ptr<KvReportTemplatesEditor> m_editor;
+    QTemporaryDir m_folder;
 };
 
 /** Flows \a pieces pieces of mixed heights onto pages; returns the number of pages. */

@@ -8,6 +8,8 @@
 
 #include <QApplication>
 
+#include <cstdio>
+
 namespace {
 
 void keystroke(benchmark::State &state)
@@ -34,6 +36,13 @@ void dragMark(benchmark::State &state)
         report.moveMark();
 }
 
+void loadTemplate(benchmark::State &state)
+{
+    EditorFile file(static_cast<int>(state.range(0)));
+    for (auto _ : state)
+        file.load();
+}
+
 void pageFlow(benchmark::State &state)
 {
     for (auto _ : state)
@@ -44,6 +53,7 @@ void pageFlow(benchmark::State &state)
 BENCHMARK(keystroke)->Arg(1)->Arg(30)->Unit(benchmark::kMillisecond);
 BENCHMARK(newLine)->Arg(1)->Arg(30)->Unit(benchmark::kMillisecond);
 BENCHMARK(dragMark)->Arg(30)->Unit(benchmark::kMillisecond);
+BENCHMARK(loadTemplate)->Arg(20)->Arg(200)->Unit(benchmark::kMillisecond);
 BENCHMARK(pageFlow)->RangeMultiplier(10)->Range(100, 100000)->Unit(benchmark::kMicrosecond)->Complexity();
 
 } // namespace
@@ -55,6 +65,8 @@ int main(int argc, char **argv)
     QApplication app(argc, argv);
     ZtAppSettings::getInstance()->setStoragePath(QString());
     acss::QtAdvancedStylesheet::getInstance()->applyTo(&app);
+    // Only once in a process, so not among the benchmarks.
+    std::printf("first opening of the editor: %.1f ms\n", openEditor());
     benchmark::Initialize(&argc, argv);
     if (benchmark::ReportUnrecognizedArguments(argc, argv))
         return 2;
