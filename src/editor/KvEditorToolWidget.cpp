@@ -40,6 +40,8 @@ void KvEditorToolWidget::mousePressEvent(QMouseEvent *event)
 
 void KvEditorToolWidget::mouseMoveEvent(QMouseEvent *event)
 {
+    // A release may have gone elsewhere, as to a popup.
+    m_isPressed = m_isPressed && (event->buttons() & Qt::LeftButton);
     if (!m_isPressed ||
         (event->pos() - m_pressPosition).manhattanLength() < QApplication::startDragDistance())
         return;

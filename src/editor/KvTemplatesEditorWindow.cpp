@@ -299,7 +299,12 @@ void KvTemplatesEditorWindow::slotOpenTemplate()
 
 bool KvTemplatesEditorWindow::slotSaveTemplate()
 {
-    const QString suggested = QFileInfo(m_model->filePath()).fileName();
+    QString suggested = QFileInfo(m_model->filePath()).fileName();
+    // The dialog asks about replacing the file that is suggested; "a.b.rtp" would be written as
+    // "a.b.rtp.rtp".
+    const QString ending = QLatin1Char('.') + templateFileSuffix();
+    if (QFileInfo(suggested).completeSuffix() != templateFileSuffix() && suggested.endsWith(ending))
+        suggested.chop(ending.size());
     const QString path =
         KvFileDialogs::saveFileName(this, {tr("Choose file to save"), templatesDirectory(),
                                            templateFileFilter(), templateFileSuffix(), suggested});
@@ -342,9 +347,12 @@ void KvTemplatesEditorWindow::printTo(const QString &fileName)
     // The blocks' widgets were on the printer's pages. Before any message, which would stand over empty ones.
     if (isVisible())
         m_model->notifyListChanged();
+    // Whoever cancels the last page when it is written has a report.
+    if (isDone)
+        return;
     if (isCancelled)
         QFile::remove(fileName);
-    else if (!isDone)
+    else
         tellPrintFailed(fileName);
 }
 

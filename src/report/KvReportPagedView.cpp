@@ -80,10 +80,12 @@ KvReportPagedView::KvReportPagedView(QWidget *parent)
 KvReportPagedView::~KvReportPagedView()
 {
     // The scene tells of every focus that it takes away while it dies, and pieces that are let go may tell of
-    // their size.
+    // their size or give the keyboard back.
     m_scene->disconnect(this);
     m_layoutRunning = true;
     dropOverlay();
+    m_selectedItem = nullptr;
+    m_pressedItem = nullptr;
     m_layout.clear();
 }
 
