@@ -78,6 +78,8 @@ public:
     }
     /** Rows of the palette, from top to bottom. */
     QList<QWidget *> palette() const { return childrenOf(editor(), "KvEditorToolWidget"); }
+    /** The group of statistics blocks below the others; its header is at its top. */
+    QWidget *paletteGroup() const { return childrenOf(editor(), "KvEditorToolCombo").value(0); }
     /** The options panel of what is selected; null when there is none. */
     QWidget *options() const
     {
