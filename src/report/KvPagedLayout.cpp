@@ -61,8 +61,10 @@ void KvPagedLayout::rebuild(KvTemplateModel *model, const KvReportNode *leftOut,
     // parent makes Qt polish the style sheets of all widgets in a piece, which takes most of the time of a
     // rebuild.
     QList<QGraphicsItem *> oldItems = m_scene->items();
-    const auto isChild = [](const QGraphicsItem *item) { return item->parentItem() != nullptr; };
-    oldItems.erase(std::remove_if(oldItems.begin(), oldItems.end(), isChild), oldItems.end());
+    const auto isNotOurs = [this](const QGraphicsItem *item) {
+        return item->parentItem() || isDropped(item);
+    };
+    oldItems.erase(std::remove_if(oldItems.begin(), oldItems.end(), isNotOurs), oldItems.end());
     m_model = model;
     const QVector<KvReportPage *> oldPages = std::exchange(m_pages, {});
     m_nodes.clear();
@@ -197,8 +199,16 @@ void KvPagedLayout::dropPagesFrom(int count)
 
 void KvPagedLayout::drop(QGraphicsItem *item)
 {
-    m_scene->removeItem(item);
+    // Not off the scene: it would go on pointing to the first of its widgets after that died outside of it.
+    item->setVisible(false);
     m_droppedItems.emplace_back(item);
+}
+
+bool KvPagedLayout::isDropped(const QGraphicsItem *item) const
+{
+    return std::any_of(
+        m_droppedItems.begin(), m_droppedItems.end(),
+        [item](const std::unique_ptr<QGraphicsItem> &dropped) { return dropped.get() == item; });
 }
 
 void KvPagedLayout::deleteDroppedItems()

@@ -50,8 +50,8 @@ public:
     void removeNode(const KvReportNode *node);
 
     /**
-     * Pages that are no longer needed leave the scene at once, but the header in which the user types may be
-     * on one of them: whoever flows pieces has them deleted later, from the event loop.
+     * Pages that are no longer needed are hidden at once, but the header in which the user types may be on
+     * one of them: whoever flows pieces has them deleted later, from the event loop.
      */
     bool hasDroppedItems() const { return !m_droppedItems.empty(); }
     void deleteDroppedItems();
@@ -91,6 +91,7 @@ private:
     QRect contentRectOf(int page);
     void dropPagesFrom(int count);
     void drop(QGraphicsItem *item);
+    bool isDropped(const QGraphicsItem *item) const;
     void showMarkAt(const QPoint &topLeft);
     void finish();
 
@@ -98,7 +99,7 @@ private:
     QObject *m_listener;
     QPointer<KvTemplateModel> m_model;
     QVector<KvReportPage *> m_pages;
-    std::vector<std::unique_ptr<QGraphicsItem>> m_droppedItems; ///< off the scene
+    std::vector<std::unique_ptr<QGraphicsItem>> m_droppedItems; ///< in the scene, hidden
     QVector<const KvReportNode *> m_nodes; ///< the blocks shown, in order, also those without pieces
     QList<KvReportProxyWidgetItem *> m_pieceItems;
     QGraphicsRectItem *m_mark = nullptr; ///< in the scene while there is a drop index that is met

@@ -228,7 +228,7 @@ void KvReportPagedView::dropOverlay()
 
 void KvReportPagedView::finishLayout()
 {
-    const bool isShown = m_selectedItem && m_selectedItem->scene() == m_scene;
+    const bool isShown = m_selectedItem && m_selectedItem->isVisible();
     if (m_overlay) {
         m_overlay->setVisible(isShown);
         if (isShown)
@@ -241,7 +241,7 @@ void KvReportPagedView::finishLayout()
 void KvReportPagedView::slotDeleteDroppedItems()
 {
     // A selected section may be on one of these pages; its text is taken over first.
-    if (m_selectedItem && m_selectedItem->scene() != m_scene)
+    if (m_selectedItem && !m_selectedItem->isVisible())
         slotCloseAllEditors();
     m_layout.deleteDroppedItems();
 }

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QAbstractItemView>
 #include <QApplication>
 #include <QFileDialog>
+#include <QLineEdit>
 #include <QTimer>
 #include <QVector>
 
@@ -39,8 +41,14 @@ private:
             dialog->reject();
             return;
         }
-        dialog->selectFile(m_path);
-        QMetaObject::invokeMethod(dialog, "accept");
+        // As typed: what is selected in the list depends on how far the list has been read.
+        for (QAbstractItemView *list : dialog->findChildren<QAbstractItemView *>()) {
+            if (list->selectionModel())
+                list->selectionModel()->clearSelection();
+        }
+        dialog->findChild<QLineEdit *>(QStringLiteral("fileNameEdit"))->setText(m_path);
+        // Not from here: it may ask something, and a timer does not fire again within itself.
+        QMetaObject::invokeMethod(dialog, "accept", Qt::QueuedConnection);
     }
 
     QString m_path;
