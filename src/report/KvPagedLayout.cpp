@@ -61,10 +61,10 @@ void KvPagedLayout::rebuild(KvTemplateModel *model, const KvReportNode *leftOut,
     // parent makes Qt polish the style sheets of all widgets in a piece, which takes most of the time of a
     // rebuild.
     QList<QGraphicsItem *> oldItems = m_scene->items();
-    const auto isNotOurs = [this](const QGraphicsItem *item) {
+    const auto isOtherwiseDeleted = [this](const QGraphicsItem *item) {
         return item->parentItem() || isDropped(item);
     };
-    oldItems.erase(std::remove_if(oldItems.begin(), oldItems.end(), isNotOurs), oldItems.end());
+    oldItems.erase(std::remove_if(oldItems.begin(), oldItems.end(), isOtherwiseDeleted), oldItems.end());
     m_model = model;
     const QVector<KvReportPage *> oldPages = std::exchange(m_pages, {});
     m_nodes.clear();
