@@ -170,6 +170,38 @@ def measurements_table(**settings):
     return {"name": "Measurement table", "config": {**config, **settings}}
 
 
+def chart(name, **settings):
+    """A statistics block; its theme, alignment, width and grouping as those of the measurements table."""
+    return {"name": name, "config": {"theme": "Light", "alignment": 132, "widthPercent": 100, **settings}}
+
+
+def statistics_table(**settings):
+    return chart("Statistics Table", **{"alignment": 4, "groupBy": 1, "columns": "Average;Sigma;Min;Max", **settings})
+
+
+def image(data_url, width_percent):
+    return {"name": "Image View", "config": {"imgPath": "", "alignment": "1", "widthPercent": str(width_percent),
+                                             "rotationAngles": "0", "imgData": data_url.split(", ")[1]}}
+
+
+def every_block(theme):
+    """All block types, one after the other."""
+    def heading(text):
+        return text_block(paragraph(text, "font-size:15pt; font-weight:600;"))
+
+    return [
+        image(emblem(), 12),
+        text_block(paragraph("Statistical report", "font-size:26pt; font-weight:600;"),
+                   paragraph("Printed ${CREATION_DATE_TEXT}, ${CREATION_TIME}")),
+        camera_image(75, True),
+        heading("Counted objects"), chart("Counters", theme=theme, widthPercent=80),
+        heading("Spread of each kind of value"), chart("MinMedMaxBox", theme=theme, groupBy=1, widthPercent=80),
+        heading("Values in the order of measurement"), chart("Trend", theme=theme, groupBy=1, widthPercent=80),
+        heading("Statistics"), statistics_table(theme=theme), statistics_table(theme=theme, groupBy=0),
+        measurements_table(theme=theme),
+    ]
+
+
 def camera_image(width_percent, render_measurements):
     return {"name": "Camera Image View", "config": {"alignment": "132", "widthPercent": str(width_percent),
                                                     "rotationAngles": "0", "renderMeasurements": render_measurements}}
@@ -203,6 +235,8 @@ def write_templates():
         "by-value": template([measurements_table(orderColumn="Value", orderAscending=False,
                                                  columns="Object Name;Value Name;Value", widthPercent=75)]),
         "dark": template([measurements_table(theme="Dark")]),
+        "every-block": template(every_block("Light"), head, foot),
+        "every-block-dark": template(every_block("Dark"), head, foot),
     }
     for name, content in templates.items():
         write_json(ROOT / "templates" / f"{name}.rtp", content)
