@@ -36,6 +36,8 @@ QVector<Tick> valueTicks(double min, double max, int count)
 QVector<double> bandEdges(Qt::Orientation orientation, int count)
 {
     QVector<double> edges;
+    if (count < 1)
+        return edges;
     edges.reserve(count);
     const double band = PlotSize / count;
     double edge = 0.0;

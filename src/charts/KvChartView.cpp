@@ -27,6 +27,7 @@ void KvChartView::setChart(kvCharts::KvChart *chart)
     KvChart *previous = m_chart;
     showChart(chart);
     delete previous;
+    fitChart(); // it may have been drawn before, and then announces no rectangle
 }
 
 KvChart *KvChartView::chart() const
@@ -55,6 +56,11 @@ void KvChartView::slotSceneRectChanged(const QRectF &aRect)
 void KvChartView::resizeEvent(QResizeEvent *event)
 {
     QGraphicsView::resizeEvent(event);
+    fitChart();
+}
+
+void KvChartView::fitChart()
+{
     if (scene())
         fitInView(scene()->sceneRect(), m_aspectRatioMode);
 }

@@ -35,6 +35,7 @@ protected:
 
 private:
     void showChart(KvChart *chart);
+    void fitChart();
 
     QPointer<KvChart> m_chart;
     Qt::AspectRatioMode m_aspectRatioMode = Qt::KeepAspectRatio;

@@ -37,6 +37,12 @@ QVector<QPointF> finitePoints(const QVector<QPointF> &points)
     return result;
 }
 
+bool standAtOneX(const QVector<QPointF> &points)
+{
+    const double x = points.first().x();
+    return std::all_of(points.begin(), points.end(), [x](const QPointF &point) { return point.x() == x; });
+}
+
 } // namespace
 
 KvLineParts::KvLineParts(const KvLineSerie *serie, const KvCategoryList &categories,
@@ -91,9 +97,12 @@ void KvLineParts::drawLimits(QGraphicsScene *scene) const
     }
 }
 
-// Points that all stand at one x have no such line.
+// Points that all stand at one x have no such line. The regression may find one all the same, of any slope:
+// the mean of equal numbers need not be that number.
 void KvLineParts::drawTrend(QGraphicsScene *scene, const QVector<QPointF> &points) const
 {
+    if (standAtOneX(points))
+        return;
     const QPair<double, double> line = KvStatisticsEngine::regression(points);
     if (const std::optional<QLineF> trend = KvLineGeometry::trendLine(line.first, line.second))
         scene->addLine(*trend, m_trendPen);

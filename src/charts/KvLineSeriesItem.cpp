@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "charts/KvLineSeriesItem.h"
 
+#include "charts/KvMarkerSheet.h"
+
 #include <QPaintEngine>
 #include <QPainter>
 
@@ -77,6 +79,10 @@ void KvLineSeriesItem::paintPixels(QPainter *painter) const
 {
     for (const QVector<QPointF> &run : m_runs)
         painter->drawLines(segments(run));
+    if (KvMarkerSheet::isWorthwhile(*painter, markerRect(QPointF()), m_points.size())) {
+        KvMarkerSheet(*painter, markerRect(QPointF())).draw(painter, m_points);
+        return;
+    }
     for (const QPointF &point : m_points)
         painter->drawEllipse(markerRect(point));
 }

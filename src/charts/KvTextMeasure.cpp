@@ -11,10 +11,12 @@ namespace {
 
 enum class TextKind { Ascii, OneLine, Document };
 
+// Text documents take non-characters for the borders of their frames.
 bool needsDocument(QChar c)
 {
-    return c.category() == QChar::Other_Control || c.category() == QChar::Other_Format ||
-           c.category() == QChar::Separator_Line || c.category() == QChar::Separator_Paragraph;
+    return c.isNonCharacter() || c.category() == QChar::Other_Control ||
+           c.category() == QChar::Other_Format || c.category() == QChar::Separator_Line ||
+           c.category() == QChar::Separator_Paragraph;
 }
 
 TextKind kindOf(const QString &text)
@@ -49,8 +51,14 @@ KvTextExtent KvTextMeasure::measure(const QString &text)
     if (kind == TextKind::OneLine)
         return measureLayout(text);
     KvTextExtent extent = m_oneFontExtent;
-    extent.size.setWidth(m_metrics.horizontalAdvance(text) + 2 * Margin);
+    extent.size.setWidth(m_metrics.horizontalAdvance(text) + overhang(text) + 2 * Margin);
     return extent;
+}
+
+// By how much the last letter ("f" or "W", say) reaches over its advance; lines make room for it.
+qreal KvTextMeasure::overhang(const QString &text) const
+{
+    return text.isEmpty() ? 0.0 : std::max(0.0, -m_metrics.rightBearing(text.back()));
 }
 
 // Letters outside ASCII may come from a substitute font, which makes the line higher.

@@ -15,7 +15,7 @@ struct KvTextExtent
     QSizeF size;        ///< bounding rectangle of a text item, its margins included
     qreal ascent = 0.0; ///< of the line below the upper margin; 0 where a text document has to draw the text
 
-    /** False when control characters in the text need a whole text document. */
+    /** False when control or non-characters in the text need a whole text document. */
     bool isOneLine() const { return ascent > 0.0; }
 };
 
@@ -34,6 +34,7 @@ public:
     KvTextExtent measure(const QString &text);
 
 private:
+    qreal overhang(const QString &text) const;
     KvTextExtent measureLayout(const QString &text);
     KvTextExtent measureDocument(const QString &text) const;
 

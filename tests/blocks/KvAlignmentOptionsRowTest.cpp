@@ -6,8 +6,36 @@
 #include "gui/QtAdvancedStylesheet.h"
 #include "gui/acss.h"
 
+#include <QPainter>
 #include <QPushButton>
-#include <QStyleOptionButton>
+
+namespace {
+
+/** What an icon covers of its square. */
+QRect strokesOf(const QImage &icon)
+{
+    QRect strokes;
+    for (int y = 0; y < icon.height(); ++y) {
+        for (int x = 0; x < icon.width(); ++x) {
+            if (icon.pixelColor(x, y).alpha() > 0)
+                strokes |= QRect(x, y, 1, 1);
+        }
+    }
+    return strokes;
+}
+
+/** The button as it is without its icon, and the whole of \a icon drawn on it. */
+QImage drawnByHand(QPushButton *button, const QPixmap &icon)
+{
+    const QIcon own = button->icon();
+    button->setIcon(QIcon());
+    QImage image = button->grab().toImage();
+    button->setIcon(own);
+    QPainter(&image).drawPixmap(0, 0, icon);
+    return image;
+}
+
+} // namespace
 
 class KvAlignmentOptionsRowTest : public StatReportTest
 {
@@ -127,15 +155,21 @@ void KvAlignmentOptionsRowTest::iconsAreWhole()
     {
         KvAlignmentOptionsRow row;
         QVERIFY(PanelProbe::show(&row));
+        row.activateWindow();
         for (QPushButton *button : PanelProbe::controls<QPushButton>(&row)) {
-            QCOMPARE(button->size(), QSize(32, 32));
-            QStyleOptionButton option;
-            option.initFrom(button);
-            option.features = QStyleOptionButton::None;
-            option.state.setFlag(QStyle::State_HasFocus, focused);
-            const QRect contents =
-                button->style()->subElementRect(QStyle::SE_PushButtonContents, &option, button);
-            QVERIFY(contents.contains(QRect(QPoint(4, 4), QSize(24, 24))));
+            QCOMPARE(button->size(), QSize(24, 24));
+            if (focused)
+                button->setFocus();
+            else
+                button->clearFocus();
+            QTRY_COMPARE(button->hasFocus(), focused);
+            const QPixmap icon =
+                button->icon().pixmap(button->size(), focused ? QIcon::Active : QIcon::Normal);
+            QCOMPARE(button->grab().toImage(), drawnByHand(button, icon));
+            // Frame and focus ring stay clear of its strokes.
+            const QRect strokes = strokesOf(icon.toImage());
+            QVERIFY(!strokes.isEmpty());
+            QVERIFY(button->rect().adjusted(2, 2, -2, -2).contains(strokes));
         }
     }
     themes->setCurrentTheme(QStringLiteral("Dark"));

@@ -56,7 +56,7 @@ QImage paintRows(const KvBaseTableItemDelegate &delegate, const std::shared_ptr<
     image.fill(Qt::magenta);
     KvBaseTableItemDelegate::Geometry geometry;
     geometry.rowHeight = rowHeight;
-    geometry.columnEdges = KvBaseTableItemDelegate::sharedEdges(0, width, model.columnCount());
+    geometry.columnEdges = model.columnEdges(0, width);
     QPainter painter(&image);
     delegate.paintRows(&painter, model, geometry, 0, model.rowCount() - 1);
     return image;
@@ -131,8 +131,6 @@ private slots:
     void bodySpansAreNotApplied();
     void paintsOnlyTheRowsAskedFor();
     void nothingToPaint();
-    void columnsShareTheWidth_data();
-    void columnsShareTheWidth();
     void cellsLeaveRoomForGridLines();
     void fontsOfTheCellsAreUsed();
     void toolTipsShowWhatIsCut();
@@ -371,27 +369,6 @@ void KvBaseTableItemDelegateTest::nothingToPaint()
     delegate.paintRows(&painter, model, geometry, 0, -1); // no rows
     painter.end();
     QVERIFY(isOneColor(image, image.rect(), Qt::magenta));
-}
-
-void KvBaseTableItemDelegateTest::columnsShareTheWidth_data()
-{
-    QTest::addColumn<int>("left");
-    QTest::addColumn<int>("width");
-    QTest::addColumn<int>("columns");
-    QTest::addColumn<QVector<int>>("edges");
-    QTest::newRow("no column") << 5 << 100 << 0 << QVector<int>{};
-    QTest::newRow("one") << 5 << 100 << 1 << QVector<int>{5, 105};
-    QTest::newRow("evenly") << 0 << 100 << 4 << QVector<int>{0, 25, 50, 75, 100};
-    QTest::newRow("the last one takes the rest") << 10 << 101 << 3 << QVector<int>{10, 43, 76, 111};
-    QTest::newRow("more columns than pixels") << 0 << 2 << 3 << QVector<int>{0, 0, 0, 2};
-}
-
-void KvBaseTableItemDelegateTest::columnsShareTheWidth()
-{
-    QFETCH(int, left);
-    QFETCH(int, width);
-    QFETCH(int, columns);
-    QTEST(KvBaseTableItemDelegate::sharedEdges(left, width, columns), "edges");
 }
 
 void KvBaseTableItemDelegateTest::cellsLeaveRoomForGridLines()

@@ -86,7 +86,7 @@ void KvCameraImageNodeOptionsWidgetTest::fitsTheSide()
     panel.setFixedWidth(290);
     QVERIFY(PanelProbe::show(&panel));
     QVERIFY(panel.minimumSizeHint().width() <= 290);
-    QCOMPARE(KvImagePanelProbe::controlHeights(&panel), QList<int>({28, 28, 32, 32, 32}));
+    QCOMPARE(KvImagePanelProbe::controlHeights(&panel), QList<int>({28, 28, 24, 24, 24}));
     qApp->setStyleSheet(QString());
 }
 

@@ -193,7 +193,7 @@ void KvImageNodeOptionsWidgetTest::fitsTheSide()
     panel.setFixedWidth(290);
     QVERIFY(PanelProbe::show(&panel));
     QVERIFY(panel.minimumSizeHint().width() <= 290);
-    QCOMPARE(KvImagePanelProbe::controlHeights(&panel), QList<int>({28, 28, 32, 32, 32, 28}));
+    QCOMPARE(KvImagePanelProbe::controlHeights(&panel), QList<int>({28, 28, 24, 24, 24, 28}));
     qApp->setStyleSheet(QString());
 }
 

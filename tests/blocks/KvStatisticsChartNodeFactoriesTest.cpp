@@ -2,12 +2,15 @@
 #include "support/StatReportTest.h"
 
 #include "ChartBlocks.h"
+#include "MarkingTranslator.h"
 #include "blocks/KvReportBlocks.h"
 #include "blocks/textdocument/KvTextDocumentNodeCfg.h"
 #include "gui/acss.h"
 #include "resources/KvReportResources.h"
 #include "templates/KvBlockRegistry.h"
 #include "templates/KvTemplateContext.h"
+
+#include <QLabel>
 
 /** What the palette and files call the charts, and what comes out of their factories. */
 class KvStatisticsChartNodeFactoriesTest : public StatReportTest
@@ -18,6 +21,8 @@ private slots:
     void initTestCase() { KvReportResources::ensure(); }
     void namesTitlesAndIcons_data();
     void namesTitlesAndIcons();
+    void titlesAreTranslated_data() { namesTitlesAndIcons_data(); }
+    void titlesAreTranslated();
     void makesOwnConfigurations_data() { ChartBlocks::addBlockRows(); }
     void makesOwnConfigurations();
     void makesDisplayWidgets_data() { ChartBlocks::addBlockRows(); }
@@ -57,6 +62,25 @@ void KvStatisticsChartNodeFactoriesTest::namesTitlesAndIcons()
     QCOMPARE(icon, acss::createIcon(6, iconPath, size).pixmap(size).toImage());
     QVERIFY(icon !=
             acss::createIcon(6, QStringLiteral("Icons/ToolIconText.svg"), size).pixmap(size).toImage());
+}
+
+void KvStatisticsChartNodeFactoriesTest::titlesAreTranslated()
+{
+    QFETCH(QString, name);
+    QFETCH(QString, title);
+    MarkingTranslator translator(QStringLiteral("KvBaseEditorNodeFactory"));
+    QCoreApplication::installTranslator(&translator);
+    const auto factory = ChartBlocks::factory(name);
+    const auto cfg = ChartBlocks::makeConfig(name, nullptr);
+    const auto widget = ChartBlocks::makeWidget(name, cfg.get());
+    const std::unique_ptr<QWidget> panel(widget->createOptionsWidget(nullptr, true));
+    const QString displayName = widget->displayName();
+    QCoreApplication::removeTranslator(&translator);
+    const QString marked = QStringLiteral("«%1»").arg(title);
+    QCOMPARE(factory->name(), name); // files hold the untranslated one
+    QCOMPARE(factory->title(), marked);
+    QCOMPARE(displayName, marked);
+    QCOMPARE(panel->findChild<QLabel *>(QStringLiteral("sideHeader"))->text(), marked);
 }
 
 void KvStatisticsChartNodeFactoriesTest::makesOwnConfigurations()

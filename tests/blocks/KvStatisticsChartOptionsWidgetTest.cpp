@@ -183,9 +183,11 @@ void KvStatisticsChartOptionsWidgetTest::textsAreLiteral()
     QCOMPARE(widthBox()->minimum(), 1);
     QCOMPARE(widthBox()->maximum(), 100);
     QCOMPARE(widthBox()->buttonSymbols(), QAbstractSpinBox::NoButtons);
+    QCOMPARE(m_panel->sizePolicy(), QSizePolicy(QSizePolicy::Preferred, QSizePolicy::Preferred));
     QCOMPARE(buttons().size(), 3);
     for (const QPushButton *button : buttons()) {
         QVERIFY(button->isCheckable());
+        QCOMPARE(button->size(), QSize(24, 24));
         QCOMPARE(button->iconSize(), QSize(24, 24));
         QVERIFY(!button->toolTip().isEmpty());
         QVERIFY(!button->accessibleName().isEmpty());

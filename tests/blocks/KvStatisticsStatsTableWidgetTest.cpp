@@ -10,6 +10,8 @@
 #include "TypedMeasurements.h"
 #include "blocks/statisticstable/KvStatisticsStatsTableNodeCfg.h"
 #include "blocks/statisticstable/KvStatisticsStatsTableWidget.h"
+#include "blocks/table/KvBaseTableItemDelegate.h"
+#include "blocks/table/KvTableGrid.h"
 #include "kernel/ZtAppSettings.h"
 
 #include <QCheckBox>
@@ -62,6 +64,8 @@ private slots:
     void cellsAreNeitherFlaggedNorSpanned();
     void refreshesWhenTheEngineReports();
     void aThemeChangeRepaints();
+    void numbersAreNotCut();
+    void allPiecesHaveTheSameColumns();
     void longTablesAreSplit();
     void thePageHeightSplitsAnew();
     void optionSlotsAnnounceRealChanges();
@@ -370,6 +374,44 @@ void KvStatisticsStatsTableWidgetTest::aThemeChangeRepaints()
     m_cfg->setTheme(1);
     QCOMPARE(m_table->subWidgetAt(0), piece);
     QCOMPARE(piece->grab().toImage().pixelColor(inTable), QColor("#DDDDDD"));
+}
+
+void KvStatisticsStatsTableWidgetTest::numbersAreNotCut()
+{
+    m_host->add(QStringLiteral("Iris versicolor"), QStringLiteral("petal length"),
+                {30000.0, 47000.0, 51000.0});
+    m_host->add(QStringLiteral("Iris virginica"), QStringLiteral("petal width"), {14000.0, 20000.0, 25000.0});
+    // The defaults: eight columns at three quarters of the width.
+    KvStatisticSubTable *piece = TableProbe::piece(m_table->subWidgetAt(0));
+    const int width = m_context->usableWidth() * 3 / 4;
+    const QVector<int> edges = piece->model()->columnEdges(0, width);
+    QCOMPARE(edges.size(), 9);
+    QCOMPARE(edges.last(), width);
+    const KvBaseTableItemDelegate delegate(m_cfg->themes());
+    for (int row = 0; row < piece->model()->rowCount(); ++row) {
+        for (int column = 2; column < 8; ++column) {
+            const QString text = piece->model()->cell(row, column)->text;
+            const int cellWidth = edges.at(column + 1) - edges.at(column) - 1;
+            QVERIFY2(!delegate.isShortened(text, piece->model()->rowFont(row), cellWidth), qPrintable(text));
+        }
+    }
+    // The view on the screen has the columns of the print. The picture delivers the events of its new size.
+    piece->grab();
+    for (int column = 0; column < 8; ++column)
+        QCOMPARE(piece->tableView()->columnViewportPosition(column), edges.at(column));
+}
+
+void KvStatisticsStatsTableWidgetTest::allPiecesHaveTheSameColumns()
+{
+    for (int i = 0; i < 45; ++i)
+        m_host->add(QStringLiteral("A"), QStringLiteral("v%1").arg(i, i == 44 ? 40 : 2, 10, QLatin1Char('0')),
+                    {1.0});
+    QCOMPARE(m_table->subWidgetCount(), 2);
+    const auto edges = [this](int index) {
+        return TableProbe::piece(m_table->subWidgetAt(index))->model()->columnEdges(0, 600);
+    };
+    QCOMPARE(edges(0), edges(1));
+    QVERIFY(edges(0).at(2) - edges(0).at(1) > 600 / 8);
 }
 
 void KvStatisticsStatsTableWidgetTest::longTablesAreSplit()

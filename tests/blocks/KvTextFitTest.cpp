@@ -19,6 +19,8 @@ private slots:
     void shortensTextsThatDoNotFit();
     void agreesWithMeasuringAtEveryWidth_data();
     void agreesWithMeasuringAtEveryWidth();
+    void theWidthForTextsSuffices_data();
+    void theWidthForTextsSuffices();
     void lineBreaksBecomeBlanks();
     void anEmptyTextStaysEmpty();
     void metricsAreTheFonts();
@@ -98,6 +100,21 @@ void KvTextFitTest::agreesWithMeasuringAtEveryWidth()
                 QVERIFY2(!isWhole, qPrintable(QStringLiteral("whole at %1 of %2").arg(width).arg(natural)));
         }
     }
+}
+
+void KvTextFitTest::theWidthForTextsSuffices_data()
+{
+    addTexts();
+}
+
+void KvTextFitTest::theWidthForTextsSuffices()
+{
+    QFETCH(QString, text);
+    const KvTextFit fit(KvTableFonts::body());
+    const qreal width = fit.widthFor(text, 10);
+    QCOMPARE(fit.fitted(text, width), text);
+    QVERIFY(width <= QFontMetricsF(KvTableFonts::body()).horizontalAdvance(text) + 2);
+    QCOMPARE(fit.widthFor(text, 2 * width), 2 * width);
 }
 
 void KvTextFitTest::lineBreaksBecomeBlanks()

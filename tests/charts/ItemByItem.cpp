@@ -2,8 +2,10 @@
 #include "ItemByItem.h"
 
 #include "SceneItems.h"
+#include "charts/KvLineRunItem.h"
 #include "charts/KvTextRunItem.h"
 
+#include <QGraphicsItemGroup>
 #include <QGraphicsTextItem>
 #include <QPainter>
 
@@ -24,6 +26,88 @@ QSizeF textSize(const QString &text)
     QGraphicsTextItem item(text);
     item.setFont(font(11.0));
     return item.boundingRect().size();
+}
+
+// Returns the height of the rows.
+double addLegendEntries(QGraphicsScene *scene, const QVector<LegendEntry> &entries, const QColor &textColor)
+{
+    QGraphicsItemGroup *group = scene->createItemGroup({});
+    double x = 0;
+    double y = 0;
+    for (const LegendEntry &entry : entries) {
+        group->addToGroup(scene->addRect(x, y, 7, 7, cosmeticPen(entry.color), QBrush(entry.color)));
+        QGraphicsTextItem *text = scene->addText(entry.text, font(12.0));
+        const QSizeF size = text->boundingRect().size();
+        text->setDefaultTextColor(textColor);
+        text->setPos(x + 16, y + 4 - size.height() / 2);
+        group->addToGroup(text);
+        x += size.width() + 16 + 32;
+        if (x > 800) {
+            x = 0;
+            y += size.height() + 10;
+        }
+    }
+    const QSizeF size = group->boundingRect().size();
+    group->setPos(500 - size.width() / 2, -size.height());
+    return size.height();
+}
+
+using Component = int (*)(QRgb);
+
+// The least and the greatest value of a colour component around a pixel.
+std::pair<int, int> rangeAround(const QImage &image, int x, int y, Component component)
+{
+    int least = 255;
+    int greatest = 0;
+    for (int row = std::max(y - 1, 0); row <= std::min(y + 1, image.height() - 1); ++row) {
+        const auto *line = reinterpret_cast<const QRgb *>(image.constScanLine(row));
+        for (int column = std::max(x - 1, 0); column <= std::min(x + 1, image.width() - 1); ++column) {
+            least = std::min(least, component(line[column]));
+            greatest = std::max(greatest, component(line[column]));
+        }
+    }
+    return {least, greatest};
+}
+
+// Whether a pixel's colour occurs around the same place of the other picture. A thin stroke that stands half
+// beside its pixel loses less than half of its contrast.
+bool occurs(const QImage &picture, const QImage &other, int x, int y)
+{
+    const QRgb color = picture.pixel(x, y);
+    if (color == other.pixel(x, y))
+        return true;
+    const QRgb ground = picture.pixel(0, 0);
+    for (const Component component : {Component(qRed), Component(qGreen), Component(qBlue)}) {
+        const int value = component(color);
+        const int tolerance = std::abs(value - component(ground)) * 45 / 100 + 2;
+        const auto range = rangeAround(other, x, y, component);
+        if (value < range.first - tolerance || value > range.second + tolerance)
+            return false;
+    }
+    return true;
+}
+
+bool allOccur(const QImage &picture, const QImage &other)
+{
+    for (int y = 0; y < picture.height(); ++y) {
+        for (int x = 0; x < picture.width(); ++x) {
+            if (!occurs(picture, other, x, y))
+                return false;
+        }
+    }
+    return true;
+}
+
+QString placedLine(const QLineF &line, const QPen &pen)
+{
+    QString text;
+    for (const qreal coordinate : {line.x1(), line.y1(), line.x2(), line.y2()})
+        text += QStringLiteral("%1 ").arg(coordinate, 0, 'f', 6);
+    return text + QStringLiteral("in %1 %2 %3 %4")
+                      .arg(pen.color().name())
+                      .arg(pen.widthF())
+                      .arg(pen.style())
+                      .arg(pen.isCosmetic());
 }
 
 } // namespace
@@ -134,6 +218,19 @@ void addSeries(QGraphicsScene *scene, const QVector<QPointF> &points, const QCol
     }
 }
 
+void addLegend(QGraphicsScene *scene, const QVector<LegendEntry> &entries, const QString &title,
+               const QColor &textColor)
+{
+    const double top = entries.isEmpty() ? 0 : -6 - addLegendEntries(scene, entries, textColor);
+    if (title.isEmpty())
+        return;
+    QFont titleFont = font(14.0);
+    titleFont.setBold(true);
+    QGraphicsTextItem *text = scene->addText(title, titleFont);
+    text->setDefaultTextColor(textColor);
+    text->setPos(500 - text->boundingRect().width() / 2, top - text->boundingRect().height());
+}
+
 QImage picture(QGraphicsScene *scene, const QRectF &source)
 {
     QImage image(900, 900, QImage::Format_ARGB32_Premultiplied);
@@ -146,15 +243,8 @@ QImage picture(QGraphicsScene *scene, const QRectF &source)
 
 bool alike(const QImage &first, const QImage &second)
 {
-    if (first.size() != second.size())
-        return false;
-    int different = 0;
-    for (int y = 0; y < first.height(); ++y) {
-        for (int x = 0; x < first.width(); ++x)
-            different += qAbs(qGreen(first.pixel(x, y)) - qGreen(second.pixel(x, y))) > 2 ? 1 : 0;
-    }
-    const int inked = inkedPixels(second);
-    return inked > 500 && different * 20 < inked;
+    return first.size() == second.size() && inkedPixels(second) > 500 && allOccur(first, second) &&
+           allOccur(second, first);
 }
 
 QStringList placedTexts(const QGraphicsScene *scene)
@@ -169,10 +259,23 @@ QStringList placedTexts(const QGraphicsScene *scene)
                           .arg(size.height()));
     };
     for (const QGraphicsTextItem *item : itemsOf<QGraphicsTextItem>(scene))
-        append(item->toPlainText(), item->pos(), item->boundingRect().size());
+        append(item->toPlainText(), item->scenePos(), item->boundingRect().size());
     for (const kvCharts::KvTextRunItem *run : itemsOf<kvCharts::KvTextRunItem>(scene)) {
         for (const kvCharts::KvPlacedText &text : run->texts())
-            append(text.text, text.topLeft, text.extent.size);
+            append(text.text, run->mapToScene(text.topLeft), text.extent.size);
+    }
+    result.sort();
+    return result;
+}
+
+QStringList placedLines(const QGraphicsScene *scene)
+{
+    QStringList result;
+    for (const QGraphicsLineItem *item : itemsOf<QGraphicsLineItem>(scene))
+        result.append(placedLine(item->line(), item->pen()));
+    for (const kvCharts::KvLineRunItem *run : itemsOf<kvCharts::KvLineRunItem>(scene)) {
+        for (const QLineF &line : run->lines())
+            result.append(placedLine(line, run->pen()));
     }
     result.sort();
     return result;

@@ -37,17 +37,31 @@ void addCategoryAxisY(QGraphicsScene *scene, const AxisLook &look, const QString
 /** Markers and the lines that join them. */
 void addSeries(QGraphicsScene *scene, const QVector<QPointF> &points, const QColor &color);
 
+struct LegendEntry
+{
+    QString text;
+    QColor color;
+};
+
+/** The entries above the plot, and above these the title if there is one. */
+void addLegend(QGraphicsScene *scene, const QVector<LegendEntry> &entries, const QString &title,
+               const QColor &textColor);
+
 /** A part of a scene, smoothly, in 900 × 900 pixels. */
 QImage picture(QGraphicsScene *scene, const QRectF &source);
 
 /**
- * Whether two pictures show the same, up to some letters that stand a quarter of a pixel beside: letters are
- * drawn at quarters of a pixel, and their places are rounded to 1/64 unit before in one way of drawing only.
+ * Whether two pictures show the same, up to letters that stand less than a pixel beside: letters are drawn at
+ * quarters of a pixel, and their places are rounded to 1/64 unit before in one way of drawing only. False for
+ * pictures with hardly anything on them.
  */
 bool alike(const QImage &first, const QImage &second);
 
 /** The texts of a scene with place and size, whatever items show them, in the order of their texts. */
 QStringList placedTexts(const QGraphicsScene *scene);
+
+/** The straight lines of a scene with their pens, whatever items show them, in a fixed order. */
+QStringList placedLines(const QGraphicsScene *scene);
 
 /** Largest difference of two colour components at the same place; 255 when the sizes differ. */
 int difference(const QImage &first, const QImage &second);

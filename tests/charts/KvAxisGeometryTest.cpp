@@ -17,6 +17,7 @@ private slots:
     void sumsUp();
     void bandEdges_data();
     void bandEdges();
+    void bandEdgesOfManyBands();
     void lines_data();
     void lines();
     void gridAtTheOrigin();
@@ -89,12 +90,20 @@ void KvAxisGeometryTest::sumsUp()
         sum += (0.7 - -0.3) / 10;
     QVERIFY(sum != 0.0);
     QVERIFY(ticks.at(3).value == sum);
+
+    const auto many = KvAxisGeometry::valueTicks(0.0, 1.0, 50);
+    double offset = 0.0;
+    for (int i = 0; i < 49; ++i)
+        offset += 1000.0 / 49;
+    QVERIFY(offset != 49 * (1000.0 / 49));
+    QVERIFY(many.last().offset == offset);
 }
 
 void KvAxisGeometryTest::bandEdges_data()
 {
     QTest::addColumn<int>("count");
     QTest::addColumn<QVector<double>>("edges");
+    QTest::newRow("fewer than none") << -1 << QVector<double>{};
     QTest::newRow("none") << 0 << QVector<double>{};
     QTest::newRow("one") << 1 << QVector<double>{1000};
     QTest::newRow("four") << 4 << QVector<double>{250, 500, 750, 1000};
@@ -111,6 +120,19 @@ void KvAxisGeometryTest::bandEdges()
         for (int i = 0; i < edges.size(); ++i)
             QVERIFY(qAbs(found.at(i) - edges.at(i)) < 1e-9);
     }
+}
+
+void KvAxisGeometryTest::bandEdgesOfManyBands()
+{
+    // Along x each band starts where the one before ends, along y at a multiple of its height.
+    constexpr int count = 49;
+    const double band = 1000.0 / count;
+    double sum = 0.0;
+    for (int i = 0; i < count; ++i)
+        sum += band;
+    QVERIFY(sum != count * band);
+    QVERIFY(KvAxisGeometry::bandEdges(Qt::Horizontal, count).last() == sum);
+    QVERIFY(KvAxisGeometry::bandEdges(Qt::Vertical, count).last() == count * band);
 }
 
 void KvAxisGeometryTest::lines_data()

@@ -42,6 +42,11 @@ void KvAxisRangeTest::around_data()
     QTest::newRow("zero") << 0.0 << 0.0 << -1.0 << 1.0 << 5;
     QTest::newRow("one negative value: swapped") << -7.0 << -7.0 << -6.3 << -7.7 << 5;
     QTest::newRow("from below zero") << -30.0 << 30.0 << -30.0 << 30.0 << 13;
+    QTest::newRow("start below the least") << -3.0 << 44.0 << -5.0 << 45.0 << 11;
+    QTest::newRow("all below zero") << -47.0 << -3.0 << -50.0 << 0.0 << 11;
+    QTest::newRow("step 1") << 0.2 << 4.4 << 0.0 << 5.0 << 6;
+    QTest::newRow("step 2") << 0.0 << 20.0 << 0.0 << 20.0 << 11;
+    QTest::newRow("step 25") << 0.0 << 290.0 << 0.0 << 300.0 << 13;
     QTest::newRow("step 250") << 0.0 << 2600.0 << 0.0 << 2750.0 << 12;
     QTest::newRow("swapped limits") << 9.0 << 1.0 << 9.0 << 1.0 << 5;
     QTest::newRow("start beyond 32 bits") << 1e15 << 1e15 + 100 << 1e15 << 1e15 + 100 << 11;

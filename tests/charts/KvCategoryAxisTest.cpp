@@ -8,6 +8,7 @@
 #include "charts/KvChartThemes.h"
 #include "charts/KvLineRunItem.h"
 #include "charts/KvTextRunItem.h"
+#include <QGraphicsTextItem>
 
 using namespace kvCharts;
 
@@ -25,6 +26,7 @@ private slots:
     void noCategories_data();
     void noCategories();
     void readsFromTheTop();
+    void labelFont();
     void fewItemsForManyLabels();
 };
 
@@ -137,6 +139,7 @@ void KvCategoryAxisTest::looksLikeSingleItems()
     QVERIFY(ItemByItem::sameRect(combined.itemsBoundingRect(), single.itemsBoundingRect()));
     const QRectF source(-150, -50, 1250, 1250);
     QCOMPARE(ItemByItem::placedTexts(&combined), ItemByItem::placedTexts(&single));
+    QCOMPARE(ItemByItem::placedLines(&combined), ItemByItem::placedLines(&single));
     QVERIFY(ItemByItem::alike(ItemByItem::picture(&combined, source), ItemByItem::picture(&single, source)));
 }
 
@@ -177,6 +180,19 @@ void KvCategoryAxisTest::readsFromTheTop()
     QCOMPARE(middle(texts.at(0)), 250.0);
     QCOMPARE(middle(texts.at(1)), 750.0);
     QCOMPARE(texts.at(0).topLeft.x() + texts.at(0).extent.size.width(), -5.0);
+}
+
+void KvCategoryAxisTest::labelFont()
+{
+    const KvChartThemes themes;
+    KvAxisYCategories axis;
+    axis.setCategories({QStringLiteral("two\nlines")}); // an item of its own
+    QGraphicsScene scene;
+    axis.draw(&scene, &themes);
+    const QGraphicsTextItem *label = itemsOf<QGraphicsTextItem>(&scene).first();
+    QCOMPARE(label->font().family(), QStringLiteral("Segoe UI"));
+    QCOMPARE(label->font().pointSizeF(), 11.0);
+    QCOMPARE(label->font().weight(), 50);
 }
 
 void KvCategoryAxisTest::fewItemsForManyLabels()

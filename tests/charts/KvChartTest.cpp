@@ -159,6 +159,16 @@ void KvChartTest::partsRedraw()
     chart.setAxisX(axis); // connected once
     axis->setRange(0.0, 4.0);
     QCOMPARE(log.size(), 8);
+    auto *axisY = new KvAxisYValues;
+    chart.setAxisY(axisY);
+    QCOMPARE(chart.axisY(), axisY);
+    QCOMPARE(log.size(), 9);
+    axisY->setTickCount(3);
+    QCOMPARE(log.size(), 10);
+    chart.setAxisY(nullptr);
+    QCOMPARE(log.size(), 11);
+    axisY->setTickCount(4); // let go of only with the chart
+    QCOMPARE(log.size(), 12);
 }
 
 void KvChartTest::aReplacedAxisIsKept()

@@ -142,6 +142,10 @@ void KvChartViewTest::fitsTheScene()
     view.setChart(new KvChart(&themes));
     view.chart()->addPart(new AreaPart(QRectF(0, 0, 800, 700)));
     QVERIFY(isFitted());
+    auto *drawnBefore = new KvChart(&themes);
+    drawnBefore->addPart(new AreaPart(QRectF(0, 0, 5000, 4000)));
+    view.setChart(drawnBefore);
+    QVERIFY(isFitted());
 }
 
 STATREPORT_TEST_MAIN(KvChartViewTest)

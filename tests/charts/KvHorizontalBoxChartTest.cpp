@@ -1,12 +1,16 @@
 // SPDX-License-Identifier: MIT
 #include "support/StatReportTest.h"
 
+#include "SceneItems.h"
 #include "charts/KvAxisXValues.h"
 #include "charts/KvAxisYCategories.h"
 #include "charts/KvChartThemes.h"
 #include "charts/KvHorizontalBox.h"
 #include "charts/KvHorizontalBoxChart.h"
 #include "charts/KvLineRunItem.h"
+#include "charts/KvTextRunItem.h"
+
+#include <QGraphicsRectItem>
 
 using namespace kvCharts;
 
@@ -18,6 +22,8 @@ private slots:
     void axes();
     void twoEntries();
     void oneValue();
+    void boxesTakeTheMiddleOfTheirBands_data();
+    void boxesTakeTheMiddleOfTheirBands();
     void emptyRebuildKeepsTheAxes();
     void clears();
     void rebuildsOncePerUpdate();
@@ -37,6 +43,14 @@ QVector<const KvHorizontalBox *> boxes(const KvChart &chart)
 QString name(const char *latin)
 {
     return QString::fromLatin1(latin);
+}
+
+QStringList texts(const KvTextRunItem *run)
+{
+    QStringList result;
+    for (const KvPlacedText &placed : run->texts())
+        result.append(placed.text);
+    return result;
 }
 
 const KvAxisYCategories *categoryAxis(const KvChart &chart)
@@ -96,6 +110,52 @@ void KvHorizontalBoxChartTest::oneValue()
         QCOMPARE(point.x, 500.0);
     QCOMPARE(boxes(chart).first()->extent().top, 250.0);
     QCOMPARE(boxes(chart).first()->extent().bottom, 750.0);
+
+    // All that is drawn: the ticks of the value axis, the name, the labels side by side with leader lines.
+    const auto runs = itemsOf<KvTextRunItem>(&chart);
+    QCOMPARE(runs.size(), 3);
+    QCOMPARE(texts(runs.at(0)),
+             QStringList({name("4.5"), name("4.75"), name("5"), name("5.25"), name("5.5")}));
+    QCOMPARE(texts(runs.at(1)), QStringList{name("five")});
+    const QVector<KvPlacedText> labels = runs.at(2)->texts();
+    QCOMPARE(texts(runs.at(2)), QStringList({name("5"), name("5"), name("5"), name("5"), name("5")}));
+    const double width = labels.first().extent.size.width();
+    const double step = width + 6;
+    // The last one goes four steps to the right, so all come back by two.
+    for (int i = 0; i < 5; ++i)
+        QCOMPARE(labels.at(i).topLeft, QPointF(500 - width / 2 + (i - 2) * step, 761));
+    const QVector<QLineF> leaders = itemsOf<KvLineRunItem>(&chart).last()->lines();
+    QCOMPARE(leaders.size(), 5);
+    for (int i = 0; i < 5; ++i)
+        QCOMPARE(leaders.at(i), QLineF(500 + (i - 2) * step, 759, 500, 753));
+}
+
+void KvHorizontalBoxChartTest::boxesTakeTheMiddleOfTheirBands_data()
+{
+    QTest::addColumn<int>("count");
+    QTest::newRow("one") << 1;
+    QTest::newRow("three") << 3;
+    QTest::newRow("twelve") << 12;
+}
+
+void KvHorizontalBoxChartTest::boxesTakeTheMiddleOfTheirBands()
+{
+    QFETCH(int, count);
+    const KvChartThemes themes;
+    KvHorizontalBoxChart chart(&themes);
+    chart.beginUpdate();
+    for (int i = 0; i < count; ++i)
+        chart.addBox(QString::number(i), 0, 25, 50, 75, 100, Qt::red);
+    chart.endUpdate();
+    const double band = 1000.0 / count;
+    const auto rects = itemsOf<QGraphicsRectItem>(&chart);
+    QCOMPARE(rects.size(), count);
+    for (int i = 0; i < count; ++i) {
+        QVERIFY(qAbs(rects.at(i)->rect().top() - (i + 0.25) * band) < 1e-6);
+        QVERIFY(qAbs(rects.at(i)->rect().bottom() - (i + 0.75) * band) < 1e-6);
+        QCOMPARE(rects.at(i)->rect().left(), 250.0);
+        QCOMPARE(rects.at(i)->rect().right(), 750.0);
+    }
 }
 
 void KvHorizontalBoxChartTest::emptyRebuildKeepsTheAxes()
@@ -109,6 +169,12 @@ void KvHorizontalBoxChartTest::emptyRebuildKeepsTheAxes()
     QVERIFY(chart.parts().isEmpty());
     QCOMPARE(categoryAxis(chart)->categories(), QStringList{name("setosa")});
     QCOMPARE(valueAxis(chart)->maximum(), maximum);
+    // Nothing but the axes is left of the picture.
+    QVERIFY(itemsOf<QGraphicsRectItem>(&chart).isEmpty());
+    const auto runs = itemsOf<KvTextRunItem>(&chart);
+    QCOMPARE(runs.size(), 2);
+    QVERIFY(texts(runs.at(0)).contains(name("60")));
+    QCOMPARE(texts(runs.at(1)), QStringList{name("setosa")});
 }
 
 void KvHorizontalBoxChartTest::clears()

@@ -25,6 +25,9 @@ private slots:
     void colors_data();
     void colors();
     void wrapsRows();
+    void itemFont();
+    void looksLikeSingleItems_data();
+    void looksLikeSingleItems();
 };
 
 namespace {
@@ -177,6 +180,69 @@ void KvLegendTest::wrapsRows()
         QCOMPARE(markers.at(i)->rect().x(), (i % perRow) * (size.width() + 48));
         QCOMPARE(markers.at(i)->rect().y(), (i / perRow) * (size.height() + 10));
     }
+}
+
+void KvLegendTest::itemFont()
+{
+    const KvChartThemes themes;
+    QGraphicsScene scene;
+    KvLegend legend;
+    legend.addItem(text("two\nlines"), Qt::red); // an item of its own
+    legend.draw(&scene, &themes);
+    const QGraphicsTextItem *item = itemsOf<QGraphicsTextItem>(&scene).first();
+    QCOMPARE(item->font().family(), text("Segoe UI"));
+    QCOMPARE(item->font().pointSizeF(), 12.0);
+    QCOMPARE(item->font().weight(), 50);
+    QVERIFY(item->parentItem() == itemsOf<QGraphicsItemGroup>(&scene).first());
+}
+
+void KvLegendTest::looksLikeSingleItems_data()
+{
+    QTest::addColumn<QStringList>("names");
+    QTest::addColumn<QString>("title");
+    QTest::addColumn<int>("theme");
+    QStringList many;
+    for (int i = 0; i < 30; ++i)
+        many.append(QString::number(i * i * i));
+    const QString wide(120, QLatin1Char('w'));
+    for (const int theme : {0, 1}) {
+        QTest::addRow("title alone %d", theme)
+            << QStringList{} << text("Sepal length, petal length") << theme;
+        QTest::addRow("one row %d", theme)
+            << QStringList{text("setosa"), text("virginica")} << QString() << theme;
+        QTest::addRow("many rows %d", theme) << many << text("Sepal length") << theme;
+        QTest::addRow("wider than a row %d", theme)
+            << QStringList{text("setosa"), wide, text("virginica")} << wide << theme;
+        QTest::addRow("uneven heights %d", theme)
+            << QStringList{text("two\nlines"), QStringLiteral("\u6f22 \u03bc"), QString(), wide, text("last")}
+            << text("Title") << theme;
+    }
+}
+
+void KvLegendTest::looksLikeSingleItems()
+{
+    QFETCH(QStringList, names);
+    QFETCH(QString, title);
+    QFETCH(int, theme);
+    KvChartThemes themes;
+    themes.setTheme(static_cast<KvChartThemes::ThemeType>(theme));
+    KvLegend legend;
+    QVector<ItemByItem::LegendEntry> entries;
+    for (const QString &name : qAsConst(names)) {
+        entries.append({name, entries.size() % 2 == 0 ? Qt::red : Qt::cyan});
+        legend.addItem(name, entries.last().color);
+    }
+    legend.setTitle(title);
+    QGraphicsScene combined;
+    legend.draw(&combined, &themes);
+    QGraphicsScene single;
+    ItemByItem::addLegend(&single, entries, title, themes.colors().at(2));
+    QVERIFY(ItemByItem::sameRect(combined.itemsBoundingRect(), single.itemsBoundingRect()));
+    QCOMPARE(ItemByItem::placedTexts(&combined), ItemByItem::placedTexts(&single));
+    combined.setBackgroundBrush(themes.colors().at(0));
+    single.setBackgroundBrush(themes.colors().at(0));
+    const QRectF source(50, -500, 900, 900);
+    QVERIFY(ItemByItem::alike(ItemByItem::picture(&combined, source), ItemByItem::picture(&single, source)));
 }
 
 STATREPORT_TEST_MAIN(KvLegendTest)

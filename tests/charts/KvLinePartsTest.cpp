@@ -1,11 +1,13 @@
 // SPDX-License-Identifier: MIT
 #include "support/StatReportTest.h"
 
+#include "ItemByItem.h"
 #include "SceneItems.h"
 #include "charts/KvChartThemes.h"
 #include "charts/KvLineParts.h"
 #include "charts/KvLineSerie.h"
 #include "charts/KvLineSeriesItem.h"
+#include "data/KvStatisticsEngine.h"
 
 using namespace kvCharts;
 
@@ -22,7 +24,9 @@ private slots:
     void trend();
     void noTrend_data();
     void noTrend();
+    void noTrendAtOneX();
     void penStyles();
+    void looksLikeSingleItems();
 };
 
 namespace {
@@ -162,6 +166,26 @@ void KvLinePartsTest::noTrend()
     QVERIFY(itemsOf<QGraphicsLineItem>(&scene).isEmpty());
 }
 
+// Whatever the mean of many equal numbers rounds to: thirds and sevenths are no exact ones.
+void KvLinePartsTest::noTrendAtOneX()
+{
+    for (int categoryCount = 2; categoryCount <= 13; ++categoryCount) {
+        KvLineSerie serie(name("a"), Qt::red);
+        serie.setShowTrend(true);
+        for (int count = 1; count <= 30; ++count) {
+            serie.addPoint(name("0"), (count * 37) % 11 * 0.9);
+            QGraphicsScene scene;
+            draw(serie, categoryCount, &scene);
+            QVERIFY2(itemsOf<QGraphicsLineItem>(&scene).isEmpty(),
+                     qPrintable(QStringLiteral("%1 of %2").arg(count).arg(categoryCount)));
+        }
+        serie.addPoint(name("1"), 5.0);
+        QGraphicsScene scene;
+        draw(serie, categoryCount, &scene);
+        QCOMPARE(itemsOf<QGraphicsLineItem>(&scene).size(), 1);
+    }
+}
+
 void KvLinePartsTest::penStyles()
 {
     KvLineSerie serie(name("a"), Qt::red);
@@ -181,6 +205,41 @@ void KvLinePartsTest::penStyles()
         QCOMPARE(lines.at(i)->pen().widthF(), 1.0);
         QVERIFY(lines.at(i)->pen().isCosmetic());
     }
+}
+
+// Points, limits and a trend line that leaves the plot at the right: everything a series can show.
+void KvLinePartsTest::looksLikeSingleItems()
+{
+    const QColor color(255, 87, 34);
+    KvLineSerie serie(name("a"), color);
+    serie.setLimits(2.5, 7.75);
+    serie.setShowLimits(true);
+    serie.setShowTrend(true);
+    QGraphicsScene single;
+    QVector<QPointF> points;
+    for (int i = 0; i < 20; ++i) {
+        const double value = i < 3 ? 0.0 : 10.0 - 10.0 / i;
+        serie.addPoint(QString::number(i), value);
+        points.append(QPointF(i * 50 + 25, 1000 - value * 100));
+    }
+    ItemByItem::addSeries(&single, points, color);
+    QPen pen = ItemByItem::cosmeticPen(color);
+    pen.setDashPattern({1, 6});
+    single.addLine(0, 225, 1000, 225, pen);
+    single.addLine(0, 750, 1000, 750, pen);
+    const QPair<double, double> line = KvStatisticsEngine::regression(points);
+    const double right = line.first * 1050 + line.second;
+    QVERIFY(line.second - 50 * line.first < 1050 && right < -50);
+    pen.setDashPattern({6, 8});
+    single.addLine(QLineF(-50, line.second - 50 * line.first, (-50 - line.second) / line.first, -50), pen);
+    QGraphicsScene scene;
+    draw(serie, 20, &scene);
+    QVERIFY(ItemByItem::sameRect(scene.itemsBoundingRect(), single.itemsBoundingRect()));
+    const QRectF source(-100, -100, 1200, 1200);
+    const QImage picture = ItemByItem::picture(&scene, source);
+    QVERIFY(ItemByItem::inkedPixels(picture) > 1000);
+    // Lines are drawn under all markers instead of in turn: the same up to the rounding of two smooth edges.
+    QVERIFY(ItemByItem::difference(picture, ItemByItem::picture(&single, source)) <= 2);
 }
 
 STATREPORT_TEST_MAIN(KvLinePartsTest)

@@ -20,6 +20,7 @@ class KvLineSeriesItemTest : public StatReportTest
 private slots:
     void looksLikeSingleItems_data();
     void looksLikeSingleItems();
+    void thousandsLookLikeSingleItems();
     void markersStandAroundThePoint();
     void staysVectorsInPdf();
     void pdfDotsAreAsLargeAsEllipses();
@@ -79,6 +80,22 @@ void KvLineSeriesItemTest::looksLikeSingleItems()
     QVERIFY(ItemByItem::inkedPixels(picture) > 5);
     // Lines are drawn under all markers instead of in turn: the same up to the rounding of two smooth edges.
     QVERIFY(ItemByItem::difference(picture, ItemByItem::picture(&single, source)) <= 2);
+}
+
+void KvLineSeriesItemTest::thousandsLookLikeSingleItems()
+{
+    QGraphicsScene combined;
+    QGraphicsScene single;
+    const QVector<QPointF> points = zigzag(4000);
+    combined.addItem(makeItem(points, QColor(255, 87, 34)));
+    ItemByItem::addSeries(&single, points, QColor(255, 87, 34));
+    QVERIFY(ItemByItem::sameRect(combined.itemsBoundingRect(), single.itemsBoundingRect()));
+    const QRectF source(-50, -50, 1100, 1100);
+    const QImage picture = ItemByItem::picture(&combined, source);
+    QVERIFY(ItemByItem::inkedPixels(picture) > 5000);
+    // Markers stand at thirty-seconds of a pixel, which shows at their edges alone, and hardly.
+    const int difference = ItemByItem::difference(picture, ItemByItem::picture(&single, source));
+    QVERIFY2(difference <= 12, qPrintable(QString::number(difference)));
 }
 
 void KvLineSeriesItemTest::markersStandAroundThePoint()

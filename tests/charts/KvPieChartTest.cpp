@@ -1,11 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "support/StatReportTest.h"
 
+#include "SceneItems.h"
 #include "charts/KvChartThemes.h"
 #include "charts/KvLegend.h"
 #include "charts/KvPie.h"
 #include "charts/KvPieChart.h"
 #include "charts/KvSeriesPalette.h"
+
+#include <QGraphicsRectItem>
 
 using namespace kvCharts;
 
@@ -107,6 +110,10 @@ void KvPieChartTest::theSixteenthSlice()
     chart.endUpdate();
     QCOMPARE(pies(chart).at(15)->brush().color(), seriesColor(0));
     QVERIFY(!chart.legend()->items().at(15).color.isValid());
+    const auto markers = itemsOf<QGraphicsRectItem>(&chart);
+    QCOMPARE(markers.size(), 17);
+    QCOMPARE(markers.at(14)->brush().color(), seriesColor(14));
+    QCOMPARE(markers.at(15)->brush().color().rgb(), QColor(Qt::black).rgb());
     QCOMPARE(pies(chart).at(16)->brush().color(), seriesColor(16));
     chart.refresh();
     QCOMPARE(pies(chart).at(15)->brush().color(), seriesColor(0));

@@ -87,6 +87,11 @@ void KvValueAxisTest::autoRange()
     QCOMPARE(spy.count(), 2); // range, then ticks
     axis.autoRange(5.0, 5.0);
     QCOMPARE(spy.count(), 2);
+    axis.autoRange(3.0, 47.0);
+    const KvChartThemes themes;
+    QGraphicsScene scene;
+    axis.draw(&scene, &themes);
+    QCOMPARE(labelsOf(scene).join(QLatin1Char(' ')), QStringLiteral("0 5 10 15 20 25 30 35 40 45 50"));
 }
 
 void KvValueAxisTest::looksLikeSingleItems_data()
@@ -139,26 +144,33 @@ void KvValueAxisTest::looksLikeSingleItems()
     QVERIFY(ItemByItem::sameRect(combined.itemsBoundingRect(), single.itemsBoundingRect()));
     const QRectF source(-150, -50, 1250, 1250);
     QCOMPARE(ItemByItem::placedTexts(&combined), ItemByItem::placedTexts(&single));
+    QCOMPARE(ItemByItem::placedLines(&combined), ItemByItem::placedLines(&single));
     QVERIFY(ItemByItem::alike(ItemByItem::picture(&combined, source), ItemByItem::picture(&single, source)));
     QVERIFY(combined.items().size() <= 4);
 }
 
 void KvValueAxisTest::noTicks_data()
 {
+    QTest::addColumn<bool>("alongX");
     QTest::addColumn<int>("ticks");
-    QTest::newRow("none") << 0;
-    QTest::newRow("fewer") << -3;
+    QTest::newRow("x, none") << true << 0;
+    QTest::newRow("x, fewer") << true << -3;
+    QTest::newRow("y, none") << false << 0;
+    QTest::newRow("y, fewer") << false << -3;
 }
 
 void KvValueAxisTest::noTicks()
 {
+    QFETCH(bool, alongX);
     QFETCH(int, ticks);
     const KvChartThemes themes;
     QGraphicsScene scene;
-    KvAxisXValues axis;
-    axis.setTickCount(ticks);
-    axis.setGridVisible(true);
-    axis.draw(&scene, &themes);
+    KvAxisXValues x;
+    KvAxisYValues y;
+    KvBaseAxis *axis = alongX ? static_cast<KvBaseAxis *>(&x) : &y;
+    axis->setTickCount(ticks);
+    axis->setGridVisible(true);
+    axis->draw(&scene, &themes);
     QCOMPARE(scene.items().size(), 1);
     QCOMPARE(itemsOf<QGraphicsLineItem>(&scene).size(), 1);
 }
@@ -174,6 +186,13 @@ void KvValueAxisTest::labelTexts_data()
     QTest::newRow("nearly a million") << 999999.5 << 999999.5 << 1 << QStringLiteral("1e+06");
     QTest::newRow("six digits") << 0.123456789 << 1.0 << 1 << QStringLiteral("0.123457");
     QTest::newRow("negative zero") << -0.0 << 3.0 << 1 << QStringLiteral("0");
+    // Values are summed up, so that a zero tick shows the rounding error.
+    QTest::newRow("not quite zero") << -1.0 << 1.0 << 11
+                                    << QStringLiteral(
+                                           "-1 -0.8 -0.6 -0.4 -0.2 -5.55112e-17 0.2 0.4 0.6 0.8 1");
+    QTest::newRow("more than six digits") << 1234567.0 << 1234567.0 << 1 << QStringLiteral("1.23457e+06");
+    QTest::newRow("small") << 0.00001 << 1.0 << 1 << QStringLiteral("1e-05");
+    QTest::newRow("downwards") << 4.0 << 0.0 << 3 << QStringLiteral("4 2 0");
     QTest::newRow("the minimum alone") << 3.0 << 8.0 << 1 << QStringLiteral("3");
 }
 

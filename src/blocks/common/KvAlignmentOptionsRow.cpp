@@ -8,13 +8,16 @@
 #include <QPushButton>
 
 namespace {
-constexpr int kIconExtent = 24;
+constexpr int kButtonExtent = 24; // the icon's own room around its strokes is enough
 constexpr int kIconMode = 6;
+// Without the border of one pixel; the application's style sheet would hold the buttons open at 32.
+const char kButtonStyle[] = "QPushButton { min-width: 22px; min-height: 22px; }";
 } // namespace
 
 KvAlignmentOptionsRow::KvAlignmentOptionsRow(QWidget *parent)
     : QWidget(parent)
 {
+    setStyleSheet(QLatin1String(kButtonStyle));
     auto *row = new QHBoxLayout(this);
     row->setContentsMargins(0, 0, 0, 0);
     row->setSpacing(KvBaseOptionsWidget::ControlSpacing);
@@ -30,12 +33,13 @@ KvAlignmentOptionsRow::KvAlignmentOptionsRow(QWidget *parent)
 QPushButton *KvAlignmentOptionsRow::addButton(const QString &iconPath, const QString &text,
                                               const char *clickedSignal)
 {
+    const QSize size(kButtonExtent, kButtonExtent);
     auto *button = new QPushButton(this);
     button->setCheckable(true);
     button->setProperty("iconOnly", true);
-    button->setFixedSize(KvBaseOptionsWidget::IconButtonExtent, KvBaseOptionsWidget::IconButtonExtent);
-    button->setIconSize(QSize(kIconExtent, kIconExtent));
-    button->setIcon(acss::createIcon(kIconMode, iconPath, QSize(kIconExtent, kIconExtent)));
+    button->setFixedSize(size);
+    button->setIconSize(size);
+    button->setIcon(acss::createIcon(kIconMode, iconPath, size));
     button->setToolTip(text);
     button->setAccessibleName(text);
     layout()->addWidget(button);

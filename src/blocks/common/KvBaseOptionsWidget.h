@@ -11,10 +11,9 @@ class KvBaseOptionsWidget : public QFrame
 {
     Q_OBJECT
 public:
-    static constexpr int IconButtonExtent = 32; ///< of buttons that show an icon only
-    static constexpr int ControlSpacing = 8;    ///< between the controls of a row
-    static constexpr int LabelWidth = 24;       ///< of the signs before the fields of a row
-    static constexpr int FieldWidth = 88;       ///< of fields that hold a short number
+    static constexpr int ControlSpacing = 8; ///< between the controls of a row
+    static constexpr int LabelWidth = 24;    ///< of the signs before the fields of a row
+    static constexpr int FieldWidth = 88;    ///< of fields that hold a short number
 
     explicit KvBaseOptionsWidget(const QString &heading, QWidget *parent = nullptr);
 

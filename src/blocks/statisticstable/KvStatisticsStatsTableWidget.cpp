@@ -65,6 +65,7 @@ void KvStatisticsStatsTableWidget::slotUpdateTableContents()
         fillBodyByObject(columns);
     else
         fillBodyByMeasurement(columns);
+    fitColumnsToTexts(isByObject() ? 2 : 1);
     finishUpdate();
 }
 

@@ -13,6 +13,7 @@
 #include <QToolTip>
 
 #include <algorithm>
+#include <cmath>
 
 namespace {
 
@@ -82,18 +83,6 @@ void KvBaseTableItemDelegate::paint(QPainter *painter, const QStyleOptionViewIte
     painter->restore();
 }
 
-QVector<int> KvBaseTableItemDelegate::sharedEdges(int left, int width, int columns)
-{
-    QVector<int> edges;
-    if (columns <= 0)
-        return edges;
-    edges.reserve(columns + 1);
-    for (int column = 0; column < columns; ++column)
-        edges.append(left + column * (width / columns));
-    edges.append(left + width);
-    return edges;
-}
-
 void KvBaseTableItemDelegate::paintRows(QPainter *painter, const KvStatisticsBaseTableWidgetModel &model,
                                         const Geometry &geometry, int first, int last) const
 {
@@ -157,6 +146,14 @@ void KvBaseTableItemDelegate::paintTexts(QPainter *painter, const KvStatisticsBa
             column += columnSpan - 1;
         }
     }
+}
+
+int KvBaseTableItemDelegate::widthFor(const QString &text, const QFont &font, int width) const
+{
+    // The cell gives one pixel to the grid line.
+    const int around = 2 * kTextPadding + 1;
+    const qreal room = std::max(0, width - around);
+    return static_cast<int>(std::ceil(textFit(font).widthFor(text, room))) + around;
 }
 
 bool KvBaseTableItemDelegate::isShortened(const QString &text, const QFont &font, int cellWidth) const

@@ -41,9 +41,6 @@ public:
         QRect cellRect(int row, int column, int columnSpan) const; ///< without its grid lines
     };
 
-    /** Edges of \a columns columns that share a width; the last one takes what the division leaves. */
-    static QVector<int> sharedEdges(int left, int width, int columns);
-
     /**
      * Paints rows first..last of a model in layers: backgrounds, grid lines, texts. One change of colour and
      * font per layer instead of several per cell keeps PDF files small and printing quick. A header cell that
@@ -54,6 +51,10 @@ public:
 
     /** Whether \a text is shortened in a cell of \a cellWidth pixels. */
     bool isShortened(const QString &text, const QFont &font, int cellWidth) const;
+
+    /** \a width of a column, or as much more as it needs to show \a text whole; padding and grid line are
+     * part of it. */
+    int widthFor(const QString &text, const QFont &font, int width) const;
 
 protected:
     bool helpEvent(QHelpEvent *event, QAbstractItemView *view, const QStyleOptionViewItem &option,

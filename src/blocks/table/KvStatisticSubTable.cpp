@@ -178,7 +178,6 @@ void KvStatisticSubTable::paintEvent(QPaintEvent *event)
     KvBaseTableItemDelegate::Geometry geometry;
     geometry.top = table.top();
     geometry.rowHeight = m_rowHeight;
-    geometry.columnEdges =
-        KvBaseTableItemDelegate::sharedEdges(table.left(), table.width(), m_model->columnCount());
+    geometry.columnEdges = m_model->columnEdges(table.left(), table.width());
     m_delegate->paintRows(&painter, *m_model, geometry, 0, m_model->rowCount() - 1);
 }

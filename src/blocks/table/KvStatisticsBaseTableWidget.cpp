@@ -83,6 +83,7 @@ void KvStatisticsBaseTableWidget::startUpdate()
 {
     m_contents->header.clear();
     m_contents->body.clear();
+    m_contents->wantedWidths.clear();
 }
 
 void KvStatisticsBaseTableWidget::clear()
@@ -153,6 +154,27 @@ void KvStatisticsBaseTableWidget::connectOptions(QWidget *options)
 void KvStatisticsBaseTableWidget::reserve(int bodyRows, int columns)
 {
     m_contents->body.reserve(bodyRows, columns);
+}
+
+void KvStatisticsBaseTableWidget::fitColumnsToTexts(int yieldingColumns)
+{
+    m_contents->yieldingColumns = yieldingColumns;
+    m_contents->wantedWidths.fill(0, m_contents->columnCount());
+    widenColumns(m_contents->header, m_contents->headerFont);
+    widenColumns(m_contents->body, m_contents->bodyFont);
+}
+
+void KvStatisticsBaseTableWidget::widenColumns(const KvTableGrid &grid, const QFont &font)
+{
+    for (int row = 0; row < grid.rowCount(); ++row) {
+        for (int column = 0; column < grid.columnCount(); ++column) {
+            const KvTableCell *cell = grid.cell(row, column);
+            if (!cell || cell->columnSpan > 1)
+                continue;
+            int &wanted = m_contents->wantedWidths[column];
+            wanted = m_delegate->widthFor(cell->text, font, wanted);
+        }
+    }
 }
 
 KvTablePageSplit KvStatisticsBaseTableWidget::computeSplit() const

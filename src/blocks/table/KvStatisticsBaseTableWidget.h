@@ -14,6 +14,7 @@ class KvBaseTableItemDelegate;
 class KvStatisticSubTable;
 class KvStatisticsEngine;
 class KvStatisticsThemedNodeCfg;
+class KvTableGrid;
 class QFont;
 struct KvTableContents;
 
@@ -68,6 +69,13 @@ protected:
     void startUpdate();
     /** Makes room for a grid of known size. */
     void reserve(int bodyRows, int columns);
+    /**
+     * Lets columns with long texts take room from those with short ones; called between startUpdate() and
+     * finishUpdate() by tables of few rows. Otherwise all columns are equal. The first \a yieldingColumns
+     * give way where the width is too small: names can be cut, a number that is cut would be read as another
+     * one.
+     */
+    void fitColumnsToTexts(int yieldingColumns);
     /** Cuts the filled grid into pieces, refills them and tells the layout what changed. */
     void finishUpdate();
     /** Cuts the same grid anew after the page's content height changed. */
@@ -105,6 +113,7 @@ private slots:
     void slotSubTableDestroyed(QObject *aSubTable);
 
 private:
+    void widenColumns(const KvTableGrid &grid, const QFont &font);
     KvTablePageSplit computeSplit() const;
     void applySplit(const KvTablePageSplit &split);
     void dropSurplusSubTables();

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "blocks/table/KvStatisticsBaseTableWidgetModel.h"
 
+#include "blocks/table/KvColumnShares.h"
 #include "blocks/table/KvTableContents.h"
 
 KvStatisticsBaseTableWidgetModel::KvStatisticsBaseTableWidgetModel(QObject *parent)
@@ -83,4 +84,12 @@ const KvTableCell *KvStatisticsBaseTableWidgetModel::cell(int row, int column) c
 const QFont &KvStatisticsBaseTableWidgetModel::rowFont(int row) const
 {
     return row < m_headerRows ? m_contents->headerFont : m_contents->bodyFont;
+}
+
+QVector<int> KvStatisticsBaseTableWidgetModel::columnEdges(int left, int width) const
+{
+    KvColumnShares::Needs needs;
+    if (m_contents)
+        needs = {m_contents->wantedWidths, m_contents->yieldingColumns};
+    return KvColumnShares::edges(left, width, m_columns, needs);
 }

@@ -42,6 +42,8 @@ public:
     /** The cell at a position, or null; quicker than data() where many cells are drawn. */
     const KvTableCell *cell(int row, int column) const;
     const QFont &rowFont(int row) const;
+    /** Left edges of the columns, and the right end of the last one, in a table of \a width pixels. */
+    QVector<int> columnEdges(int left, int width) const;
 
 private:
     std::shared_ptr<const KvTableContents> m_contents;

@@ -43,13 +43,9 @@ KvStatisticsTableView::KvStatisticsTableView(KvStatisticsBaseTableWidgetModel *m
 
 void KvStatisticsTableView::shareWidth()
 {
-    const int columns = m_model->columnCount();
-    if (columns == 0)
-        return;
-    const int width = viewport()->width();
-    QHeaderView *header = horizontalHeader();
-    header->setDefaultSectionSize(width / columns);
-    header->resizeSection(columns - 1, width - (columns - 1) * (width / columns));
+    const QVector<int> edges = m_model->columnEdges(0, viewport()->width());
+    for (int column = 0; column + 1 < edges.size(); ++column)
+        horizontalHeader()->resizeSection(column, edges.at(column + 1) - edges.at(column));
 }
 
 KvBaseTableItemDelegate::Geometry KvStatisticsTableView::cellGeometry() const

@@ -21,7 +21,7 @@ public:
     KvStatisticsTableView(KvStatisticsBaseTableWidgetModel *model, KvBaseTableItemDelegate *delegate,
                           QWidget *parent = nullptr);
 
-    /** Divides the width among the columns; the last one takes what the division leaves. */
+    /** Divides the width among the columns as the model says. */
     void shareWidth();
 
 protected:

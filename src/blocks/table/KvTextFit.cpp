@@ -63,3 +63,11 @@ bool KvTextFit::surelyFits(const QString &text, qreal width) const
     }
     return true;
 }
+
+qreal KvTextFit::widthFor(const QString &text, qreal width) const
+{
+    if (surelyFits(text, width))
+        return width;
+    // Rounding may make the letters a trace wider than their sum.
+    return std::max(width, m_metrics.horizontalAdvance(singleLine(text.left(kLongestMeasured))) + 1);
+}

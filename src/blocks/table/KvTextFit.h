@@ -25,6 +25,9 @@ public:
     /** \a text, or what of it fits \a width with an ellipsis at its end. Line breaks become blanks. */
     QString fitted(const QString &text, qreal width) const;
 
+    /** \a width, or as much more as fitted() needs to leave \a text whole. */
+    qreal widthFor(const QString &text, qreal width) const;
+
 private:
     bool surelyFits(const QString &text, qreal width) const;
 

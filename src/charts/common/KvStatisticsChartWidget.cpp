@@ -125,11 +125,12 @@ void KvStatisticsChartWidget::changeWidth(int percent)
 
 void KvStatisticsChartWidget::changeAlignment(Qt::Alignment alignment)
 {
-    if (alignment == m_cfg->alignment())
-        return;
+    const bool isOther = alignment != m_cfg->alignment();
     m_cfg->setAlignment(alignment);
     place();
-    announceConfigChanged();
+    if (isOther)
+        announceConfigChanged();
+    // Also for the same alignment: whoever asks for it gets the page laid out.
     announceChanged();
 }
 
