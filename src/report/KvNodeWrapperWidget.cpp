@@ -34,9 +34,14 @@ void KvNodeWrapperWidget::applyStyle()
 
 KvNodeWrapperWidget::~KvNodeWrapperWidget()
 {
-    // The piece may have moved on into another frame, as it does while a report is printed.
-    if (m_piece && m_piece->parentWidget() == this)
-        m_piece->setParent(nullptr);
+    if (QWidget *piece = this->piece())
+        piece->setParent(nullptr);
+}
+
+QWidget *KvNodeWrapperWidget::piece() const
+{
+    // It moves on while a report is printed, and comes back with the next frame that is made for it.
+    return m_piece && m_piece->parentWidget() == this ? m_piece.data() : nullptr;
 }
 
 void KvNodeWrapperWidget::setMargin(int pixels)
@@ -51,8 +56,8 @@ void KvNodeWrapperWidget::fitToPiece()
 {
     ensurePolished();
     // The layout keeps the size that it was told last; not every piece tells it of another one.
-    if (m_piece)
-        m_piece->updateGeometry();
+    if (QWidget *piece = this->piece())
+        piece->updateGeometry();
     layout()->activate();
     // Not adjustSize(): it would cap the frame, a window of its own, at two thirds of the screen.
     const QSize wanted = sizeHint();

@@ -24,7 +24,8 @@ public:
     ~KvNodeWrapperWidget() override;
 
     KvReportNode *node() const { return m_node; }
-    QWidget *piece() const { return m_piece; }
+    /** Null once the piece died or moved on into another frame. */
+    QWidget *piece() const;
 
     void setMargin(int pixels);
     /** Takes the size that the piece asks for now. */

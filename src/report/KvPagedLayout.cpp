@@ -199,7 +199,8 @@ void KvPagedLayout::dropPagesFrom(int count)
 
 void KvPagedLayout::drop(QGraphicsItem *item)
 {
-    // Not off the scene: it would go on pointing to the first of its widgets after that died outside of it.
+    // Not off the scene: a widget that leaves it stays in its chain of Tab stops unless it is the first one
+    // there. It becomes the first when those before it die, and the scene does not hear of its death outside.
     item->setVisible(false);
     m_droppedItems.emplace_back(item);
 }

@@ -290,8 +290,7 @@ QTextEdit *KvReportPagedView::editorOf(const KvReportProxyWidgetItem *item) cons
     return qobject_cast<QTextEdit *>(widget);
 }
 
-// The scene's chain of Tab stops holds embedded widgets that rebuilds have deleted. And nothing on the pages
-// is to be reached by Tab: what is edited gets the keyboard when it is selected.
+// Nothing on the pages is to be reached by Tab: what is edited gets the keyboard when it is selected.
 
 bool KvReportPagedView::event(QEvent *event)
 {
@@ -626,8 +625,17 @@ void KvReportPagedView::drawBackground(QPainter *painter, const QRectF &rect)
 void KvReportPagedView::resizeEvent(QResizeEvent *event)
 {
     QGraphicsView::resizeEvent(event);
-    // A change of the application's style resizes widgets while Qt goes through a list of all that there are.
-    applyViewWidth(KvPagedLayout::OldItems::Dropped);
+    // A change of the application's style resizes widgets while Qt goes through a list of all that there are:
+    // none may be deleted now, as the delete button and the options panel are when the selection ends.
+    if (m_selectedItem || m_overlay)
+        QMetaObject::invokeMethod(this, "slotFollowViewWidth", Qt::QueuedConnection);
+    else
+        applyViewWidth(KvPagedLayout::OldItems::Dropped);
+}
+
+void KvReportPagedView::slotFollowViewWidth()
+{
+    applyViewWidth(KvPagedLayout::OldItems::DeletedNow);
 }
 
 void KvReportPagedView::showEvent(QShowEvent *event)

@@ -88,6 +88,7 @@ protected:
 
 private slots:
     void slotDeleteDroppedItems();
+    void slotFollowViewWidth();
     void slotModelDestroyed();
 
 private:

@@ -129,6 +129,8 @@ void KvNodeWrapperWidgetTest::keepsOffAPieceThatMovedOn()
     auto first = std::make_unique<KvNodeWrapperWidget>(node, piece);
     KvNodeWrapperWidget second(node, piece);
     QCOMPARE(piece->parentWidget(), &second);
+    QVERIFY(!first->piece());
+    QCOMPARE(second.piece(), piece.data());
     first->fitToPiece();
     first.reset();
     QVERIFY(piece);

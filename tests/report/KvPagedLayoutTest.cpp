@@ -6,9 +6,13 @@
 #include "support/FakeReport.h"
 #include "support/StatReportTest.h"
 
+#include <QApplication>
+#include <QGraphicsProxyWidget>
 #include <QGraphicsRectItem>
 #include <QGraphicsScene>
 #include <QPen>
+
+#include <functional>
 
 using namespace PagedViewTools;
 
@@ -68,6 +72,8 @@ const char kBigText[] = "<p style='font-size:40px'>Text</p>";
 
 } // namespace
 
+Q_DECLARE_METATYPE(std::function<void(LaidOutReport &)>)
+
 class KvPagedLayoutTest : public StatReportTest
 {
     Q_OBJECT
@@ -100,6 +106,8 @@ private slots:
     void keepsDroppedPagesUntilTheyAreDeleted();
     void aRebuildDeletesDroppedPages_data();
     void aRebuildDeletesDroppedPages();
+    void itemsNeverLeaveTheScene_data();
+    void itemsNeverLeaveTheScene();
 };
 
 void KvPagedLayoutTest::isEmptyAtFirst()
@@ -570,6 +578,49 @@ void KvPagedLayoutTest::aRebuildDeletesDroppedPages()
     else
         laidOut.rebuild();
     QVERIFY(!laidOut.layout().hasDroppedItems());
+}
+
+void KvPagedLayoutTest::itemsNeverLeaveTheScene_data()
+{
+    using Act = std::function<void(LaidOutReport &)>;
+    QTest::addColumn<std::function<void(LaidOutReport &)>>("act");
+    QTest::newRow("pieces shrink") << Act([](LaidOutReport &laidOut) {
+        FakeReport::fakeWidget(laidOut.model()->node(0))->piece(1)->setHeightHint(10);
+        laidOut.layout().updateSizes();
+    });
+    QTest::newRow("the mark goes") << Act([](LaidOutReport &laidOut) {
+        laidOut.layout().setDropIndex(0);
+        QCOMPARE(laidOut.layout().pages().size(), 3);
+        laidOut.layout().setDropIndex(-1);
+    });
+    QTest::newRow("rebuilt") << Act([](LaidOutReport &laidOut) {
+        laidOut.layout().rebuild(laidOut.model(), nullptr, KvPagedLayout::OldItems::Dropped);
+    });
+}
+
+void KvPagedLayoutTest::itemsNeverLeaveTheScene()
+{
+    // Those that live on somewhere else would be followed by the scene after their death.
+    QFETCH(std::function<void(LaidOutReport &)>, act);
+    LaidOutReport laidOut;
+    laidOut.model()->setHeaderEnabled(true);
+    laidOut.model()->setPageNumberingEnabled(true);
+    laidOut.report().addFake({1240, 1240});
+    laidOut.rebuild();
+    QCOMPARE(laidOut.layout().pages().size(), 2);
+    act(laidOut);
+    QVERIFY(laidOut.layout().hasDroppedItems());
+    int embedded = 0;
+    for (const QWidget *widget : QApplication::topLevelWidgets()) {
+        const QGraphicsProxyWidget *item = widget->graphicsProxyWidget();
+        embedded += item ? 1 : 0;
+        QVERIFY(!item || item->scene() == &laidOut.scene());
+    }
+    int shown = 0;
+    for (const QGraphicsItem *item : laidOut.scene().items())
+        shown += item->isWidget() && item->isVisible() ? 1 : 0;
+    QCOMPARE(shown, laidOut.layout().pieceItems().size() + 2 * laidOut.layout().pages().size());
+    QVERIFY(embedded > shown);
 }
 
 STATREPORT_TEST_MAIN(KvPagedLayoutTest)

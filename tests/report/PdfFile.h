@@ -3,6 +3,7 @@
 
 #include <QImage>
 #include <QProcess>
+#include <QRectF>
 #include <QRegularExpression>
 #include <QSizeF>
 #include <QStringList>
@@ -24,6 +25,13 @@ struct PdfFont
 {
     QString name;
     bool isEmbedded = false;
+};
+
+/** A word of a page. */
+struct PdfWord
+{
+    QString text;
+    QRectF rect; ///< in points from the page's top-left corner
 };
 
 /** Looks at a PDF file with the command-line tools of its readers. */
@@ -99,6 +107,27 @@ public:
                                 : QPointF(-1, -1);
     }
 
+    /** All words of a page with their places. */
+    QVector<PdfWord> wordsOf(int page) const
+    {
+        const QString number = QString::number(page + 1);
+        const QString text =
+            run(QStringLiteral("pdftotext"),
+                {QStringLiteral("-bbox"), QStringLiteral("-enc"), QStringLiteral("UTF-8"),
+                 QStringLiteral("-f"), number, QStringLiteral("-l"), number, m_path, QStringLiteral("-")});
+        const QRegularExpression line(QStringLiteral(
+            "xMin=\"([0-9.-]+)\" yMin=\"([0-9.-]+)\" xMax=\"([0-9.-]+)\" yMax=\"([0-9.-]+)\">([^<]*)<"));
+        QVector<PdfWord> words;
+        QRegularExpressionMatchIterator it = line.globalMatch(text);
+        while (it.hasNext()) {
+            const QRegularExpressionMatch match = it.next();
+            const auto at = [&match](int index) { return match.captured(index).toDouble(); };
+            words.append(
+                {unescaped(match.captured(5)), QRectF(QPointF(at(1), at(2)), QPointF(at(3), at(4)))});
+        }
+        return words;
+    }
+
     QVector<PdfFont> fonts() const
     {
         // Name, type, encoding, then "emb sub uni" and the object's number and generation.
@@ -152,6 +181,14 @@ private:
         if (!process.waitForFinished(kTimeout) || process.exitCode() != 0)
             return QString();
         return QString::fromUtf8(process.readAllStandardOutput());
+    }
+
+    static QString unescaped(QString text)
+    {
+        return text.replace(QLatin1String("&lt;"), QLatin1String("<"))
+            .replace(QLatin1String("&gt;"), QLatin1String(">"))
+            .replace(QLatin1String("&quot;"), QLatin1String("\""))
+            .replace(QLatin1String("&amp;"), QLatin1String("&"));
     }
 
     // The lines below the two of the table's head.
