@@ -6,6 +6,7 @@
 #include "data/KvStatisticsEngine.h"
 #include "report/KvReportNode.h"
 #include "report/KvReportPagedView.h"
+#include "templates/KvPageSectionsCfg.h"
 #include "templates/KvTemplateModel.h"
 
 #include <QCoreApplication>
@@ -15,9 +16,16 @@ namespace {
 constexpr int kPageWidth = 860;
 } // namespace
 
-LiveReport::LiveReport()
+LiveReport::LiveReport(Sections sections)
     : m_view(std::make_unique<KvReportPagedView>())
 {
+    if (sections == Sections::All) {
+        m_report.model().header()->setText(QStringLiteral("<p>Report of ${DATE}</p>"));
+        m_report.model().footer()->setText(QStringLiteral("<p>The laboratory</p>"));
+        m_report.model().setHeaderEnabled(true);
+        m_report.model().setFooterEnabled(true);
+        m_report.model().setPageNumberingEnabled(true);
+    }
     m_report.model().beginLiveUpdates();
     m_view->setModel(&m_report.model());
     m_view->resize(kPageWidth + 54, 900);
@@ -37,9 +45,21 @@ void LiveReport::refreshInPlace()
     static_cast<KvStatisticsMeasurementsTableWidget *>(display)->slotUpdateTableContents();
 }
 
+void LiveReport::measure()
+{
+    m_view->slotUpdateSceneWithSizes();
+}
+
 void LiveReport::reflow()
 {
     m_report.model().notifyListChanged();
+}
+
+void LiveReport::takeRecords()
+{
+    m_report.kernelData().slotDelayedMeasurementsUpdate();
+    // The table asks for other pages from the event loop.
+    QCoreApplication::processEvents();
 }
 
 int LiveReport::pageCount() const

@@ -7,13 +7,19 @@
 class LiveReport
 {
 public:
-    LiveReport();
+    enum class Sections { None, All };
+
+    explicit LiveReport(Sections sections = Sections::None);
     ~LiveReport();
 
     /** The table takes the records in again; sizes and pages stay. */
     void refreshInPlace();
-    /** All pages and frames are made anew. */
+    /** All pieces and sections are measured, as for each block that tells of another size. */
+    void measure();
+    /** Pages and frames are looked through for what changed, which is nothing. */
     void reflow();
+    /** Records, groups, table and pages follow what the host has now, up to the painting of the view. */
+    void takeRecords();
     int pageCount() const;
 
 private:

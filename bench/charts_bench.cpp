@@ -1,23 +1,18 @@
 // SPDX-License-Identifier: MIT
-#include "ChartCases.h"
+#include "BareChart.h"
+#include "ChartComparison.h"
+#include "ChartData.h"
+#include "OwnChart.h"
+#include "ProcessorTime.h"
 
 #include <benchmark/benchmark.h>
 
 #include <QApplication>
 
 #include <algorithm>
-#include <ctime>
+#include <cstring>
 
 namespace {
-
-/// Processor time, which other programs on the machine disturb less than the clock on the wall.
-template <class Work>
-double seconds(Work work)
-{
-    const std::clock_t start = std::clock();
-    work();
-    return static_cast<double>(std::clock() - start) / CLOCKS_PER_SEC;
-}
 
 /// Runs chart and floor in turn, so that both meet the same load of the machine; reports the best of each.
 template <class Chart, class Floor>
@@ -26,62 +21,70 @@ void compare(benchmark::State &state, Chart chart, Floor floor)
     double chartBest = 1e9;
     double floorBest = 1e9;
     for (auto _ : state) {
-        const double time = seconds(chart);
+        const double time = ProcessorTime::seconds(chart);
         state.SetIterationTime(time);
         chartBest = std::min(chartBest, time);
-        floorBest = std::min(floorBest, seconds(floor));
+        floorBest = std::min(floorBest, ProcessorTime::seconds(floor));
     }
     state.counters["floor_ms"] = floorBest * 1e3;
     state.counters["best_ms"] = chartBest * 1e3;
     state.counters["ratio"] = chartBest / floorBest;
 }
 
-int categoryCount(const benchmark::State &state)
+ChartData dataFor(const benchmark::State &state)
 {
     const int points = static_cast<int>(state.range(0));
-    return state.range(1) != 0 ? static_cast<int>(state.range(1)) : points / 3;
+    const int categories = static_cast<int>(state.range(1));
+    return ChartData(points, categories != 0 ? categories : points / ChartData::SeriesCount);
 }
 
 void rebuildAndPaint(benchmark::State &state)
 {
-    TrendChartCase chart(static_cast<int>(state.range(0)), categoryCount(state));
+    const ChartData data = dataFor(state);
+    OwnChart chart(data);
+    BareChart floor(data);
     compare(
         state,
         [&] {
             chart.rebuild();
-            benchmark::DoNotOptimize(chart.paintChart());
+            benchmark::DoNotOptimize(chart.picture());
         },
-        [&] { benchmark::DoNotOptimize(chart.paintFloor()); });
+        [&] { benchmark::DoNotOptimize(floor.picture()); });
 }
 
 void fillAndPaint(benchmark::State &state)
 {
-    TrendChartCase chart(static_cast<int>(state.range(0)), categoryCount(state));
+    const ChartData data = dataFor(state);
+    OwnChart chart(data);
+    BareChart floor(data);
     compare(
         state,
         [&] {
             chart.fill();
-            benchmark::DoNotOptimize(chart.paintChart());
+            benchmark::DoNotOptimize(chart.picture());
         },
-        [&] { benchmark::DoNotOptimize(chart.paintFloor()); });
+        [&] { benchmark::DoNotOptimize(floor.picture()); });
 }
 
 void print(benchmark::State &state)
 {
-    TrendChartCase chart(static_cast<int>(state.range(0)), categoryCount(state));
+    const ChartData data = dataFor(state);
+    OwnChart chart(data);
+    BareChart floor(data);
     compare(
         state,
         [&] {
             chart.rebuild();
-            benchmark::DoNotOptimize(chart.printChart());
+            benchmark::DoNotOptimize(chart.pdf());
         },
-        [&] { benchmark::DoNotOptimize(chart.printFloor()); });
-    state.counters["size_ratio"] = double(chart.printChart().size()) / double(chart.printFloor().size());
+        [&] { benchmark::DoNotOptimize(floor.pdf()); });
+    state.counters["size_ratio"] = double(chart.pdf().size()) / double(floor.pdf().size());
 }
 
 void fill(benchmark::State &state)
 {
-    TrendChartCase chart(static_cast<int>(state.range(0)), categoryCount(state));
+    const ChartData data = dataFor(state);
+    OwnChart chart(data);
     for (auto _ : state)
         chart.fill();
     state.SetComplexityN(state.range(0));
@@ -107,6 +110,31 @@ BENCHMARK(fill)
     ->Unit(benchmark::kMillisecond)
     ->Complexity();
 
+/// Takes "--pictures DIR" out of the arguments, as the benchmark library knows only its own.
+QString takePictureDir(int &argc, char **argv)
+{
+    QString dir;
+    int kept = 1;
+    for (int i = 1; i < argc; ++i) {
+        if (std::strcmp(argv[i], "--pictures") == 0 && i + 1 < argc)
+            dir = QString::fromLocal8Bit(argv[++i]);
+        else
+            argv[kept++] = argv[i];
+    }
+    argc = kept;
+    return dir;
+}
+
+void compareWithPeers(const QString &pictureDir)
+{
+    const ChartComparison comparison(pictureDir);
+    for (const int points : {1000, 10000, 100000})
+        comparison.comparePictures(points, 50);
+    for (const int points : {1000, 10000})
+        comparison.comparePictures(points, points / ChartData::SeriesCount);
+    comparison.comparePdf(10000, 50);
+}
+
 } // namespace
 
 int main(int argc, char **argv)
@@ -115,9 +143,11 @@ int main(int argc, char **argv)
     QCoreApplication::setAttribute(Qt::AA_Use96Dpi);
     QApplication app(argc, argv);
     QFont::insertSubstitutions(QStringLiteral("Segoe UI"), {QStringLiteral("Open Sans")});
+    const QString pictureDir = takePictureDir(argc, argv);
     benchmark::Initialize(&argc, argv);
     if (benchmark::ReportUnrecognizedArguments(argc, argv))
         return 2;
     benchmark::RunSpecifiedBenchmarks();
+    compareWithPeers(pictureDir);
     return 0;
 }

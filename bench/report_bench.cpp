@@ -110,13 +110,50 @@ void liveRefresh(benchmark::State &state)
         report.refreshInPlace();
 }
 
+LiveReport::Sections sections(const benchmark::State &state)
+{
+    return state.range(1) ? LiveReport::Sections::All : LiveReport::Sections::None;
+}
+
+void liveMeasure(benchmark::State &state)
+{
+    fillSyntheticHost(rows(state));
+    LiveReport report(sections(state));
+    state.counters["pages"] = report.pageCount();
+    for (auto _ : state)
+        report.measure();
+}
+
 void liveReflow(benchmark::State &state)
 {
     fillSyntheticHost(rows(state));
-    LiveReport report;
+    LiveReport report(sections(state));
     state.counters["pages"] = report.pageCount();
     for (auto _ : state)
         report.reflow();
+}
+
+// A page more and a page less, by turns: what one more record costs now and then.
+void livePageChange(benchmark::State &state)
+{
+    constexpr int kMoreThanAPage = 40;
+    fillSyntheticHost(rows(state));
+    LiveReport report(sections(state));
+    int more = 0;
+    for (auto _ : state) {
+        state.PauseTiming();
+        more = kMoreThanAPage - more;
+        fillSyntheticHost(rows(state) + more);
+        state.ResumeTiming();
+        report.takeRecords();
+    }
+    state.counters["pages"] = report.pageCount();
+}
+
+// Records, and whether there are header, footer and page numbers.
+void liveArguments(benchmark::internal::Benchmark *live)
+{
+    live->ArgsProduct({{1000, 10000}, {0, 1}})->Unit(benchmark::kMillisecond);
 }
 
 BENCHMARK(hostCalls)->Arg(1000)->Arg(10000)->Arg(100000)->Unit(benchmark::kMillisecond);
@@ -126,7 +163,9 @@ BENCHMARK(regroup)->Arg(1000)->Arg(10000)->Arg(100000)->Unit(benchmark::kMillise
 BENCHMARK(pdfFloor)->Arg(100)->Arg(1000)->Arg(10000)->Unit(benchmark::kMillisecond);
 BENCHMARK(pdfReport)->Arg(100)->Arg(1000)->Arg(10000)->Unit(benchmark::kMillisecond);
 BENCHMARK(liveRefresh)->Arg(1000)->Arg(10000)->Unit(benchmark::kMillisecond);
-BENCHMARK(liveReflow)->Arg(1000)->Arg(10000)->Unit(benchmark::kMillisecond);
+BENCHMARK(liveMeasure)->Apply(liveArguments);
+BENCHMARK(liveReflow)->Apply(liveArguments);
+BENCHMARK(livePageChange)->Apply(liveArguments);
 
 /** Keeps the times of all runs, so that they can be set against each other at the end. */
 class RatioReporter : public benchmark::ConsoleReporter

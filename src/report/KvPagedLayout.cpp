@@ -13,6 +13,7 @@
 #include <QGraphicsRectItem>
 #include <QGraphicsScene>
 #include <QPen>
+#include <QSet>
 
 #include <algorithm>
 #include <utility>
@@ -30,6 +31,14 @@ constexpr qreal kMarkAlpha = 0.3;
 QRectF rectOf(const KvReportProxyWidgetItem *item)
 {
     return QRectF(item->scenePos(), item->size());
+}
+
+/** Lets items cover each other in their order, which new ones among older ones would not do by themselves. */
+template <typename List>
+void stackInOrder(const List &items)
+{
+    for (int i = items.size() - 1; i > 0; --i)
+        items.at(i - 1)->stackBefore(items.at(i));
 }
 
 } // namespace
@@ -57,19 +66,13 @@ void KvPagedLayout::clear()
 
 void KvPagedLayout::rebuild(KvTemplateModel *model, const KvReportNode *leftOut, OldItems fate)
 {
-    // The old items go last: pieces then move straight from their old frame into the new one. Every change of
-    // parent makes Qt polish the style sheets of all widgets in a piece, which takes most of the time of a
-    // rebuild.
-    QList<QGraphicsItem *> oldItems = m_scene->items();
-    const auto isOtherwiseDeleted = [this](const QGraphicsItem *item) {
-        return item->parentItem() || isDropped(item);
-    };
-    oldItems.erase(std::remove_if(oldItems.begin(), oldItems.end(), isOtherwiseDeleted), oldItems.end());
     m_model = model;
     const QVector<KvReportPage *> oldPages = std::exchange(m_pages, {});
+    const QList<KvReportProxyWidgetItem *> oldItems = std::exchange(m_pieceItems, {});
+    if (fate == OldItems::DeletedNow)
+        offerAgain(oldPages, oldItems);
     m_nodes.clear();
-    m_pieceItems.clear();
-    m_mark = nullptr;
+    delete std::exchange(m_mark, nullptr);
     // Blocks that split themselves have to know a page's content before they are asked for their pieces.
     addPage();
     for (KvReportNode *node : m_model->nodes()) {
@@ -77,15 +80,40 @@ void KvPagedLayout::rebuild(KvTemplateModel *model, const KvReportNode *leftOut,
             addItemsOf(node);
     }
     place(Measuring::Nothing);
-    if (fate == OldItems::DeletedNow) {
-        qDeleteAll(oldItems);
+    stackInOrder(m_pages);
+    stackInOrder(m_pieceItems);
+    m_oldPages.clear();
+    m_oldItems.clear();
+    // The old items go last: pieces then move straight from their old frame into the new one.
+    removeSurplus(oldPages, m_pages, fate);
+    removeSurplus(oldItems, m_pieceItems, fate);
+    if (fate == OldItems::DeletedNow)
         m_droppedItems.clear();
-        return;
+}
+
+void KvPagedLayout::offerAgain(const QVector<KvReportPage *> &pages,
+                               const QList<KvReportProxyWidgetItem *> &items)
+{
+    // Every change of parent makes Qt polish the style sheets of all widgets in a piece. In a report of
+    // hundreds of pages, of which one more record changes the last, that would be most of a rebuild.
+    m_oldPages = pages;
+    for (KvReportProxyWidgetItem *item : items) {
+        const QWidget *piece = item->piece();
+        // The scene may give the focus back to an item that had it, though nothing is selected any more.
+        if (piece && !item->hadFocus())
+            m_oldItems.insert(piece, item);
     }
-    for (KvReportPage *page : oldPages)
-        page->detachSections();
-    for (QGraphicsItem *item : qAsConst(oldItems))
-        drop(item);
+}
+
+KvReportProxyWidgetItem *KvPagedLayout::takeOldItem(const KvReportNode *node, const QWidget *piece)
+{
+    KvReportProxyWidgetItem *item = m_oldItems.take(piece);
+    // The piece may be another one since, at the address of one that died.
+    if (!item || item->node() != node || item->piece() != piece ||
+        item->displayWidget() != item->node()->displayWidget())
+        return nullptr;
+    item->adjustToPiece();
+    return item;
 }
 
 void KvPagedLayout::addItemsOf(KvReportNode *node)
@@ -95,8 +123,11 @@ void KvPagedLayout::addItemsOf(KvReportNode *node)
     KvBaseDisplayWidget *displayWidget = node->displayWidget();
     const int pieces = displayWidget ? displayWidget->subWidgetCount() : 0;
     for (int i = 0; i < pieces; ++i) {
-        if (KvReportProxyWidgetItem *item = KvReportProxyWidgetItem::createForPiece(node, i))
-            m_pieceItems.append(item);
+        QWidget *piece = displayWidget->subWidgetAt(i);
+        if (!piece)
+            continue;
+        KvReportProxyWidgetItem *item = takeOldItem(node, piece);
+        m_pieceItems.append(item ? item : KvReportProxyWidgetItem::createForPiece(node, *piece));
     }
 }
 
@@ -117,8 +148,19 @@ void KvPagedLayout::connectNode(KvReportNode *node)
 
 KvReportPage *KvPagedLayout::addPage()
 {
-    auto *page = new KvReportPage(m_model, m_pages.size(), false);
+    const int index = m_pages.size();
+    KvReportPage *page = m_oldPages.value(index);
+    if (page && page->isLikeNew(m_model))
+        page->refreshSections();
+    else
+        page = makePage(index);
     m_pages.append(page);
+    return page;
+}
+
+KvReportPage *KvPagedLayout::makePage(int index)
+{
+    auto *page = new KvReportPage(m_model, index, false);
     m_scene->addItem(page);
     for (KvPageSectionWidget *section : {page->headerWidget(), page->footerWidget()}) {
         if (!section)
@@ -191,10 +233,28 @@ void KvPagedLayout::showMarkAt(const QPoint &topLeft)
 
 void KvPagedLayout::dropPagesFrom(int count)
 {
-    while (m_pages.size() > count) {
-        m_pages.last()->detachSections();
+    while (m_pages.size() > count)
         drop(m_pages.takeLast());
+}
+
+template <typename List>
+void KvPagedLayout::removeSurplus(const List &old, const List &kept, OldItems fate)
+{
+    const QSet<QGraphicsItem *> keptItems(kept.begin(), kept.end());
+    for (auto *item : old) {
+        if (keptItems.contains(item))
+            continue;
+        if (fate == OldItems::DeletedNow)
+            delete item;
+        else
+            drop(item);
     }
+}
+
+void KvPagedLayout::drop(KvReportPage *page)
+{
+    page->detachSections();
+    drop(static_cast<QGraphicsItem *>(page));
 }
 
 void KvPagedLayout::drop(QGraphicsItem *item)
@@ -203,13 +263,6 @@ void KvPagedLayout::drop(QGraphicsItem *item)
     // there. It becomes the first when those before it die, and the scene does not hear of its death outside.
     item->setVisible(false);
     m_droppedItems.emplace_back(item);
-}
-
-bool KvPagedLayout::isDropped(const QGraphicsItem *item) const
-{
-    return std::any_of(
-        m_droppedItems.begin(), m_droppedItems.end(),
-        [item](const std::unique_ptr<QGraphicsItem> &dropped) { return dropped.get() == item; });
 }
 
 void KvPagedLayout::deleteDroppedItems()

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QHash>
 #include <QList>
 #include <QPointer>
 #include <QRectF>
@@ -16,6 +17,7 @@ class KvTemplateModel;
 class QGraphicsItem;
 class QGraphicsRectItem;
 class QGraphicsScene;
+class QWidget;
 
 /**
  * The pages of the paged view and the blocks' pieces on them: makes the scene's items, flows them, finds what
@@ -39,8 +41,9 @@ public:
     enum class OldItems { DeletedNow, Dropped };
 
     /**
-     * Makes pages and items anew for all blocks of \a model but \a leftOut, which may be null. The old ones
-     * are deleted now, or dropped: that is for callers inside of events that Qt sends to a list of widgets.
+     * Makes pages and items for all blocks of \a model but \a leftOut, which may be null. The old ones are
+     * deleted now, but those that new ones would only repeat: they stay. Or all of them are dropped: that is
+     * for callers inside of events that Qt sends to a list of widgets.
      */
     void rebuild(KvTemplateModel *model, const KvReportNode *leftOut,
                  OldItems oldItems = OldItems::DeletedNow);
@@ -86,12 +89,17 @@ private:
 
     void connectNode(KvReportNode *node);
     void addItemsOf(KvReportNode *node);
+    void offerAgain(const QVector<KvReportPage *> &pages, const QList<KvReportProxyWidgetItem *> &items);
+    KvReportProxyWidgetItem *takeOldItem(const KvReportNode *node, const QWidget *piece);
+    KvReportPage *makePage(int index);
     void place(Measuring measuring);
     KvReportPage *addPage();
     QRect contentRectOf(int page);
     void dropPagesFrom(int count);
     void drop(QGraphicsItem *item);
-    bool isDropped(const QGraphicsItem *item) const;
+    void drop(KvReportPage *page);
+    template <typename List>
+    void removeSurplus(const List &old, const List &kept, OldItems fate);
     void showMarkAt(const QPoint &topLeft);
     void finish();
 
@@ -102,6 +110,9 @@ private:
     std::vector<std::unique_ptr<QGraphicsItem>> m_droppedItems; ///< in the scene, hidden
     QVector<const KvReportNode *> m_nodes; ///< the blocks shown, in order, also those without pieces
     QList<KvReportProxyWidgetItem *> m_pieceItems;
+    // What a rebuild may take again; empty at all other times.
+    QVector<KvReportPage *> m_oldPages;
+    QHash<const QWidget *, KvReportProxyWidgetItem *> m_oldItems; ///< by their pieces
     QGraphicsRectItem *m_mark = nullptr; ///< in the scene while there is a drop index that is met
     int m_dropIndex = -1;
 };

@@ -5,6 +5,7 @@
 #include "report/KvHeaderWidget.h"
 #include "report/KvPageCountWidget.h"
 #include "report/KvReportProxyWidgetItem.h"
+#include "templates/KvPageSectionsCfg.h"
 #include "templates/KvTemplateModel.h"
 
 #include <QPen>
@@ -28,6 +29,13 @@ QPen separatorPen()
     QPen pen(QColor(QStringLiteral("#00659D")), 1.0, Qt::CustomDashLine, Qt::SquareCap, Qt::BevelJoin);
     pen.setDashPattern({5, 2});
     return pen;
+}
+
+/** Whether the widget of a section is there and the user cannot have done anything to it. */
+bool isUntouched(const KvReportProxyWidgetItem &item)
+{
+    const auto *text = qobject_cast<const KvPageSectionWidget *>(item.widget());
+    return item.displayWidget() && !item.hadFocus() && !(text && text->isEditing());
 }
 
 } // namespace
@@ -120,6 +128,7 @@ QGraphicsLineItem *KvReportPage::addSeparator()
 void KvReportPage::addHeader()
 {
     m_headerWidget = m_model->createHeaderWidget();
+    m_header = m_model->header();
     m_headerItem = addSection(m_headerWidget);
     if (!m_printMode)
         m_headerLine = addSeparator();
@@ -129,6 +138,7 @@ void KvReportPage::addHeader()
 void KvReportPage::addFooter()
 {
     m_footerWidget = m_model->createFooterWidget();
+    m_footer = m_model->footer();
     m_footerItem = addSection(m_footerWidget);
     if (!m_printMode)
         m_footerLine = addSeparator();
@@ -170,6 +180,42 @@ void KvReportPage::placePageNumber()
     const QSizeF size = m_pageCountItem->size();
     m_pageCountItem->setPos(m_pageRect.right() - (size.width() + kPageNumberRight),
                             m_pageRect.bottom() - (size.height() + kPageNumberBottom));
+}
+
+bool KvReportPage::showsHeaderOf(const KvTemplateModel &model) const
+{
+    if (!m_headerItem)
+        return !model.isHeaderEnabled();
+    return model.isHeaderEnabled() && m_header == model.header() && isUntouched(*m_headerItem);
+}
+
+bool KvReportPage::showsFooterOf(const KvTemplateModel &model) const
+{
+    if (!m_footerItem)
+        return !model.isFooterEnabled();
+    return model.isFooterEnabled() && m_footer == model.footer() && isUntouched(*m_footerItem);
+}
+
+bool KvReportPage::showsNumberOf(const KvTemplateModel &model) const
+{
+    if (!m_pageCountItem)
+        return !model.isPageNumberingEnabled();
+    return model.isPageNumberingEnabled() && isUntouched(*m_pageCountItem);
+}
+
+bool KvReportPage::isLikeNew(const KvTemplateModel *model) const
+{
+    return model == m_model && m_pageRect == pageRectOf(*model, m_index, m_printMode) &&
+           showsHeaderOf(*model) && showsFooterOf(*model) && showsNumberOf(*model);
+}
+
+void KvReportPage::refreshSections()
+{
+    for (KvPageSectionWidget *widget : {headerWidget(), footerWidget()}) {
+        if (widget)
+            widget->slotTemplateModified();
+    }
+    updateSections();
 }
 
 void KvReportPage::updateSections()

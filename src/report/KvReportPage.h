@@ -7,6 +7,7 @@
 
 class KvPageCountWidget;
 class KvPageSectionWidget;
+class KvPageSectionsCfg;
 class KvReportProxyWidgetItem;
 class KvTemplateModel;
 
@@ -35,6 +36,13 @@ public:
     /** The header, footer or page number under a point of the scene, or null. */
     KvReportProxyWidgetItem *sectionItemAt(const QPointF &point) const;
 
+    /**
+     * Whether a page made now, for the same place in the pages of \a model, would have the same size and
+     * sections. Sections in which the user may have typed do not count as the same.
+     */
+    bool isLikeNew(const KvTemplateModel *model) const;
+    /** Shows the sections' present texts, and updates the sections. */
+    void refreshSections();
     /** Measures and places header and footer anew, and recomputes the content rectangle. */
     void updateSections();
     void setPageTotal(int total);
@@ -47,6 +55,9 @@ public:
 private:
     static QRect pageRectOf(const KvTemplateModel &model, int index, bool printMode);
 
+    bool showsHeaderOf(const KvTemplateModel &model) const;
+    bool showsFooterOf(const KvTemplateModel &model) const;
+    bool showsNumberOf(const KvTemplateModel &model) const;
     void addSheet();
     void addHeader();
     void addFooter();
@@ -65,9 +76,11 @@ private:
     QRect m_contentRect;
     KvReportProxyWidgetItem *m_headerItem = nullptr;
     KvPageSectionWidget *m_headerWidget = nullptr;
+    QPointer<const KvPageSectionsCfg> m_header; ///< what the header widget shows
     QGraphicsLineItem *m_headerLine = nullptr;
     KvReportProxyWidgetItem *m_footerItem = nullptr;
     KvPageSectionWidget *m_footerWidget = nullptr;
+    QPointer<const KvPageSectionsCfg> m_footer; ///< what the footer widget shows
     QGraphicsLineItem *m_footerLine = nullptr;
     QRect m_headerRect;
     QRect m_footerRect;

@@ -2,7 +2,6 @@
 #include "report/KvReportPagedView.h"
 
 #include "report/KvBaseDisplayWidget.h"
-#include "report/KvNodeWrapperWidget.h"
 #include "report/KvReportDragData.h"
 #include "report/KvReportNode.h"
 #include "report/KvReportPage.h"
@@ -199,7 +198,7 @@ void KvReportPagedView::select(KvReportProxyWidgetItem *item)
     m_selectedItem = item;
     m_overlay = new KvSelectionOverlay(item, this);
     m_scene->addItem(m_overlay);
-    item->setFocus(Qt::OtherFocusReason);
+    item->takeFocus();
     setFocus(Qt::OtherFocusReason);
     emit signalSelectionChanged(item->displayWidget());
     if (QTextEdit *editor = m_selectedItem ? editorOf(m_selectedItem) : nullptr)
@@ -278,16 +277,13 @@ void KvReportPagedView::slotDeleteButtonClicked()
 void KvReportPagedView::slotFocusBackToPageView()
 {
     if (m_selectedItem)
-        m_selectedItem->setFocus(Qt::OtherFocusReason);
+        m_selectedItem->takeFocus();
     setFocus(Qt::OtherFocusReason);
 }
 
 QTextEdit *KvReportPagedView::editorOf(const KvReportProxyWidgetItem *item) const
 {
-    QWidget *widget = item->widget();
-    if (const auto *wrapper = qobject_cast<KvNodeWrapperWidget *>(widget))
-        widget = wrapper->piece();
-    return qobject_cast<QTextEdit *>(widget);
+    return qobject_cast<QTextEdit *>(item->belongsToBlock() ? item->piece() : item->widget());
 }
 
 // Nothing on the pages is to be reached by Tab: what is edited gets the keyboard when it is selected.

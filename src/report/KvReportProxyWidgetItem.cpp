@@ -20,16 +20,25 @@ KvReportProxyWidgetItem *KvReportProxyWidgetItem::createForPiece(KvReportNode *n
 {
     KvBaseDisplayWidget *displayWidget = node->displayWidget();
     QWidget *piece = displayWidget ? displayWidget->subWidgetAt(index) : nullptr;
-    if (!piece)
-        return nullptr;
-    auto *wrapper = new KvNodeWrapperWidget(node, piece);
+    return piece ? createForPiece(node, *piece) : nullptr;
+}
+
+KvReportProxyWidgetItem *KvReportProxyWidgetItem::createForPiece(KvReportNode *node, QWidget &piece)
+{
+    auto *wrapper = new KvNodeWrapperWidget(node, &piece);
     wrapper->setMargin(node->context()->marginPixels());
     wrapper->fitToPiece();
     auto *item = new KvReportProxyWidgetItem;
     item->setNode(node);
-    item->setDisplayWidget(displayWidget);
+    item->setDisplayWidget(node->displayWidget());
     item->setWidget(wrapper);
     return item;
+}
+
+QWidget *KvReportProxyWidgetItem::piece() const
+{
+    const auto *wrapper = qobject_cast<const KvNodeWrapperWidget *>(widget());
+    return wrapper ? wrapper->piece() : nullptr;
 }
 
 void KvReportProxyWidgetItem::setDisplayWidget(KvBaseDisplayWidget *displayWidget)
@@ -45,6 +54,19 @@ void KvReportProxyWidgetItem::setDisplayWidget(KvBaseDisplayWidget *displayWidge
 void KvReportProxyWidgetItem::slotDisplayWidgetDestroyed()
 {
     m_displayWidget = nullptr;
+}
+
+void KvReportProxyWidgetItem::takeFocus()
+{
+    // In a window that is not active no event tells of it.
+    m_hadFocus = true;
+    setFocus(Qt::OtherFocusReason);
+}
+
+void KvReportProxyWidgetItem::focusInEvent(QFocusEvent *event)
+{
+    m_hadFocus = true;
+    QGraphicsProxyWidget::focusInEvent(event);
 }
 
 void KvReportProxyWidgetItem::adjustToPiece()

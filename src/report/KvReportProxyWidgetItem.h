@@ -18,6 +18,8 @@ public:
      * size; null when the block has no such piece. The caller owns the item; the piece stays the block's.
      */
     static KvReportProxyWidgetItem *createForPiece(KvReportNode *node, int index);
+    /** As above, for a piece that was asked for already. */
+    static KvReportProxyWidgetItem *createForPiece(KvReportNode *node, QWidget &piece);
 
     /** The block whose piece is shown; null for page sections. */
     KvReportNode *node() const { return m_node; }
@@ -28,10 +30,21 @@ public:
     KvBaseDisplayWidget *displayWidget() const { return m_displayWidget; }
     void setDisplayWidget(KvBaseDisplayWidget *displayWidget);
 
+    /** The piece in this item's frame; null for page sections, and once it died or moved on. */
+    QWidget *piece() const;
+
+    /** Takes the scene's focus, or will as soon as the scene's window is activated. */
+    void takeFocus();
+    /** Whether it ever had the focus. The scene may remember such an item and give the focus back to it. */
+    bool hadFocus() const { return m_hadFocus; }
+
     /** Fits a block's item to the present size of its piece and of the page's margins. */
     void adjustToPiece();
     /** Height for the page flow, in whole pixels. */
     int pieceHeight() const;
+
+protected:
+    void focusInEvent(QFocusEvent *event) override;
 
 private slots:
     void slotDisplayWidgetDestroyed();
@@ -39,4 +52,5 @@ private slots:
 private:
     KvReportNode *m_node = nullptr;
     KvBaseDisplayWidget *m_displayWidget = nullptr;
+    bool m_hadFocus = false;
 };

@@ -91,6 +91,7 @@ private slots:
     void deactivatingTheToolAsks_data();
     void deactivatingTheToolAsks();
     void tellsWhatFailed();
+    void exportsFromThePanel_data();
     void exportsFromThePanel();
     void keepsTheRecentTemplates();
     void themeAndLanguageChangeWhileAllIsOpen();
@@ -454,23 +455,39 @@ void DeskReportTest::tellsWhatFailed()
     QCOMPARE(boxes.boxes().at(2).icon, QMessageBox::Critical);
 }
 
+void DeskReportTest::exportsFromThePanel_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QStringList>("texts"); // one of each block at least
+    const QStringList ofEveryBlock{QStringLiteral("Statistical report"), QStringLiteral("Holes"),
+                                   QStringLiteral("Circle/Area(mm²)"),   QStringLiteral("Rectangle/Width("),
+                                   QStringLiteral("Measurement Type"),   QStringLiteral("Circle 15")};
+    QTest::newRow("demo") << QStringLiteral("demo.rtp") << QStringList{QStringLiteral("Circle 15")};
+    QTest::newRow("every block") << QStringLiteral("every-block.rtp") << ofEveryBlock;
+    QTest::newRow("every block, dark") << QStringLiteral("every-block-dark.rtp") << ofEveryBlock;
+}
+
 void DeskReportTest::exportsFromThePanel()
 {
+    QFETCH(QString, name);
+    QFETCH(QStringList, texts);
     ZtStatusLog::getInstance()->clear();
     m_user.click(m_desk->button("theExportButton"));
     QTRY_VERIFY(!ZtStatusLog::getInstance()->entries().isEmpty());
     QCOMPARE(ZtStatusLog::getInstance()->entries().last().message,
              QStringLiteral("No report template selected."));
 
-    const QString pdf = temporaryPath(QStringLiteral("panel.pdf"));
-    const QString chosen = sourcePath(QStringLiteral("examples/templates/demo.rtp"));
+    const QString pdf = temporaryPath(QFileInfo(name).completeBaseName() + QStringLiteral(".pdf"));
+    const QString chosen = sourcePath(QStringLiteral("examples/templates/") + name);
     const FileDialogAnswerer dialogs({chosen, pdf});
     m_user.click(m_desk->button("theBrowseButton"));
-    QTRY_COMPARE(m_desk->templates()->currentText(), QStringLiteral("demo.rtp"));
+    QTRY_COMPARE(m_desk->templates()->currentText(), name);
     m_user.click(m_desk->button("theExportButton"));
     QTRY_COMPARE(dialogs.dialogs().size(), 2);
     QTRY_VERIFY(PdfFile(pdf).isSound());
-    QVERIFY(PdfFile(pdf).pageTexts().join(QLatin1Char('\n')).contains(QStringLiteral("Circle 15")));
+    const QString printed = PdfFile(pdf).pageTexts().join(QLatin1Char('\n'));
+    for (const QString &text : qAsConst(texts))
+        QVERIFY2(printed.contains(text), qPrintable(text));
     QVERIFY(!m_desk->editor()->isVisible());
 }
 

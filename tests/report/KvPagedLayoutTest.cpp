@@ -13,6 +13,7 @@
 #include <QPen>
 
 #include <functional>
+#include <memory>
 
 using namespace PagedViewTools;
 
@@ -108,6 +109,17 @@ private slots:
     void aRebuildDeletesDroppedPages();
     void itemsNeverLeaveTheScene_data();
     void itemsNeverLeaveTheScene();
+    void keepsWhatStays();
+    void keepsFramesOfAnotherWidth();
+    void stacksPiecesInOrder_data();
+    void stacksPiecesInOrder();
+    void makesAnewWhatChanged_data();
+    void makesAnewWhatChanged();
+    void makesAllAnewWhereItDropsThem();
+    void keptHeadersShowTheTextOfNow();
+    void keptPagesAreMeasured();
+    void makesPagesAnewForOtherSections_data();
+    void makesPagesAnewForOtherSections();
 };
 
 void KvPagedLayoutTest::isEmptyAtFirst()
@@ -621,6 +633,237 @@ void KvPagedLayoutTest::itemsNeverLeaveTheScene()
         shown += item->isWidget() && item->isVisible() ? 1 : 0;
     QCOMPARE(shown, laidOut.layout().pieceItems().size() + 2 * laidOut.layout().pages().size());
     QVERIFY(embedded > shown);
+}
+
+void KvPagedLayoutTest::keepsWhatStays()
+{
+    LaidOutReport laidOut;
+    laidOut.model()->setHeaderEnabled(true);
+    laidOut.model()->setFooterEnabled(true);
+    laidOut.model()->setPageNumberingEnabled(true);
+    KvReportNode *node = laidOut.report().addFake({1200, 1200});
+    laidOut.report().addFake({50});
+    laidOut.rebuild();
+    const QList<KvReportProxyWidgetItem *> items = laidOut.layout().pieceItems();
+    const QVector<KvReportPage *> pages = laidOut.layout().pages();
+    QWidget *frame = items.first()->widget();
+
+    FakeReport::fakeCfg(node)->setHeights({1200, 1200, 1200});
+    laidOut.rebuild();
+    QCOMPARE(laidOut.layout().pieceItems().size(), 4);
+    QCOMPARE(laidOut.layout().pieceItems().mid(0, 2), items.mid(0, 2));
+    QCOMPARE(laidOut.layout().pieceItems().last(), items.last());
+    QCOMPARE(items.first()->widget(), frame);
+    QCOMPARE(laidOut.layout().pages().size(), 3);
+    QCOMPARE(laidOut.layout().pages().mid(0, 2), pages);
+    QCOMPARE(items.last()->pos(),
+             QPointF(laidOut.layout().pages().last()->contentRect().topLeft()) + QPointF(0, 1201));
+
+    FakeReport::fakeCfg(node)->setHeights({1100});
+    laidOut.rebuild();
+    QCOMPARE(laidOut.layout().pieceItems(), QList<KvReportProxyWidgetItem *>({items.first(), items.last()}));
+    QCOMPARE(items.first()->pieceHeight(), 1100);
+    QCOMPARE(laidOut.layout().pages(), pages.mid(0, 1));
+    // The rest is gone at once: sheet, three sections and two lines of the page, and the two pieces.
+    QVERIFY(!laidOut.layout().hasDroppedItems());
+    QCOMPARE(laidOut.scene().items().size(), 1 + 6 + 2);
+}
+
+void KvPagedLayoutTest::keepsFramesOfAnotherWidth()
+{
+    LaidOutReport laidOut;
+    KvReportNode *node = laidOut.report().addFake({100});
+    laidOut.report().addText(QStringLiteral("word ").repeated(100));
+    laidOut.rebuild();
+    const QList<KvReportProxyWidgetItem *> items = laidOut.layout().pieceItems();
+    const int height = items.last()->pieceHeight();
+    laidOut.model()->setPageWidth(600);
+    laidOut.rebuild();
+    QCOMPARE(laidOut.layout().pieceItems(), items);
+    QCOMPARE(laidOut.layout().pages().first()->pageRect(), QRect(20, 20, 600, 848));
+    for (const KvReportProxyWidgetItem *item : items) {
+        QCOMPARE(item->size().width(), 600.0);
+        QCOMPARE(item->widget()->width(), 600);
+    }
+    const int margin = laidOut.model()->context()->marginPixels();
+    QCOMPARE(FakeReport::fakeWidget(node)->piece(0)->geometry(), QRect(margin, 0, 600 - 2 * margin, 100));
+    QVERIFY(items.last()->pieceHeight() > height);
+}
+
+void KvPagedLayoutTest::stacksPiecesInOrder_data()
+{
+    using Act = std::function<void(LaidOutReport &)>;
+    QTest::addColumn<std::function<void(LaidOutReport &)>>("act");
+    QTest::newRow("more pieces") << Act([](LaidOutReport &laidOut) {
+        FakeReport::fakeCfg(laidOut.model()->node(0))->setHeights({3000, 10, 10, 10});
+    });
+    QTest::newRow("a new block in between")
+        << Act([](LaidOutReport &laidOut) { laidOut.model()->createNode(QStringLiteral("Fake"), 1); });
+    QTest::newRow("first to the end") << Act([](LaidOutReport &laidOut) { laidOut.model()->moveNode(0, 2); });
+    QTest::newRow("last to the front")
+        << Act([](LaidOutReport &laidOut) { laidOut.model()->moveNode(2, 0); });
+    QTest::newRow("another widget") << Act(
+        [](LaidOutReport &laidOut) { laidOut.model()->node(0)->resetDisplayWidget(); });
+}
+
+void KvPagedLayoutTest::stacksPiecesInOrder()
+{
+    // What stands on a page covers what overflows the one before.
+    QFETCH(std::function<void(LaidOutReport &)>, act);
+    LaidOutReport laidOut;
+    laidOut.report().addFake({3000, 20});
+    laidOut.report().addFake({50, 3000});
+    laidOut.report().addFake({7});
+    laidOut.rebuild();
+    act(laidOut);
+    laidOut.rebuild();
+    QList<KvReportProxyWidgetItem *> stacked;
+    for (QGraphicsItem *item : laidOut.scene().items(Qt::AscendingOrder)) {
+        if (auto *proxy = dynamic_cast<KvReportProxyWidgetItem *>(item))
+            stacked.append(proxy);
+    }
+    QCOMPARE(stacked, laidOut.layout().pieceItems());
+    QVector<KvReportNode *> nodes;
+    for (const KvReportProxyWidgetItem *item : qAsConst(stacked)) {
+        if (nodes.isEmpty() || nodes.last() != item->node())
+            nodes.append(item->node());
+    }
+    QCOMPARE(nodes, laidOut.model()->nodes());
+}
+
+void KvPagedLayoutTest::makesAnewWhatChanged_data()
+{
+    using Act = std::function<void(LaidOutReport &)>;
+    QTest::addColumn<std::function<void(LaidOutReport &)>>("act");
+    QTest::newRow("another widget") << Act(
+        [](LaidOutReport &laidOut) { laidOut.model()->node(0)->resetDisplayWidget(); });
+    QTest::newRow("the piece moved on") << Act([](LaidOutReport &laidOut) {
+        FakeReport::fakeWidget(laidOut.model()->node(0))->piece(0)->setParent(nullptr);
+    });
+    QTest::newRow("the piece died") << Act(
+        [](LaidOutReport &laidOut) { delete FakeReport::fakeWidget(laidOut.model()->node(0))->piece(0); });
+    QTest::newRow("had the focus") << Act(
+        [](LaidOutReport &laidOut) { laidOut.layout().pieceItems().first()->takeFocus(); });
+}
+
+void KvPagedLayoutTest::makesAnewWhatChanged()
+{
+    QFETCH(std::function<void(LaidOutReport &)>, act);
+    LaidOutReport laidOut;
+    KvReportNode *node = laidOut.report().addFake({100});
+    laidOut.report().addFake({50});
+    laidOut.rebuild();
+    const QPointer<KvReportProxyWidgetItem> first = laidOut.layout().pieceItems().first();
+    KvReportProxyWidgetItem *second = laidOut.layout().pieceItems().last();
+    act(laidOut);
+    laidOut.rebuild();
+    QVERIFY(!first);
+    QCOMPARE(laidOut.layout().pieceItems().size(), 2);
+    QCOMPARE(laidOut.layout().pieceItems().last(), second);
+    const KvReportProxyWidgetItem *item = laidOut.layout().pieceItems().first();
+    QCOMPARE(item->node(), node);
+    QCOMPARE(item->displayWidget(), node->displayWidget());
+    QCOMPARE(pieceOf(item), FakeReport::fakeWidget(node)->piece(0));
+    QCOMPARE(item->piece()->parentWidget(), item->widget());
+    QCOMPARE(laidOut.places(), QVector<QPoint>({at(0, 0), at(0, 101)}));
+}
+
+void KvPagedLayoutTest::makesAllAnewWhereItDropsThem()
+{
+    // Pieces that get a new parent are polished at once: measured in the midst of a change of style, they
+    // have the new one.
+    LaidOutReport laidOut;
+    laidOut.report().addFake({100});
+    laidOut.rebuild();
+    const QPointer<KvReportProxyWidgetItem> item = laidOut.layout().pieceItems().first();
+    const KvReportPage *page = laidOut.layout().pages().first();
+    laidOut.layout().rebuild(laidOut.model(), nullptr, KvPagedLayout::OldItems::Dropped);
+    QVERIFY(laidOut.layout().pieceItems().first() != item);
+    QVERIFY(laidOut.layout().pages().first() != page);
+    QVERIFY(item);
+    QVERIFY(!item->isVisible());
+    laidOut.layout().deleteDroppedItems();
+    QVERIFY(!item);
+}
+
+void KvPagedLayoutTest::keptHeadersShowTheTextOfNow()
+{
+    LaidOutReport laidOut;
+    laidOut.model()->header()->setText(QStringLiteral("before"));
+    laidOut.model()->setHeaderEnabled(true);
+    laidOut.report().addFake({100});
+    laidOut.rebuild();
+    const KvReportPage *page = laidOut.layout().pages().first();
+    const int height = page->headerWidget()->height();
+    laidOut.model()->header()->setText(QLatin1String(kBigText));
+    laidOut.rebuild();
+    QCOMPARE(laidOut.layout().pages().first(), page);
+    QCOMPARE(page->headerWidget()->toPlainText(), QStringLiteral("Text"));
+    QVERIFY(page->headerWidget()->height() > height);
+    QCOMPARE(laidOut.places().first(), page->contentRect().topLeft());
+    QCOMPARE(page->contentRect().top(), contentTop(0) + page->headerWidget()->height());
+    // The rebuild has measured it: nothing is left to announce.
+    laidOut.listener().taken();
+    QCoreApplication::processEvents();
+    QCOMPARE(laidOut.listener().taken(), QStringList());
+}
+
+void KvPagedLayoutTest::keptPagesAreMeasured()
+{
+    LaidOutReport laidOut;
+    laidOut.rebuild();
+    KvTemplateContext *context = laidOut.model()->context();
+    const int height = context->contentHeight();
+    // As another view or a printed page leaves it.
+    context->setContentHeight(100);
+    const KvReportPage *page = laidOut.layout().pages().first();
+    laidOut.rebuild();
+    QCOMPARE(laidOut.layout().pages().first(), page);
+    QCOMPARE(context->contentHeight(), height);
+}
+
+void KvPagedLayoutTest::makesPagesAnewForOtherSections_data()
+{
+    using Act = std::function<void(LaidOutReport &)>;
+    QTest::addColumn<std::function<void(LaidOutReport &)>>("act");
+    QTest::newRow("header goes") << Act([](LaidOutReport &r) { r.model()->setHeaderEnabled(false); });
+    QTest::newRow("footer goes") << Act([](LaidOutReport &r) { r.model()->setFooterEnabled(false); });
+    QTest::newRow("number comes") << Act([](LaidOutReport &r) { r.model()->setPageNumberingEnabled(true); });
+    QTest::newRow("width") << Act([](LaidOutReport &r) { r.model()->setPageWidth(600); });
+    QTest::newRow("new template") << Act([](LaidOutReport &r) {
+        r.model()->newTemplate();
+        r.model()->setHeaderEnabled(true);
+        r.model()->setFooterEnabled(true);
+    });
+    QTest::newRow("header had the focus") << Act([](LaidOutReport &r) {
+        const QRect page = r.layout().pages().first()->pageRect();
+        r.layout().itemAt(page.topLeft() + QPoint(100, 25))->takeFocus();
+    });
+    QTest::newRow("header is edited") << Act([panel = std::make_shared<QWidget>()](LaidOutReport &r) {
+        r.layout().pages().first()->headerWidget()->createOptionsWidget(panel.get(), true);
+    });
+}
+
+void KvPagedLayoutTest::makesPagesAnewForOtherSections()
+{
+    QFETCH(std::function<void(LaidOutReport &)>, act);
+    LaidOutReport laidOut;
+    laidOut.model()->header()->setText(QLatin1String(kBigText));
+    laidOut.model()->setHeaderEnabled(true);
+    laidOut.model()->setFooterEnabled(true);
+    laidOut.rebuild();
+    const QPointer<KvPageSectionWidget> header = laidOut.layout().pages().first()->headerWidget();
+    laidOut.rebuild();
+    QCOMPARE(laidOut.layout().pages().first()->headerWidget(), header.data());
+    act(laidOut);
+    laidOut.rebuild();
+    QVERIFY(!header);
+    QCOMPARE(laidOut.layout().pages().size(), 1);
+    const KvReportPage *page = laidOut.layout().pages().first();
+    QCOMPARE(page->headerWidget() != nullptr, laidOut.model()->isHeaderEnabled());
+    QCOMPARE(page->footerWidget() != nullptr, laidOut.model()->isFooterEnabled());
+    QCOMPARE(page->pageRect().width(), laidOut.model()->pageWidth());
+    QVERIFY(!page->headerWidget() || !page->headerWidget()->isEditing());
 }
 
 STATREPORT_TEST_MAIN(KvPagedLayoutTest)

@@ -193,6 +193,7 @@ private slots:
     void anotherStyleDeletesNothingAtOnce_data();
     void anotherStyleDeletesNothingAtOnce();
     void rebuildsUnderAPressedButton();
+    void aRebuildEndsTheFocusOfAnInactiveWindow();
     void aPressThatIsNeverReleased();
     void survivesTheModelWhileSelected_data();
     void survivesTheModelWhileSelected();
@@ -1109,6 +1110,30 @@ void KvReportPagedViewInteractionTest::anotherStyleDeletesNothingAtOnce()
     QVERIFY(!shown.view().selectedItem());
     QVERIFY(!shown.options().panel());
     QVERIFY(showsAllPieces(shown.view()));
+}
+
+void KvReportPagedViewInteractionTest::aRebuildEndsTheFocusOfAnInactiveWindow()
+{
+    ShownReport shown;
+    shown.report().addText(QStringLiteral("hello world"));
+    shown.show();
+    shown.click(shown.item(0));
+    QCOMPARE(shown.view().scene()->focusItem(), shown.item(0));
+    QWidget other;
+    other.show();
+    other.activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(&other));
+    // As when records come in while the user measures in the main window.
+    shown.model()->notifyListChanged();
+    QVERIFY(!shown.view().selectedItem());
+    shown.view().activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(&shown.view()));
+    shown.view().setFocus(Qt::OtherFocusReason);
+    deliverQueuedCalls();
+    // What is not selected gets no keys.
+    QVERIFY(!shown.view().scene()->focusItem());
+    QTest::keyClicks(shown.view().viewport(), QStringLiteral("x"));
+    QCOMPARE(textOf(shown.model()->node(0))->toPlainText(), QStringLiteral("hello world"));
 }
 
 void KvReportPagedViewInteractionTest::rebuildsUnderAPressedButton()
