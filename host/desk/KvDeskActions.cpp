@@ -30,12 +30,68 @@ constexpr Definition definitions[] = {
      QT_TRANSLATE_NOOP("KvDeskActions", "Open session"), "open-session", "Ctrl+Shift+O", false},
     {KvDeskActions::ImportTable, QT_TRANSLATE_NOOP("KvDeskActions", "Import &table..."),
      QT_TRANSLATE_NOOP("KvDeskActions", "Import table of measured values"), "import-table", "Ctrl+I", false},
+    {KvDeskActions::ExportTable, QT_TRANSLATE_NOOP("KvDeskActions", "&Export measured values..."),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Export measured values as a table"), "export-table", "Ctrl+E", false},
     {KvDeskActions::SaveSession, QT_TRANSLATE_NOOP("KvDeskActions", "&Save session"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Save session"), "save-session", "Ctrl+S", false},
     {KvDeskActions::SaveSessionAs, QT_TRANSLATE_NOOP("KvDeskActions", "Save session &as..."),
      QT_TRANSLATE_NOOP("KvDeskActions", "Save session to another file"), nullptr, "Ctrl+Shift+S", false},
     {KvDeskActions::Quit, QT_TRANSLATE_NOOP("KvDeskActions", "&Quit"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Quit the program"), nullptr, "Ctrl+Q", false},
+    {KvDeskActions::Undo, QT_TRANSLATE_NOOP("KvDeskActions", "&Undo"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Undo the last step"), "undo", "Ctrl+Z", false},
+    {KvDeskActions::Redo, QT_TRANSLATE_NOOP("KvDeskActions", "&Redo"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Redo what was undone"), "redo", "Ctrl+Shift+Z; Ctrl+Y", false},
+    {KvDeskActions::Cut, QT_TRANSLATE_NOOP("KvDeskActions", "Cu&t"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Cut the selected objects"), "cut", "Ctrl+X", false},
+    {KvDeskActions::Copy, QT_TRANSLATE_NOOP("KvDeskActions", "&Copy"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Copy the selected objects"), "copy", "Ctrl+C", false},
+    {KvDeskActions::Paste, QT_TRANSLATE_NOOP("KvDeskActions", "&Paste"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Paste copied objects"), "paste", "Ctrl+V", false},
+    {KvDeskActions::Delete, QT_TRANSLATE_NOOP("KvDeskActions", "&Delete"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Delete the selected objects"), "delete", "Del", false},
+    {KvDeskActions::SelectAll, QT_TRANSLATE_NOOP("KvDeskActions", "Select &all"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Select all objects on the image"), nullptr, "Ctrl+A", false},
+    {KvDeskActions::Rename, QT_TRANSLATE_NOOP("KvDeskActions", "Re&name"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Give the selected object a name"), "rename", "F2", false},
+    {KvDeskActions::FilterValues, QT_TRANSLATE_NOOP("KvDeskActions", "&Find measured values"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Filter the measured values"), nullptr, "Ctrl+F", false},
+    {KvDeskActions::SelectTool, QT_TRANSLATE_NOOP("KvDeskActions", "&Select"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Select and change objects"), "tool-select", "V", true},
+    {KvDeskActions::LineTool, QT_TRANSLATE_NOOP("KvDeskActions", "&Line"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Measure a length"), "tool-line", "L", true},
+    {KvDeskActions::PolylineTool, QT_TRANSLATE_NOOP("KvDeskActions", "&Polyline"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Measure the length of a way"), "tool-polyline", "P", true},
+    {KvDeskActions::ParallelTool, QT_TRANSLATE_NOOP("KvDeskActions", "Parallel &distance"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Measure the distance of a point from a line"), "tool-parallel", "D",
+     true},
+    {KvDeskActions::ArcTool, QT_TRANSLATE_NOOP("KvDeskActions", "&Arc"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Measure an arc through three points"), "tool-arc", "A", true},
+    {KvDeskActions::CircleTool, QT_TRANSLATE_NOOP("KvDeskActions", "&Circle"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Measure a circle"), "tool-circle", "C", true},
+    {KvDeskActions::RectangleTool, QT_TRANSLATE_NOOP("KvDeskActions", "&Rectangle"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Measure a rectangle"), "tool-rectangle", "R", true},
+    {KvDeskActions::PolygonTool, QT_TRANSLATE_NOOP("KvDeskActions", "Poly&gon"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Measure the area of a polygon"), "tool-polygon", "G", true},
+    {KvDeskActions::CounterTool, QT_TRANSLATE_NOOP("KvDeskActions", "Cou&nter"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Count by clicks"), "tool-counter", "N", true},
+    {KvDeskActions::NoteTool, QT_TRANSLATE_NOOP("KvDeskActions", "&Text note"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Write on the image"), "tool-note", "T", true},
+    {KvDeskActions::ScaleBarTool, QT_TRANSLATE_NOOP("KvDeskActions", "Scale &bar"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Draw a scale bar"), "tool-scale-bar", "B", true},
+    {KvDeskActions::Calibrate, QT_TRANSLATE_NOOP("KvDeskActions", "Cali&bration..."),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Say how large a pixel of the image is"), "calibration", "Ctrl+K",
+     false},
+    {KvDeskActions::UseFilePixelSize, QT_TRANSLATE_NOOP("KvDeskActions", "Use the file's pixel size"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Measure with the pixel size that the image's file states"), nullptr,
+     nullptr, false},
+    {KvDeskActions::TakeSnapshot, QT_TRANSLATE_NOOP("KvDeskActions", "&Take snapshot"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Save the image to the gallery"), "snapshot", "F9", false},
+    {KvDeskActions::SnapshotMeasurements,
+     QT_TRANSLATE_NOOP("KvDeskActions", "Snapshots with &measurements"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Draw the measured objects on snapshots"), nullptr, "Shift+F9", true},
+    {KvDeskActions::Freeze, QT_TRANSLATE_NOOP("KvDeskActions", "&Freeze"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Freeze the live image"), "freeze", "F12", true},
     {KvDeskActions::ZoomIn, QT_TRANSLATE_NOOP("KvDeskActions", "Zoom &in"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Zoom in"), "zoom-in", "Ctrl++; Ctrl+=", false},
     {KvDeskActions::ZoomOut, QT_TRANSLATE_NOOP("KvDeskActions", "Zoom &out"),
@@ -44,10 +100,19 @@ constexpr Definition definitions[] = {
      QT_TRANSLATE_NOOP("KvDeskActions", "Show the whole image"), "zoom-fit", "Ctrl+0", false},
     {KvDeskActions::ZoomActual, QT_TRANSLATE_NOOP("KvDeskActions", "&Actual size"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Show the image at 100 %"), "zoom-100", "Ctrl+1", false},
+    {KvDeskActions::ShowLabels, QT_TRANSLATE_NOOP("KvDeskActions", "&Labels on the image"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Show or hide the labels of objects"), "labels", "F4", true},
+    {KvDeskActions::ShowRulers, QT_TRANSLATE_NOOP("KvDeskActions", "Pixel &rulers"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Show or hide the rulers"), "rulers", "Shift+F4", true},
+    {KvDeskActions::ShowScaleBar, QT_TRANSLATE_NOOP("KvDeskActions", "&Scale bar on the image"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Show or hide the scale bar, on reports, too"), "scale-bar",
+     "Shift+B", true},
     {KvDeskActions::ShowValues, QT_TRANSLATE_NOOP("KvDeskActions", "&Measured values"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Show or hide the measured values"), "table", "F6", true},
     {KvDeskActions::ShowLog, QT_TRANSLATE_NOOP("KvDeskActions", "Status &log"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Show or hide the status log"), "log", "F7", true},
+    {KvDeskActions::ShowGallery, QT_TRANSLATE_NOOP("KvDeskActions", "&Gallery"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Show or hide the gallery"), "gallery", "F5", true},
     {KvDeskActions::ToggleTheme, QT_TRANSLATE_NOOP("KvDeskActions", "&Dark or light theme"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Change between the dark and the light theme"), "theme", "F8", false},
     {KvDeskActions::Settings, QT_TRANSLATE_NOOP("KvDeskActions", "S&ettings..."),
@@ -86,4 +151,19 @@ KvDeskActions::KvDeskActions(QObject *parent)
     action(Quit)->setMenuRole(QAction::QuitRole);
     action(Settings)->setMenuRole(QAction::PreferencesRole);
     action(About)->setMenuRole(QAction::AboutRole);
+}
+
+QString KvDeskActions::toolTip(Id id) const
+{
+    for (const Definition &definition : definitions) {
+        if (definition.id == id)
+            return ::toolTip(definition, *action(id));
+    }
+    return QString();
+}
+
+void KvDeskActions::setPossible(Id id, bool isPossible, const QString &reason)
+{
+    action(id)->setEnabled(isPossible);
+    action(id)->setToolTip(isPossible ? toolTip(id) : toolTip(id) + QLatin1Char('\n') + reason);
 }

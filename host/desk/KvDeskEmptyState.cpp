@@ -17,11 +17,11 @@ constexpr int pageMargin = 24;
 
 KvDeskEmptyState::KvDeskEmptyState(const QString &text, QWidget *parent)
     : QWidget(parent)
+    , m_label(new QLabel(text, this))
 {
-    auto *const label = new QLabel(text, this);
-    label->setProperty("emptyState", true);
-    label->setAlignment(Qt::AlignCenter);
-    label->setWordWrap(true);
+    m_label->setProperty("emptyState", true);
+    m_label->setAlignment(Qt::AlignCenter);
+    m_label->setWordWrap(true);
 
     m_buttons = new QHBoxLayout;
     m_buttons->setSpacing(8);
@@ -32,12 +32,22 @@ KvDeskEmptyState::KvDeskEmptyState(const QString &text, QWidget *parent)
     layout->setContentsMargins(pageMargin, pageMargin, pageMargin, pageMargin);
     layout->setSpacing(groupSpacing);
     layout->addStretch();
-    layout->addWidget(label);
+    layout->addWidget(m_label);
     layout->addLayout(m_buttons);
     layout->addStretch();
 
     setGeometry(parent->rect());
     parent->installEventFilter(this);
+}
+
+void KvDeskEmptyState::setText(const QString &text)
+{
+    m_label->setText(text);
+}
+
+QString KvDeskEmptyState::text() const
+{
+    return m_label->text();
 }
 
 void KvDeskEmptyState::addAction(QAction *action, bool isPrimary)

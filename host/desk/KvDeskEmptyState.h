@@ -5,6 +5,7 @@
 
 class QAction;
 class QHBoxLayout;
+class QLabel;
 
 /** What a view shows while it has nothing to show: what to do next, and buttons that do it. Covers its
  * parent. */
@@ -14,6 +15,8 @@ class KvDeskEmptyState : public QWidget
 public:
     KvDeskEmptyState(const QString &text, QWidget *parent);
 
+    void setText(const QString &text);
+    QString text() const;
     /** Adds a button for an action, which has to live on; \a isPrimary draws it in the accent colour. */
     void addAction(QAction *action, bool isPrimary);
 
@@ -21,5 +24,6 @@ protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
+    QLabel *m_label;
     QHBoxLayout *m_buttons = nullptr;
 };

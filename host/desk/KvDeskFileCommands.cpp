@@ -2,20 +2,34 @@
 #include "KvDeskFileCommands.h"
 
 #include "KvDeskFileKind.h"
+#include "KvDeskProgress.h"
 #include "KvDeskRecentFiles.h"
+#include "KvDeskRecoveryFile.h"
 #include "KvDeskSession.h"
 #include "KvDeskStatus.h"
 #include "KvDeskWaitCursor.h"
 #include "common/ZtAppStatus.h"
 #include "kernel/ZtAppSettings.h"
 #include "measuring/ZtFault.h"
-#include "measuring/ZtSession.h"
+#include "measuring/ZtImportedTable.h"
+#include "measuring/ZtLoadedSession.h"
+#include "measuring/ZtMeasuringDocument.h"
+#include "measuring/ZtProgress.h"
+#include "measuring/ZtTableImport.h"
 
+#include <QDir>
 #include <QFileDialog>
+#include <QMap>
 #include <QMessageBox>
 #include <QPushButton>
+#include <QScopedValueRollback>
+
+#include <memory>
+#include <utility>
 
 namespace {
+
+constexpr int mostFaultsTold = 10;
 
 const char groupName[] = "Desk";
 const char folderKey[] = "Folder";
@@ -56,12 +70,22 @@ QString withAllFiles(const QString &filter)
            filterOf(KvDeskFileCommands::tr("All files"), {QStringLiteral("*")});
 }
 
+// What a thread makes of a file, and why not.
+template <typename Result>
+struct Reading
+{
+    Result result;
+    ZtFault fault;
+    bool isRead = false;
+};
+
 } // namespace
 
 KvDeskFileCommands::KvDeskFileCommands(KvDeskSession *session, QWidget *window)
     : QObject(window)
     , m_session(session)
     , m_window(window)
+    , m_progress(new KvDeskProgress(window))
 {}
 
 bool KvDeskFileCommands::maybeSave()
@@ -88,35 +112,74 @@ bool KvDeskFileCommands::openFile(const QString &path)
     }
 }
 
+void KvDeskFileCommands::openFiles(const QStringList &paths)
+{
+    QMap<int, QStringList> byKind;
+    for (const QString &path : paths)
+        byKind[KvDeskFileKind::isKnown(path) ? KvDeskFileKind::of(path) : -1].append(path);
+    QStringList sessions = byKind.take(KvDeskFileKind::Session);
+    QStringList others = byKind.take(-1);
+    {
+        const QScopedValueRollback<bool> collecting(m_isCollecting, true);
+        // Another session would take the place of the first.
+        if (!sessions.isEmpty() && !openSession(sessions.takeFirst()) && m_faults.isEmpty())
+            return;
+        for (const QString &path : byKind.take(KvDeskFileKind::Image))
+            openImage(path);
+        for (const QString &path : byKind.take(KvDeskFileKind::Table))
+            importTable(path);
+    }
+    for (const QString &path : others + sessions)
+        warnOfUnopened(path, sessions.contains(path));
+    tellFaults();
+}
+
+void KvDeskFileCommands::warnOfUnopened(const QString &path, bool isSession)
+{
+    const QString text = isSession ? tr("Only one session can be open; not opened: %1")
+                                   : tr("Neither a session, an image nor a table: %1");
+    KvDeskStatus::log(ZtAppStatus::Warning, text.arg(fileName(path)),
+                      QStringLiteral("KvDeskFileCommands::openFiles"));
+}
+
+bool KvDeskFileCommands::run(const QString &text, const std::function<void(ZtProgress *)> &work,
+                             ZtFault *fault)
+{
+    const KvDeskProgress::Outcome outcome = m_progress->run(text, work);
+    m_isCancelled = outcome == KvDeskProgress::Cancelled;
+    if (outcome == KvDeskProgress::OutOfMemory)
+        fault->message = tr("There is not enough memory");
+    return outcome == KvDeskProgress::Done;
+}
+
 bool KvDeskFileCommands::openSession(const QString &path)
 {
     if (!maybeSave())
         return false;
-    const auto open = [this, &path](bool withoutImage, ZtFault *fault) {
-        const KvDeskWaitCursor wait;
-        return m_session->open(path, withoutImage, fault);
-    };
+    const QString source = QStringLiteral("KvDeskFileCommands::openSession");
+    const QString failure = tr("The session \"%1\" was not opened.").arg(fileName(path));
+    const KvDeskFileStamp stamp = KvDeskFileStamp::of(path);
+    const auto reading = std::make_shared<Reading<ZtLoadedSession>>();
     ZtFault fault;
-    const bool isOpen = open(false, &fault) || (isOnlyImageMissing(path, fault) &&
-                                                askToOpenWithoutImage(fault) && open(true, &fault));
-    if (!isOpen) {
-        tellFault(tr("The session \"%1\" was not opened.").arg(fileName(path)), fault,
-                  QStringLiteral("KvDeskFileCommands::openSession"));
-        return false;
+    const auto work = [reading, path](ZtProgress *progress) {
+        reading->isRead = reading->result.read(path, &reading->fault, progress);
+    };
+    if (!run(tr("Opening \"%1\"").arg(fileName(path)), work, &fault))
+        return tellFault(failure, fault, source);
+    if (!reading->isRead)
+        return tellFault(failure, reading->fault, source);
+    const ZtFault missing{path, 0, 0, QStringLiteral("image"), reading->result.imageFault.text()};
+    if (!missing.isNull() && !askToOpenWithoutImage(missing))
+        return tellFault(failure, missing, source);
+    {
+        const KvDeskWaitCursor wait;
+        m_session->setSession(&reading->result, path, stamp);
     }
     KvDeskRecentFiles::add(path);
     KvDeskStatus::log(
         ZtAppStatus::Information,
-        tr("Session opened: %1 (objects: %2)").arg(fileName(path)).arg(m_session->objectCount()),
-        QStringLiteral("KvDeskFileCommands::openSession"));
+        tr("Session opened: %1 (objects: %2)").arg(fileName(path)).arg(m_session->objectCount()), source);
     return true;
-}
-
-bool KvDeskFileCommands::isOnlyImageMissing(const QString &path, const ZtFault &fault) const
-{
-    ZtSession session;
-    ZtFault sessionFault;
-    return fault.place == QLatin1String("image") && ZtSession::load(path, &session, &sessionFault);
 }
 
 bool KvDeskFileCommands::askToOpenWithoutImage(const ZtFault &fault)
@@ -127,62 +190,155 @@ bool KvDeskFileCommands::askToOpenWithoutImage(const ZtFault &fault)
     return box.exec() == QMessageBox::Open;
 }
 
-bool KvDeskFileCommands::openImage(const QString &path)
+bool KvDeskFileCommands::restoreSession(const QString &file, const KvDeskRecoveryFile &header)
 {
+    if (!maybeSave())
+        return false;
+    const QString source = QStringLiteral("KvDeskFileCommands::restoreSession");
+    const QString failure = tr("The measurements were not restored.");
+    const auto reading = std::make_shared<Reading<ZtLoadedSession>>();
     ZtFault fault;
-    bool isOpen = false;
+    const auto work = [reading, file](ZtProgress *progress) {
+        reading->isRead = KvDeskRecoveryFile::read(file, &reading->result, &reading->fault, progress);
+    };
+    if (!run(tr("Restoring measurements"), work, &fault))
+        return tellFault(failure, fault, source);
+    if (!reading->isRead)
+        return tellFault(failure, reading->fault, source);
+    // Measurements are worth more than the image below them: no reason to leave them in the copy.
+    const ZtFault missing = reading->result.imageFault;
     {
         const KvDeskWaitCursor wait;
-        isOpen = m_session->openImage(path, &fault);
+        m_session->restore(&reading->result, header.sessionPath, header.sessionStamp);
     }
+    if (!missing.isNull())
+        KvDeskStatus::log(ZtAppStatus::Warning, missing.text(), source);
+    KvDeskStatus::log(ZtAppStatus::Information,
+                      tr("Measurements restored: %1 (objects: %2)")
+                          .arg(m_session->displayName())
+                          .arg(m_session->objectCount()),
+                      source);
+    return true;
+}
+
+bool KvDeskFileCommands::openImage(const QString &path)
+{
     const QString source = QStringLiteral("KvDeskFileCommands::openImage");
-    if (!isOpen)
-        tellFault(tr("The image \"%1\" was not opened.").arg(fileName(path)), fault, source);
-    else
-        KvDeskStatus::log(ZtAppStatus::Information, tr("Image opened: %1").arg(fileName(path)), source);
-    return isOpen;
+    const QString failure = tr("The image \"%1\" was not opened.").arg(fileName(path));
+    const auto reading = std::make_shared<Reading<ZtLoadedSession>>();
+    reading->result.session.imagePath = path;
+    ZtFault fault;
+    const auto work = [reading](ZtProgress *) { reading->result.readImage(); };
+    if (!run(tr("Opening \"%1\"").arg(fileName(path)), work, &fault))
+        return tellFault(failure, fault, source);
+    if (!reading->result.image)
+        return tellFault(failure, reading->result.imageFault, source);
+    {
+        const KvDeskWaitCursor wait;
+        m_session->showImage(std::move(reading->result.image));
+    }
+    KvDeskStatus::log(ZtAppStatus::Information, tr("Image opened: %1").arg(fileName(path)), source);
+    return true;
 }
 
 bool KvDeskFileCommands::importTable(const QString &path)
 {
+    const QString source = QStringLiteral("KvDeskFileCommands::importTable");
+    const QString failure = tr("The table \"%1\" was not imported.").arg(fileName(path));
+    const auto reading = std::make_shared<Reading<ZtImportedTable>>();
     ZtFault fault;
-    QStringList notes;
-    const int before = m_session->objectCount();
-    bool isImported = false;
+    const auto work = [reading, path](ZtProgress *progress) {
+        reading->isRead = ZtTableImport::readFile(path, ZtTableImportOptions(), &reading->result,
+                                                  &reading->fault, progress);
+    };
+    if (!run(tr("Importing \"%1\"").arg(fileName(path)), work, &fault))
+        return tellFault(failure, fault, source);
+    if (!reading->isRead)
+        return tellFault(failure, reading->fault, source);
     {
         const KvDeskWaitCursor wait;
-        isImported = m_session->importTable(path, &fault, &notes);
+        m_session->addTable(reading->result);
     }
-    const QString source = QStringLiteral("KvDeskFileCommands::importTable");
-    if (!isImported) {
-        tellFault(tr("The table \"%1\" was not imported.").arg(fileName(path)), fault, source);
-        return false;
-    }
-    for (const QString &note : qAsConst(notes))
+    for (const QString &note : qAsConst(reading->result.notes))
         KvDeskStatus::log(ZtAppStatus::Warning, tr("%1: %2", "file, remark").arg(fileName(path), note),
                           source);
-    const int added = m_session->objectCount() - before;
-    KvDeskStatus::log(ZtAppStatus::Information,
-                      tr("Table imported: %1 (objects: %2)").arg(fileName(path)).arg(added), source);
+    KvDeskStatus::log(
+        ZtAppStatus::Information,
+        tr("Table imported: %1 (objects: %2)").arg(fileName(path)).arg(reading->result.objectCount()),
+        source);
     return true;
 }
 
 bool KvDeskFileCommands::saveSession(const QString &path)
 {
+    const bool isOwnFile = QFileInfo(path).absoluteFilePath() == m_session->path();
+    if (isOwnFile && m_session->isChangedOnDisk()) {
+        const OnConflict answer = askToOverwrite();
+        if (answer != OnConflict::Overwrite)
+            return answer == OnConflict::SaveAs && slotSaveSessionAs();
+    }
     ZtFault fault;
-    bool isSaved = false;
+    if (!write(path, &fault))
+        return failSaving(path, fault);
+    KvDeskRecentFiles::add(path);
+    KvDeskStatus::log(ZtAppStatus::Information, tr("Session saved: %1").arg(fileName(path)),
+                      QStringLiteral("KvDeskFileCommands::saveSession"));
+    return true;
+}
+
+bool KvDeskFileCommands::write(const QString &path, ZtFault *fault)
+{
+    struct Writing
+    {
+        ZtSession session;
+        ZtFault fault;
+        bool isWritten = false;
+    };
+    const auto writing = std::make_shared<Writing>();
+    const quint64 change = m_session->changeCount();
     {
         const KvDeskWaitCursor wait;
-        isSaved = m_session->save(path, &fault);
+        writing->session = m_session->document()->toSession();
     }
-    const QString source = QStringLiteral("KvDeskFileCommands::saveSession");
-    if (!isSaved) {
-        tellFault(tr("The session \"%1\" was not saved.").arg(fileName(path)), fault, source);
+    const auto work = [writing, path](ZtProgress *progress) {
+        writing->isWritten = writing->session.save(path, &writing->fault, progress);
+    };
+    if (!run(tr("Saving \"%1\"").arg(fileName(path)), work, fault))
         return false;
-    }
-    KvDeskRecentFiles::add(path);
-    KvDeskStatus::log(ZtAppStatus::Information, tr("Session saved: %1").arg(fileName(path)), source);
-    return true;
+    *fault = writing->fault;
+    if (writing->isWritten)
+        m_session->setSaved(path, change);
+    return writing->isWritten;
+}
+
+KvDeskFileCommands::OnConflict KvDeskFileCommands::askToOverwrite()
+{
+    QMessageBox box(
+        QMessageBox::Question, tr("Session changed by another program"),
+        tr("\"%1\" was changed by another program. Overwrite its changes?").arg(m_session->displayName()),
+        QMessageBox::Cancel, m_window);
+    const QAbstractButton *const overwrite = box.addButton(tr("Overwrite"), QMessageBox::DestructiveRole);
+    QPushButton *const saveAs = box.addButton(tr("Save as..."), QMessageBox::AcceptRole);
+    box.setDefaultButton(saveAs);
+    box.exec();
+    if (box.clickedButton() == overwrite)
+        return OnConflict::Overwrite;
+    return box.clickedButton() == saveAs ? OnConflict::SaveAs : OnConflict::Cancel;
+}
+
+bool KvDeskFileCommands::failSaving(const QString &path, const ZtFault &fault)
+{
+    const QString source = QStringLiteral("KvDeskFileCommands::saveSession");
+    const QString failure = tr("The session \"%1\" was not saved.").arg(fileName(path));
+    if (m_isCancelled)
+        return tellFault(failure, fault, source);
+    KvDeskStatus::log(ZtAppStatus::Error, failure + QLatin1Char(' ') + fault.text(), source);
+    QMessageBox box(QMessageBox::Warning, tr("Measuring Desk"), failure, QMessageBox::Cancel, m_window);
+    box.setInformativeText(fault.text());
+    QPushButton *const saveAs = box.addButton(tr("Save as..."), QMessageBox::AcceptRole);
+    box.setDefaultButton(saveAs);
+    box.exec();
+    return box.clickedButton() == saveAs && slotSaveSessionAs();
 }
 
 void KvDeskFileCommands::slotNewSession()
@@ -200,16 +356,14 @@ void KvDeskFileCommands::slotOpenSession()
 
 void KvDeskFileCommands::slotOpenImage()
 {
-    const QString path =
-        chooseFile(tr("Open image"), withAllFiles(filterOf(tr("Images"), KvDeskFileKind::imagePatterns())));
+    const QString path = chooseFile(tr("Open image"), tr("Images"), KvDeskFileKind::imagePatterns());
     if (!path.isEmpty())
         openImage(path);
 }
 
 void KvDeskFileCommands::slotImportTable()
 {
-    const QString path =
-        chooseFile(tr("Import table"), withAllFiles(filterOf(tr("Tables"), KvDeskFileKind::tablePatterns())));
+    const QString path = chooseFile(tr("Import table"), tr("Tables"), KvDeskFileKind::tablePatterns());
     if (!path.isEmpty())
         importTable(path);
 }
@@ -240,6 +394,22 @@ QString KvDeskFileCommands::chooseFile(const QString &caption, const QString &fi
     return path;
 }
 
+QString KvDeskFileCommands::chooseFile(const QString &caption, const QString &name,
+                                       const QStringList &patterns)
+{
+    return chooseFile(caption, withAllFiles(filterOf(name, patterns)));
+}
+
+QString KvDeskFileCommands::chooseFolder(const QString &caption)
+{
+    QFileDialog dialog(m_window, caption, lastFolder());
+    dialog.setFileMode(QFileDialog::Directory);
+    dialog.setOption(QFileDialog::ShowDirsOnly);
+    QString path;
+    choose(&dialog, &path);
+    return path;
+}
+
 bool KvDeskFileCommands::choose(QFileDialog *dialog, QString *path)
 {
     if (dialog->exec() != QDialog::Accepted || dialog->selectedFiles().isEmpty())
@@ -249,10 +419,33 @@ bool KvDeskFileCommands::choose(QFileDialog *dialog, QString *path)
     return true;
 }
 
-void KvDeskFileCommands::tellFault(const QString &what, const ZtFault &fault, const QString &source)
+bool KvDeskFileCommands::tellFault(const QString &what, const ZtFault &fault, const QString &source)
 {
+    if (m_isCancelled) {
+        m_isCancelled = false;
+        KvDeskStatus::log(ZtAppStatus::Information, what, source);
+        return false;
+    }
     KvDeskStatus::log(ZtAppStatus::Error, what + QLatin1Char(' ') + fault.text(), source);
+    m_faults.append(what);
+    m_reasons.append(fault.text());
+    if (!m_isCollecting)
+        tellFaults();
+    return false;
+}
+
+void KvDeskFileCommands::tellFaults()
+{
+    const QStringList faults = std::exchange(m_faults, {});
+    QStringList reasons = std::exchange(m_reasons, {});
+    if (faults.isEmpty())
+        return;
+    if (reasons.size() > mostFaultsTold)
+        reasons = reasons.mid(0, mostFaultsTold) + QStringList(QString(QChar(0x2026)));
+    //: %n is 2 at least
+    const QString what =
+        faults.size() == 1 ? faults.first() : tr("%n files were not opened.", "", faults.size());
     QMessageBox box(QMessageBox::Warning, tr("Measuring Desk"), what, QMessageBox::Ok, m_window);
-    box.setInformativeText(fault.text());
+    box.setInformativeText(reasons.join(QLatin1Char('\n')));
     box.exec();
 }

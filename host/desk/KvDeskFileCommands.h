@@ -2,15 +2,23 @@
 #pragma once
 
 #include <QObject>
-#include <QString>
+#include <QStringList>
 
+#include <functional>
+
+class KvDeskProgress;
 class KvDeskSession;
 class QFileDialog;
+class ZtProgress;
+struct KvDeskRecoveryFile;
 struct ZtFault;
 
 /**
  * Opens and saves files for the user: asks which, asks about unsaved changes, and says what went wrong. What
- * cannot be opened leaves everything as it was.
+ * cannot be opened, or is cancelled, leaves everything as it was.
+ *
+ * Files are read and written by another thread; each call returns when all is done, and the interface goes on
+ * drawing meanwhile.
  */
 class KvDeskFileCommands : public QObject
 {
@@ -24,10 +32,25 @@ public:
 
     /** Each opens a file, and tells the user when that fails. */
     bool openFile(const QString &path); ///< a session, an image or a table
+    /** Opens what was dropped: one session at most, then images, then tables. What the program does not know
+     * is left out with a warning; all faults are told at once. */
+    void openFiles(const QStringList &paths);
     bool openSession(const QString &path);
     bool openImage(const QString &path);
     bool importTable(const QString &path);
+    /** Asks before it overwrites what another program wrote; offers another place when saving fails. */
     bool saveSession(const QString &path);
+    /** Opens a copy of unsaved work as a session with unsaved changes. */
+    bool restoreSession(const QString &file, const KvDeskRecoveryFile &header);
+
+    KvDeskProgress *progress() const { return m_progress; }
+
+    /** Each asks for a path; empty when the user does not want any. \a patterns is such as "*.avi". */
+    QString chooseFile(const QString &caption, const QString &name, const QStringList &patterns);
+    QString chooseFolder(const QString &caption);
+    /** Says in the status log and in a box that something did not work, and returns false: \a what is a
+     * sentence, \a source is "Class::method". What the user cancelled is a line in the status log only. */
+    bool tellFault(const QString &what, const ZtFault &fault, const QString &source);
 
 public slots:
     void slotNewSession();
@@ -38,12 +61,24 @@ public slots:
     bool slotSaveSessionAs();
 
 private:
+    enum class OnConflict { Overwrite, SaveAs, Cancel };
+
     QString chooseFile(const QString &caption, const QString &filter);
     bool choose(QFileDialog *dialog, QString *path);
-    bool isOnlyImageMissing(const QString &path, const ZtFault &fault) const;
+    /** False, with a fault, when the work was cancelled or ended by itself. */
+    bool run(const QString &text, const std::function<void(ZtProgress *)> &work, ZtFault *fault);
     bool askToOpenWithoutImage(const ZtFault &fault);
-    void tellFault(const QString &what, const ZtFault &fault, const QString &source);
+    OnConflict askToOverwrite();
+    bool write(const QString &path, ZtFault *fault);
+    bool failSaving(const QString &path, const ZtFault &fault);
+    void warnOfUnopened(const QString &path, bool isSession);
+    void tellFaults();
 
     KvDeskSession *m_session;
     QWidget *m_window;
+    KvDeskProgress *m_progress;
+    bool m_isCancelled = false;  ///< the work that run() did last
+    bool m_isCollecting = false; ///< faults are told later, all together
+    QStringList m_faults;
+    QStringList m_reasons;
 };

@@ -27,6 +27,19 @@ bool startsLikeJson(const QString &path)
     return file.open(QIODevice::ReadOnly) && file.peek(256).trimmed().startsWith('{');
 }
 
+// Tables are text; programs, archives and documents soon have a byte that no text has.
+bool startsLikeText(const QString &path)
+{
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly))
+        return false;
+    const QByteArray start = file.read(4096);
+    const bool isUtf16 = start.startsWith("\xFF\xFE") || start.startsWith("\xFE\xFF");
+    const bool isText = std::none_of(start.begin(), start.end(),
+                                     [](char c) { return (c >= 0 && c < '\t') || (c > '\r' && c < ' '); });
+    return !start.isEmpty() && (isUtf16 || isText);
+}
+
 QStringList patternsOf(const QStringList &suffixes)
 {
     QStringList patterns;
@@ -47,6 +60,14 @@ KvDeskFileKind::Kind KvDeskFileKind::of(const QString &path)
     if (isImageSuffix(suffix) || !QImageReader::imageFormat(path).isEmpty())
         return Image;
     return startsLikeJson(path) ? Session : Table;
+}
+
+bool KvDeskFileKind::isKnown(const QString &path)
+{
+    if (!QFileInfo(path).isFile())
+        return false;
+    const bool isTable = of(path) == Table && !tableSuffixes().contains(QFileInfo(path).suffix().toLower());
+    return !isTable || startsLikeText(path);
 }
 
 QStringList KvDeskFileKind::imagePatterns()

@@ -13,6 +13,9 @@ public:
     /** By the file's suffix; one that says nothing is told by the file's first bytes. */
     static Kind of(const QString &path);
 
+    /** Whether of() is more than a guess: for a file that is there, and no folder. */
+    static bool isKnown(const QString &path);
+
     /** Patterns for file dialogs, such as "*.png". */
     static QStringList imagePatterns();
     static QStringList tablePatterns();

@@ -2,17 +2,23 @@
 #include "KvDeskImageView.h"
 
 #include "KvDeskEmptyState.h"
-#include "KvDeskObjectShape.h"
+#include "KvDeskInlineEditor.h"
+#include "KvDeskObjectEditor.h"
+#include "KvDeskOverlay.h"
+#include "KvDeskRuler.h"
+#include "KvDeskSelectTool.h"
+#include "KvDeskSelection.h"
+#include "KvDeskSnapping.h"
 #include "gui/QtAdvancedStylesheet.h"
-#include "kernel/ZtGsManipulator.h"
-#include "kernel/ZtKernelData.h"
-#include "measuring/ZtDrawnType.h"
+#include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtFrameSource.h"
 #include "measuring/ZtKernelImage.h"
 #include "measuring/ZtMeasuringDocument.h"
+#include "measuring/ZtObjectsPainter.h"
 
 #include <QGraphicsScene>
 #include <QGuiApplication>
+#include <QLabel>
 #include <QMouseEvent>
 #include <QScrollBar>
 
@@ -25,17 +31,8 @@ constexpr double wheelNotch = 120.0;   ///< what a wheel reports for one notch
 constexpr double fitMargin = 16.0;     ///< pixels around an image that is fitted
 constexpr double largestFitZoom = 8.0; ///< tiny images are not blown up further
 constexpr double clickTolerance = 6.0; ///< pixels beside an object that still hit it
-
-QRectF united(const QRectF &a, const QRectF &b)
-{
-    // Bounds of points and level lines are empty for QRectF, yet there is something.
-    if (a.isNull())
-        return b;
-    if (b.isNull())
-        return a;
-    return QRectF(QPointF(qMin(a.left(), b.left()), qMin(a.top(), b.top())),
-                  QPointF(qMax(a.right(), b.right()), qMax(a.bottom(), b.bottom())));
-}
+constexpr double snapDistance = 8.0;   ///< pixels beside a point that still mean it
+constexpr double straightStep = 15.0;  ///< degrees between directions that Shift keeps
 
 } // namespace
 
@@ -61,6 +58,18 @@ KvDeskImageView::KvDeskImageView(QWidget *parent)
 
     m_emptyState = new KvDeskEmptyState(tr("Open an image or a session to start"), viewport());
     m_emptyState->setLayoutDirection(QGuiApplication::layoutDirection());
+    m_overlay = new KvDeskOverlay(this);
+    m_topRuler = new KvDeskRuler(Qt::Horizontal, this);
+    m_leftRuler = new KvDeskRuler(Qt::Vertical, this);
+    m_rulerCorner = new QLabel(this);
+    m_rulerCorner->setProperty("panel", true);
+    m_rulerCorner->setProperty("caption", true);
+    m_rulerCorner->setAlignment(Qt::AlignCenter);
+    m_selectTool = std::make_unique<KvDeskSelectTool>(this);
+    m_tool = m_selectTool.get();
+    m_inlineEditor = new KvDeskInlineEditor(this);
+    setSelection(new KvDeskSelection(this));
+    placeRulers();
     connectSignals();
 }
 
@@ -71,11 +80,64 @@ void KvDeskImageView::connectSignals()
     connect(&m_changes, SIGNAL(signalChanged()), this, SLOT(slotObjectsChanged()));
     connect(acss::QtAdvancedStylesheet::getInstance(), SIGNAL(currentThemeChanged(QString)), this,
                                                               SLOT(slotThemeChanged()));
+    connect(m_overlay, SIGNAL(signalUpdated()), this, SLOT(slotUpdate()));
+    connect(this, SIGNAL(signalZoomChanged(double)), this, SLOT(slotUpdateRulers()));
+    const ZtSignalCenter *const center = ZtSignalCenter::getInstance();
+    connect(center, SIGNAL(signalLengthUnitChanged()), this, SLOT(slotUpdateRulers()));
+}
+
+void KvDeskImageView::setEditor(KvDeskObjectEditor *editor)
+{
+    m_editor = editor;
+    setSelection(editor->selection());
+}
+
+void KvDeskImageView::setSelection(KvDeskSelection *selection)
+{
+    if (m_selection)
+        m_selection->disconnect(this);
+    m_selection = selection;
+    m_overlay->setSelection(selection);
+    connect(selection, SIGNAL(signalSelectionChanged()), this, SLOT(slotSelectionChanged()));
+}
+
+KvDeskObjectId KvDeskImageView::selectedObject() const
+{
+    return m_selection->current();
+}
+
+const KvDeskObjectPlaces &KvDeskImageView::places() const
+{
+    return m_overlay->places();
+}
+
+void KvDeskImageView::setTool(KvDeskTool *tool)
+{
+    KvDeskTool *const next = tool ? tool : m_selectTool.get();
+    if (next == m_tool)
+        return;
+    m_tool->cancel();
+    m_tool = next;
+    updateCursor();
+    refresh();
+}
+
+void KvDeskImageView::slotSelectionChanged()
+{
+    if (m_selection->objects().size() == 1 && places().index().contains(m_selection->current()))
+        bringIntoView(places().index().rect(m_selection->current()));
+}
+
+void KvDeskImageView::slotUpdate()
+{
+    refresh();
 }
 
 void KvDeskImageView::setDocument(ZtMeasuringDocument *document)
 {
     m_document = document;
+    m_overlay->setPainter(document->objectsPainter());
+    connect(document, SIGNAL(signalCalibrationChanged()), this, SLOT(slotUpdateRulers()));
     connect(document, SIGNAL(signalImageChanged()), this, SLOT(slotImageChanged()));
     // Direct: aHandled is a reference that the host reads when the emission returns.
     connect(document->kernelImage(), SIGNAL(signalImageCompleted(FrameData,bool&)), this,
@@ -110,26 +172,27 @@ void KvDeskImageView::slotImageCompleted(FrameData aFrameData, bool &aHandled)
     m_frame.set(image, place);
     if (isOtherSize)
         refreshContent();
-    viewport()->update();
+    refresh();
     emit signalFrameChanged();
 }
 
 void KvDeskImageView::slotObjectsChanged()
 {
     refreshContent();
-    viewport()->update();
+    // Units may read differently now.
+    m_overlay->slotLabelsChanged();
 }
 
 void KvDeskImageView::slotThemeChanged()
 {
-    viewport()->update();
+    m_overlay->slotLabelsChanged();
 }
 
 void KvDeskImageView::refreshContent()
 {
-    const QRectF objects = objectsRect();
-    m_emptyState->setVisible(m_frame.isNull() && objects.isNull());
-    const QRectF content = m_frame.isNull() ? objects : united(m_frame.sceneRect(), objects);
+    const QRectF objects = places().index().bounds();
+    m_emptyState->setVisible(m_frame.isNull() && places().index().size() == 0);
+    const QRectF content = m_frame.isNull() ? objects : KvDeskObjectIndex::united(m_frame.sceneRect(), objects);
     if (content == m_content && !m_isFitted)
         return;
     m_content = content;
@@ -137,18 +200,6 @@ void KvDeskImageView::refreshContent()
         fit();
     else
         updateSceneRect();
-}
-
-QRectF KvDeskImageView::objectsRect() const
-{
-    QRectF bounds;
-    const QMap<int, ZtObjectMap> &all = ZtKernelData::getInstance()->objects();
-    for (const ZtDrawnType &type : ZtDrawnType::all()) {
-        const ZtObjectMap objects = all.value(type.id);
-        for (const ZtKernelObjectData *object : objects)
-            bounds = united(bounds, KvDeskObjectShape(type.id, object).boundingRect());
-    }
-    return bounds;
 }
 
 double KvDeskImageView::zoom() const
@@ -238,38 +289,52 @@ QPointF KvDeskImageView::toScene(const QPointF &position) const
     return viewportTransform().inverted().map(position);
 }
 
-KvDeskObjectId KvDeskImageView::objectAt(const QPoint &position) const
+double KvDeskImageView::pixel() const
 {
-    const QPointF point = toScene(position);
-    const double tolerance = clickTolerance / transform().m11();
-    const QMap<int, ZtObjectMap> &all = ZtKernelData::getInstance()->objects();
-    KvDeskObjectId found;
-    for (const ZtDrawnType &type : ZtDrawnType::all()) {
-        const ZtObjectMap objects = all.value(type.id);
-        for (auto it = objects.constBegin(); it != objects.constEnd(); ++it) {
-            if (KvDeskObjectShape(type.id, it.value()).isAt(point, tolerance))
-                found = {type.id, it.key()};
-        }
-    }
-    return found;
+    return 1.0 / transform().m11();
 }
 
-void KvDeskImageView::slotSelectObject(int aType, int aId)
+QPointF KvDeskImageView::centre() const
 {
-    m_selected = {aType, aId};
-    viewport()->update();
-    const KvDeskObjectShape shape(aType, ZtKernelData::getInstance()->object(aType, aId));
-    if (!shape.isEmpty())
-        bringIntoView(shape.boundingRect());
+    return toScene(viewportCentre());
+}
+
+KvDeskObjectId KvDeskImageView::objectAt(const QPoint &position) const
+{
+    return places().objectAt(toScene(position), clickTolerance * pixel());
+}
+
+KvDeskImageView::Snap KvDeskImageView::snap(const KvDeskPointer &pointer, const QPointF *origin,
+                                            bool isSquare, const KvDeskObjectId &except) const
+{
+    if (pointer.modifiers & Qt::ControlModifier)
+        return {pointer.scene, false};
+    if (origin && pointer.modifiers & Qt::ShiftModifier)
+        return {isSquare ? KvDeskSnapping::toSquare(*origin, pointer.scene)
+                         : KvDeskSnapping::alongDirection(*origin, pointer.scene, straightStep),
+                false};
+    const double distance = snapDistance * pixel();
+    const QVector<QPointF> points = places().pointsNear(pointer.scene, distance, except);
+    const QPointF *const found = KvDeskSnapping::nearest(pointer.scene, points, distance);
+    return {found ? *found : pointer.scene, found != nullptr};
+}
+
+QPointF KvDeskImageView::steppedPoint(const QPointF &point, const QPointF &step)
+{
+    // Whole pixels of the image, or of the screen where those are larger.
+    const QPointF moved = point + step * qMax(1.0, std::round(pixel()));
+    const QPointF result(std::round(moved.x()), std::round(moved.y()));
+    bringIntoView(QRectF(result, QSizeF()));
+    reportPosition(result);
+    refresh();
+    return result;
 }
 
 // What is seen in part stays where it is.
 void KvDeskImageView::bringIntoView(const QRectF &rect)
 {
     const QRectF visible(toScene(viewport()->rect().topLeft()), toScene(viewport()->rect().bottomRight()));
-    const bool isSeen = rect.right() >= visible.left() && rect.left() <= visible.right() &&
-                        rect.bottom() >= visible.top() && rect.top() <= visible.bottom();
-    if (!isSeen)
+    if (!KvDeskObjectIndex::touch(rect, visible))
         place(rect.center(), viewportCentre());
 }
 
@@ -283,36 +348,18 @@ void KvDeskImageView::drawForeground(QPainter *painter, const QRectF &rect)
 {
     Q_UNUSED(rect)
     painter->save();
-    // The painter may belong to the whole window, but labels are to stay inside this view.
-    painter->setWindow(viewport()->rect());
-    painter->setViewport(viewport()->rect());
-    const ZtKernelObjectData *const selected =
-        ZtKernelData::getInstance()->object(m_selected.type, m_selected.id);
-    if (selected)
-        KvDeskObjectShape(m_selected.type, selected).drawHighlight(painter);
-    drawObjects(painter);
+    m_overlay->draw(painter, viewportTransform(), viewport()->size(), devicePixelRatioF());
+    drawScaleBar(painter);
+    painter->setRenderHint(QPainter::Antialiasing);
+    painter->setWorldTransform(viewportTransform());
+    m_tool->draw(painter);
     painter->restore();
-}
-
-void KvDeskImageView::drawObjects(QPainter *painter) const
-{
-    const ZtKernelData *const kernel = ZtKernelData::getInstance();
-    const QMap<int, ZtObjectMap> &all = kernel->objects();
-    for (auto type = all.constBegin(); type != all.constEnd(); ++type) {
-        const ZtGsManipulator *const manipulator = kernel->getGsManipulator(type.key());
-        if (!manipulator)
-            continue;
-        for (auto object = type->constBegin(); object != type->constEnd(); ++object) {
-            painter->save();
-            manipulator->draw(painter, object.key(), object.value());
-            painter->restore();
-        }
-    }
 }
 
 void KvDeskImageView::resizeEvent(QResizeEvent *event)
 {
     QGraphicsView::resizeEvent(event);
+    placeRulers();
     if (m_isFitted)
         fit();
     else
@@ -326,18 +373,26 @@ void KvDeskImageView::wheelEvent(QWheelEvent *event)
     event->accept();
 }
 
+KvDeskPointer KvDeskImageView::pointerOf(const QMouseEvent &event) const
+{
+    return {toScene(event.localPos()), event.localPos(), event.button(), event.modifiers()};
+}
+
+bool KvDeskImageView::isPanPress(const QMouseEvent &event) const
+{
+    return event.button() == Qt::MiddleButton || (event.button() == Qt::LeftButton && m_isSpaceDown);
+}
+
 void KvDeskImageView::mousePressEvent(QMouseEvent *event)
 {
     event->accept();
-    const bool isLeft = event->button() == Qt::LeftButton;
-    if (event->button() == Qt::MiddleButton || (isLeft && m_isSpaceDown)) {
+    if (isPanPress(*event)) {
         m_lastPan = event->pos();
         setPanning(true);
-    } else if (isLeft) {
-        const KvDeskObjectId object = objectAt(event->pos());
-        slotSelectObject(object.type, object.id);
-        emit signalObjectClicked(object.type, object.id);
+        return;
     }
+    m_tool->press(pointerOf(*event));
+    refresh();
 }
 
 void KvDeskImageView::mouseMoveEvent(QMouseEvent *event)
@@ -345,30 +400,62 @@ void KvDeskImageView::mouseMoveEvent(QMouseEvent *event)
     event->accept();
     if (m_isPanning)
         pan(event->pos());
-    reportPointer(event->localPos());
+    else
+        m_tool->move(pointerOf(*event));
+    const QPointF position = event->localPos();
+    setRulerPointer(&position);
+    reportPosition(toScene(position));
 }
 
 void KvDeskImageView::mouseReleaseEvent(QMouseEvent *event)
 {
     event->accept();
-    if (m_isPanning && !(event->buttons() & (Qt::LeftButton | Qt::MiddleButton)))
+    if (!m_isPanning)
+        m_tool->release(pointerOf(*event));
+    else if (!(event->buttons() & (Qt::LeftButton | Qt::MiddleButton)))
         setPanning(false);
 }
 
 void KvDeskImageView::mouseDoubleClickEvent(QMouseEvent *event)
 {
-    mousePressEvent(event);
+    if (isPanPress(*event) || event->button() != Qt::LeftButton) {
+        mousePressEvent(event);
+        return;
+    }
+    event->accept();
+    m_tool->doubleClick(pointerOf(*event));
+    refresh();
+}
+
+// Tab goes on from object to object, as long as there are objects.
+bool KvDeskImageView::event(QEvent *event)
+{
+    if (event->type() == QEvent::KeyPress) {
+        auto *const keyEvent = static_cast<QKeyEvent *>(event);
+        const bool isTab = keyEvent->key() == Qt::Key_Tab || keyEvent->key() == Qt::Key_Backtab;
+        if (isTab && m_tool->key(keyEvent)) {
+            event->accept();
+            return true;
+        }
+    }
+    return QGraphicsView::event(event);
 }
 
 void KvDeskImageView::keyPressEvent(QKeyEvent *event)
 {
-    if (event->key() != Qt::Key_Space) {
-        QGraphicsView::keyPressEvent(event);
+    event->accept();
+    if (m_tool->key(event)) {
+        refresh();
         return;
     }
-    event->accept();
-    if (!event->isAutoRepeat())
-        setSpaceDown(true);
+    if (event->key() == Qt::Key_Escape) {
+        emit signalToolLeft();
+    } else if (event->key() == Qt::Key_Space) {
+        if (!event->isAutoRepeat())
+            setSpaceDown(true);
+    } else {
+        QGraphicsView::keyPressEvent(event);
+    }
 }
 
 void KvDeskImageView::keyReleaseEvent(QKeyEvent *event)
@@ -391,8 +478,10 @@ void KvDeskImageView::focusOutEvent(QFocusEvent *event)
 
 bool KvDeskImageView::viewportEvent(QEvent *event)
 {
-    if (event->type() == QEvent::Leave)
+    if (event->type() == QEvent::Leave) {
+        setRulerPointer(nullptr);
         emit signalPointerLeft();
+    }
     return QGraphicsView::viewportEvent(event);
 }
 
@@ -425,15 +514,84 @@ void KvDeskImageView::updateCursor()
         viewport()->setCursor(Qt::ClosedHandCursor);
     else if (m_isSpaceDown)
         viewport()->setCursor(Qt::OpenHandCursor);
+    else if (m_tool->cursor() != Qt::ArrowCursor)
+        viewport()->setCursor(m_tool->cursor());
     else
         viewport()->unsetCursor();
 }
 
-void KvDeskImageView::reportPointer(const QPointF &position)
+void KvDeskImageView::reportPosition(const QPointF &scenePoint)
 {
-    const QPointF point = toScene(position);
-    if (m_frame.sceneRect().contains(point))
-        emit signalPointerMoved(point);
+    if (m_frame.sceneRect().contains(scenePoint))
+        emit signalPointerMoved(scenePoint);
     else
         emit signalPointerLeft();
+}
+
+void KvDeskImageView::scrollContentsBy(int dx, int dy)
+{
+    QGraphicsView::scrollContentsBy(dx, dy);
+    slotUpdateRulers();
+}
+
+void KvDeskImageView::slotSetRulersVisible(bool aVisible)
+{
+    m_areRulersVisible = aVisible;
+    const int margin = aVisible ? KvDeskRuler::thickness : 0;
+    setViewportMargins(margin, margin, 0, 0);
+    placeRulers();
+}
+
+void KvDeskImageView::slotSetLabelsVisible(bool aVisible)
+{
+    m_areLabelsVisible = aVisible;
+    if (m_document)
+        m_document->objectsPainter()->setLabelsShown(aVisible);
+    m_overlay->slotLabelsChanged();
+}
+
+void KvDeskImageView::slotSetScaleBarVisible(bool aVisible)
+{
+    m_isScaleBarVisible = aVisible;
+    if (m_document)
+        m_document->objectsPainter()->setScaleBarShown(aVisible);
+    refresh();
+}
+
+// At the corner of the image, as far as that is in view.
+void KvDeskImageView::drawScaleBar(QPainter *painter) const
+{
+    if (m_document && !m_frame.isNull())
+        m_document->objectsPainter()->drawScaleBar(
+            painter, viewportTransform(), page() & viewportTransform().mapRect(m_frame.sceneRect()));
+}
+
+void KvDeskImageView::placeRulers()
+{
+    constexpr int side = KvDeskRuler::thickness;
+    m_topRuler->setGeometry(side, 0, qMax(0, width() - side), side);
+    m_leftRuler->setGeometry(0, side, side, qMax(0, height() - side));
+    m_rulerCorner->setGeometry(0, 0, side, side);
+    const QList<QWidget *> rulers{m_topRuler, m_leftRuler, m_rulerCorner};
+    for (QWidget *const ruler : rulers)
+        ruler->setVisible(m_areRulersVisible);
+    slotUpdateRulers();
+}
+
+void KvDeskImageView::slotUpdateRulers()
+{
+    if (!m_areRulersVisible)
+        return;
+    const ZtCalibration calibration = m_document ? m_document->calibration() : ZtCalibration();
+    const QPointF origin = viewportTransform().map(QPointF());
+    m_topRuler->setScale(origin.x(), transform().m11(), calibration.micrometresPerPixelX());
+    m_leftRuler->setScale(origin.y(), transform().m22(), calibration.micrometresPerPixelY());
+    m_rulerCorner->setText(m_topRuler->unitText());
+    m_rulerCorner->setToolTip(m_topRuler->toolTip());
+}
+
+void KvDeskImageView::setRulerPointer(const QPointF *position)
+{
+    m_topRuler->setPointer(position ? std::optional<double>(position->x()) : std::nullopt);
+    m_leftRuler->setPointer(position ? std::optional<double>(position->y()) : std::nullopt);
 }

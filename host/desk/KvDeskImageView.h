@@ -8,16 +8,27 @@
 
 #include <QGraphicsView>
 
+#include <memory>
+
 class KvDeskEmptyState;
+class KvDeskInlineEditor;
+class KvDeskObjectEditor;
+class KvDeskObjectPlaces;
+class KvDeskOverlay;
+class KvDeskRuler;
+class KvDeskSelection;
+class KvDeskTool;
+class QLabel;
 class ZtMeasuringDocument;
+struct KvDeskPointer;
 
 /**
  * The image with the measured objects on it. Objects are drawn anew for every view, so that they are sharp at
  * any zoom.
  *
  * The wheel zooms at the pointer; the middle button, or the left one while the space bar is down, moves the
- * image; a click selects the object below it. As long as the user does not zoom, the whole image is kept in
- * view.
+ * image. Everything else that mouse and keys do is up to the tool. As long as the user does not zoom, the
+ * whole image is kept in view.
  */
 class KvDeskImageView : public QGraphicsView
 {
@@ -26,12 +37,31 @@ public:
     explicit KvDeskImageView(QWidget *parent = nullptr);
     ~KvDeskImageView() override;
 
+    /** A point that the user means who points nearly there. */
+    struct Snap
+    {
+        QPointF point;
+        bool isOnPoint = false; ///< of another object
+    };
+
     /** \a document has to outlive the view. */
     void setDocument(ZtMeasuringDocument *document);
+    /** Without an editor, objects can be looked at and selected only. It has to outlive the view. */
+    void setEditor(KvDeskObjectEditor *editor);
+    KvDeskObjectEditor *editor() const { return m_editor; }
+    KvDeskSelection *selection() const { return m_selection; }
+    const KvDeskObjectPlaces &places() const;
+    KvDeskOverlay *overlay() const { return m_overlay; }
+    KvDeskInlineEditor *inlineEditor() const { return m_inlineEditor; }
+
+    /** Hands mouse and keys to another tool, which is not owned; null stands for selecting. What the one
+     * before had half done is forgotten. */
+    void setTool(KvDeskTool *tool);
+    KvDeskTool *tool() const { return m_tool; }
 
     const KvDeskImageFrame &frame() const { return m_frame; }
     KvDeskEmptyState *emptyState() const { return m_emptyState; }
-    KvDeskObjectId selectedObject() const { return m_selected; }
+    KvDeskObjectId selectedObject() const;
 
     /** Pixels of the screen per pixel of the image. */
     double zoom() const;
@@ -45,22 +75,43 @@ public:
     /** Shows pending changes of objects at once. */
     void flush() { m_changes.flush(); }
 
+    /** Image pixels per pixel of the viewport. */
+    double pixel() const;
+    QRectF page() const { return QRectF(viewport()->rect()); }
+    QPointF centre() const; ///< the point of the image in the middle of the view
+    /**
+     * Where a point is meant to be. With Ctrl that is the pointer's very place; with Shift it lies straight
+     * from \a origin (unless null), or makes a square with it; else points of objects but \a except attract
+     * it.
+     */
+    Snap snap(const KvDeskPointer &pointer, const QPointF *origin, bool isSquare,
+              const KvDeskObjectId &except) const;
+    /** Where a crosshair comes that steps over the image by keys; it is kept in view. */
+    QPointF steppedPoint(const QPointF &point, const QPointF &step);
+    void bringIntoView(const QRectF &rect);
+    void refresh() { viewport()->update(); }
+    void reportPosition(const QPointF &scenePoint);
+
+    bool areRulersVisible() const { return m_areRulersVisible; }
+    bool areLabelsVisible() const { return m_areLabelsVisible; }
+    bool isScaleBarVisible() const { return m_isScaleBarVisible; }
+
 public slots:
+    void slotSetRulersVisible(bool aVisible);
+    void slotSetLabelsVisible(bool aVisible);
+    void slotSetScaleBarVisible(bool aVisible); ///< here and on pictures of reports
     void slotZoomIn();
     void slotZoomOut();
     void slotZoomFit();
     void slotZoomActual(); ///< one pixel of the image on one of the screen
-    /** Marks an object and brings it into view; an \a aId of 0 marks none. Emits nothing. */
-    void slotSelectObject(int aType, int aId);
 
 signals:
     void signalZoomChanged(double aZoom);
     void signalFrameChanged();
-    /** The user clicked at an object, or with \a aId 0 beside all of them. */
-    void signalObjectClicked(int aType, int aId);
     /** The pointer is over this point of the image, in its pixels. */
     void signalPointerMoved(QPointF aPosition);
     void signalPointerLeft(); ///< the pointer is not over the image
+    void signalToolLeft();    ///< the user is done with the tool, by Escape
 
 protected:
     void drawBackground(QPainter *painter, const QRectF &rect) override;
@@ -75,8 +126,13 @@ protected:
     void keyReleaseEvent(QKeyEvent *event) override;
     void focusOutEvent(QFocusEvent *event) override;
     bool viewportEvent(QEvent *event) override;
+    bool event(QEvent *event) override;
+    void scrollContentsBy(int dx, int dy) override;
 
 private slots:
+    void slotSelectionChanged();
+    void slotUpdate();
+    void slotUpdateRulers();
     void slotImageChanged();
     void slotImageCompleted(FrameData aFrameData, bool &aHandled);
     void slotObjectsChanged();
@@ -84,10 +140,14 @@ private slots:
 
 private:
     void connectSignals();
+    void setSelection(KvDeskSelection *selection);
     void refreshContent();
-    QRectF objectsRect() const;
     void updateSceneRect();
-    void bringIntoView(const QRectF &rect);
+    void placeRulers();
+    void setRulerPointer(const QPointF *position);
+    void drawScaleBar(QPainter *painter) const;
+    KvDeskPointer pointerOf(const QMouseEvent &event) const;
+    bool isPanPress(const QMouseEvent &event) const;
     /** Moves the image so that a point of the scene lies at \a position in the viewport. */
     void place(const QPointF &scenePoint, const QPointF &position);
     void fit();
@@ -100,17 +160,26 @@ private:
     void setPanning(bool on);
     void setSpaceDown(bool down);
     void updateCursor();
-    void reportPointer(const QPointF &position);
-    void drawObjects(QPainter *painter) const;
 
     ZtMeasuringDocument *m_document = nullptr;
     KvDeskImageFrame m_frame;
     KvDeskObjectChanges m_changes;
     KvDeskEmptyState *m_emptyState = nullptr;
-    KvDeskObjectId m_selected;
+    KvDeskOverlay *m_overlay = nullptr;
+    KvDeskInlineEditor *m_inlineEditor = nullptr;
+    KvDeskRuler *m_topRuler = nullptr;
+    KvDeskRuler *m_leftRuler = nullptr;
+    QLabel *m_rulerCorner = nullptr; ///< names the unit
+    KvDeskObjectEditor *m_editor = nullptr;
+    KvDeskSelection *m_selection = nullptr;
+    std::unique_ptr<KvDeskTool> m_selectTool;
+    KvDeskTool *m_tool = nullptr;
     QRectF m_content; ///< the image and all objects, in scene coordinates
     QPoint m_lastPan;
     bool m_isFitted = true;
     bool m_isPanning = false;
     bool m_isSpaceDown = false;
+    bool m_areRulersVisible = false;
+    bool m_areLabelsVisible = true;
+    bool m_isScaleBarVisible = false;
 };

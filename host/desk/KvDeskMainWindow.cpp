@@ -2,22 +2,39 @@
 #include "KvDeskMainWindow.h"
 
 #include "KvDeskActions.h"
+#include "KvDeskAutosave.h"
+#include "KvDeskCalibrationCommands.h"
+#include "KvDeskCounterBar.h"
+#include "KvDeskEditCommands.h"
 #include "KvDeskEmptyState.h"
+#include "KvDeskExportCommand.h"
 #include "KvDeskFileCommands.h"
+#include "KvDeskGallery.h"
 #include "KvDeskImageView.h"
+#include "KvDeskLiveBar.h"
+#include "KvDeskObjectEditor.h"
 #include "KvDeskRecentFiles.h"
+#include "KvDeskRecovery.h"
+#include "KvDeskRecoveryBar.h"
 #include "KvDeskResources.h"
+#include "KvDeskSelection.h"
 #include "KvDeskSession.h"
 #include "KvDeskSettingsDialog.h"
+#include "KvDeskSnapshots.h"
+#include "KvDeskSourceCommands.h"
+#include "KvDeskSourceMenu.h"
 #include "KvDeskStatusBar.h"
 #include "KvDeskStatusLog.h"
 #include "KvDeskTheme.h"
+#include "KvDeskToolBox.h"
 #include "KvDeskToolColumn.h"
+#include "KvDeskToolStrip.h"
 #include "KvDeskValueTable.h"
 #include "gui/KvToolBase.h"
 #include "gui/acss.h"
 #include "kernel/ZtAppSettings.h"
 #include "kernel/ZtSignalCenter.h"
+#include "measuring/ZtFrameSourceCatalogue.h"
 #include "measuring/ZtMeasuringDocument.h"
 
 #include <QAction>
@@ -40,14 +57,19 @@ constexpr QSize firstSize(1280, 800);
 constexpr QSize smallestSize(800, 520);
 constexpr int valuesWidth = 416;
 constexpr int logHeight = 144;
+constexpr int galleryHeight = 188; ///< one row of thumbnails
 
 const char windowGroup[] = "DeskWindow";
 const char geometryKey[] = "geometry";
 const char stateKey[] = "state";
 const char imageSplitterKey[] = "imageSplitter";
 const char logSplitterKey[] = "logSplitter";
+const char labelsKey[] = "labelsVisible";
+const char rulersKey[] = "rulersVisible";
+const char scaleBarKey[] = "scaleBarVisible";
 const char valuesKey[] = "valuesVisible";
 const char logKey[] = "logVisible";
+const char galleryKey[] = "galleryVisible";
 const char toolsKey[] = "activeTools";
 
 QStringList localFiles(const QMimeData *data)
@@ -74,7 +96,11 @@ KvDeskMainWindow::KvDeskMainWindow(ZtMeasuringDocument *document, QWidget *paren
     : KvGuiMainWindowBase(parent)
     , m_actions((KvDeskResources::ensure(), new KvDeskActions(this)))
     , m_session(new KvDeskSession(document, this))
+    , m_selection(new KvDeskSelection(this))
+    , m_objectEditor(new KvDeskObjectEditor(m_session, m_selection, this))
     , m_files(new KvDeskFileCommands(m_session, this))
+    , m_sources(new KvDeskSourceCommands(m_session, m_files, this))
+    , m_snapshots(new KvDeskSnapshots(m_actions, document, this))
 {
     setObjectName(QStringLiteral("DeskMainWindow"));
     setWindowIcon(QIcon(acss::getPathSVG(QStringLiteral("Icons/measuringdesk"))));
@@ -99,34 +125,59 @@ void KvDeskMainWindow::createPanels()
 {
     m_toolColumn = new KvDeskToolColumn(this);
     m_imageView = new KvDeskImageView(this);
+    m_imageView->setEditor(m_objectEditor);
     m_imageView->emptyState()->addAction(m_actions->action(KvDeskActions::OpenImage), true);
     m_imageView->emptyState()->addAction(m_actions->action(KvDeskActions::OpenSession), false);
+    m_toolBox = new KvDeskToolBox(m_actions, m_imageView, this);
+    m_toolStrip = new KvDeskToolStrip(m_toolBox, this);
+    new KvDeskCounterBar(m_toolBox, m_imageView);
+    m_editCommands = new KvDeskEditCommands(m_actions, m_imageView, m_objectEditor, this);
+    m_calibrationCommands =
+        new KvDeskCalibrationCommands(m_actions, m_imageView, m_session, m_objectEditor, this);
     m_valueTable = new KvDeskValueTable(this);
+    m_valueTable->setEditor(m_objectEditor);
+    new KvDeskExportCommand(m_actions->action(KvDeskActions::ExportTable), m_files, m_session, m_selection,
+                            this);
+    m_gallery = new KvDeskGallery(m_actions, this);
+    m_liveBar = new KvDeskLiveBar(m_actions, m_session->document(), this);
     m_statusLog = new KvDeskStatusLog(this);
     m_statusBar = new KvDeskStatusBar(this);
     setStatusBar(m_statusBar);
 
     m_imageSplitter = new QSplitter(Qt::Horizontal, this);
-    m_imageSplitter->addWidget(m_imageView);
+    m_imageSplitter->addWidget(createImageColumn());
     m_imageSplitter->addWidget(m_valueTable);
     m_imageSplitter->setChildrenCollapsible(false);
     m_imageSplitter->setStretchFactor(0, 1);
     m_imageSplitter->setSizes({firstSize.width() - valuesWidth, valuesWidth});
     m_logSplitter = new QSplitter(Qt::Vertical, this);
     m_logSplitter->addWidget(m_imageSplitter);
+    m_logSplitter->addWidget(m_gallery);
     m_logSplitter->addWidget(m_statusLog);
     m_logSplitter->setChildrenCollapsible(false);
     m_logSplitter->setStretchFactor(0, 1);
-    m_logSplitter->setSizes({firstSize.height() - logHeight, logHeight});
+    m_logSplitter->setSizes({firstSize.height() - galleryHeight - logHeight, galleryHeight, logHeight});
 
     auto *const central = new QWidget(this);
     auto *const layout = new QHBoxLayout(central);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(0);
     layout->addWidget(m_toolColumn);
+    layout->addWidget(m_toolStrip);
     layout->addWidget(m_logSplitter, 1);
     setCentralWidget(central);
     m_toolColumn->hide();
+}
+
+QWidget *KvDeskMainWindow::createImageColumn()
+{
+    auto *const column = new QWidget(this);
+    auto *const layout = new QVBoxLayout(column);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(0);
+    layout->addWidget(m_liveBar);
+    layout->addWidget(m_imageView, 1);
+    return column;
 }
 
 void KvDeskMainWindow::createMenus()
@@ -141,17 +192,42 @@ void KvDeskMainWindow::createMenus()
     m_recentMenu = file->addMenu(acss::createIcon(6, QStringLiteral("Icons/recent"), QSize(24, 24)),
                                  tr("&Recent sessions"));
     m_recentMenu->setToolTipsVisible(true);
-    add(file, {A::OpenImage, A::ImportTable});
+    add(file, {A::OpenImage, A::ImportTable, A::ExportTable});
     file->addSeparator();
     add(file, {A::SaveSession, A::SaveSessionAs});
     file->addSeparator();
     add(file, {A::Settings});
     file->addSeparator();
     add(file, {A::Quit});
+    QMenu *const edit = menuBar()->addMenu(tr("&Edit"));
+    edit->setToolTipsVisible(true);
+    add(edit, {A::Undo, A::Redo});
+    edit->addSeparator();
+    add(edit, {A::Cut, A::Copy, A::Paste, A::Delete});
+    edit->addSeparator();
+    add(edit, {A::SelectAll, A::Rename});
+    edit->addSeparator();
+    add(edit, {A::FilterValues});
+    QMenu *const image = menuBar()->addMenu(tr("&Image"));
+    image->setToolTipsVisible(true);
+    m_sourceMenu = new KvDeskSourceMenu(m_sources, this);
+    image->addMenu(m_sourceMenu);
+    add(image, {A::Freeze});
+    image->addSeparator();
+    add(image, {A::TakeSnapshot, A::SnapshotMeasurements});
+    QMenu *const measure = menuBar()->addMenu(tr("&Measure"));
+    for (const QVector<QAction *> &group : m_toolBox->groups()) {
+        measure->addActions(group.toList());
+        measure->addSeparator();
+    }
+    measure->setToolTipsVisible(true);
+    add(measure, {A::Calibrate, A::UseFilePixelSize});
     QMenu *const view = menuBar()->addMenu(tr("&View"));
     add(view, {A::ZoomIn, A::ZoomOut, A::ZoomFit, A::ZoomActual});
     view->addSeparator();
-    add(view, {A::ShowValues, A::ShowLog});
+    add(view, {A::ShowLabels, A::ShowRulers, A::ShowScaleBar});
+    view->addSeparator();
+    add(view, {A::ShowValues, A::ShowGallery, A::ShowLog});
     view->addSeparator();
     add(view, {A::ToggleTheme});
     QMenu *const help = menuBar()->addMenu(tr("&Help"));
@@ -169,15 +245,31 @@ void KvDeskMainWindow::createToolBar()
         for (const A::Id id : ids)
             bar->addAction(m_actions->action(id));
     };
-    add({A::OpenImage, A::OpenSession, A::SaveSession, A::ImportTable});
+    add({A::OpenImage, A::OpenSession, A::SaveSession, A::ImportTable, A::ExportTable});
+    bar->addSeparator();
+    add({A::Undo, A::Redo});
     bar->addSeparator();
     add({A::ZoomOut, A::ZoomIn, A::ZoomFit, A::ZoomActual});
+    bar->addSeparator();
+    bar->addWidget(createSourceButton(bar));
+    add({A::TakeSnapshot});
     auto *const space = new QWidget(bar);
     space->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Preferred);
     bar->addWidget(space);
-    add({A::ShowLog, A::ShowValues});
+    add({A::ShowGallery, A::ShowLog, A::ShowValues});
     bar->addSeparator();
     add({A::ToggleTheme, A::Settings});
+}
+
+QToolButton *KvDeskMainWindow::createSourceButton(QWidget *parent)
+{
+    auto *const button = new QToolButton(parent);
+    button->setMenu(m_sourceMenu);
+    button->setPopupMode(QToolButton::InstantPopup);
+    button->setIcon(m_sourceMenu->icon());
+    button->setToolTip(tr("Choose the image source"));
+    button->setAccessibleName(button->toolTip());
+    return button;
 }
 
 void KvDeskMainWindow::connectSignals()
@@ -188,10 +280,13 @@ void KvDeskMainWindow::connectSignals()
     connect(m_imageView, SIGNAL(signalZoomChanged(double)), m_statusBar, SLOT(slotZoomChanged(double)));
     connect(m_imageView, SIGNAL(signalPointerMoved(QPointF)), m_statusBar, SLOT(slotPointerMoved(QPointF)));
     connect(m_imageView, SIGNAL(signalPointerLeft()), m_statusBar, SLOT(slotPointerLeft()));
-    connect(m_imageView, SIGNAL(signalObjectClicked(int,int)), m_valueTable, SLOT(slotSelectObject(int,int)));
-    connect(m_valueTable, SIGNAL(signalObjectSelected(int,int)), m_imageView,
-                                 SLOT(slotSelectObject(int,int)));
+    connect(m_valueTable, SIGNAL(signalStatisticsChanged(QString,QString)), m_statusBar,
+                                 SLOT(slotSetStatistics(QString,QString)));
     connect(m_valueTable, SIGNAL(signalCloseClicked()), this, SLOT(slotHideValues()));
+    connect(m_gallery, SIGNAL(signalCloseClicked()), this, SLOT(slotHideGallery()));
+    connect(m_gallery, SIGNAL(signalOpenRequested(QString)), this, SLOT(slotOpenFromGallery(QString)));
+    connect(m_snapshots, SIGNAL(signalSaved(QString)), this, SLOT(slotShowSnapshot(QString)));
+    connect(m_imageView, SIGNAL(signalFrameChanged()), m_snapshots, SLOT(slotUpdate()));
     connect(m_statusLog, SIGNAL(signalCloseClicked()), this, SLOT(slotHideLog()));
     connect(m_recentMenu, SIGNAL(aboutToShow()), this, SLOT(slotFillRecentMenu()));
     connect(m_recentMenu, SIGNAL(triggered(QAction*)), this, SLOT(slotRecentTriggered(QAction*)));
@@ -209,6 +304,7 @@ void KvDeskMainWindow::connectActions()
     onTrigger(A::OpenImage, m_files, SLOT(slotOpenImage()));
     onTrigger(A::OpenSession, m_files, SLOT(slotOpenSession()));
     onTrigger(A::ImportTable, m_files, SLOT(slotImportTable()));
+    onTrigger(A::FilterValues, this, SLOT(slotFilterValues()));
     onTrigger(A::SaveSession, m_files, SLOT(slotSaveSession()));
     onTrigger(A::SaveSessionAs, m_files, SLOT(slotSaveSessionAs()));
     onTrigger(A::Quit, this, SLOT(close()));
@@ -219,7 +315,12 @@ void KvDeskMainWindow::connectActions()
     onTrigger(A::ToggleTheme, this, SLOT(slotToggleTheme()));
     onTrigger(A::Settings, this, SLOT(slotSettings()));
     onTrigger(A::About, this, SLOT(slotAbout()));
+    connect(m_actions->action(A::ShowLabels), SIGNAL(toggled(bool)), m_imageView,
+                                              SLOT(slotSetLabelsVisible(bool)));
+    connect(m_actions->action(A::ShowRulers), SIGNAL(toggled(bool)), m_imageView,
+                                              SLOT(slotSetRulersVisible(bool)));
     connect(m_actions->action(A::ShowValues), SIGNAL(toggled(bool)), m_valueTable, SLOT(setVisible(bool)));
+    connect(m_actions->action(A::ShowGallery), SIGNAL(toggled(bool)), m_gallery, SLOT(setVisible(bool)));
     connect(m_actions->action(A::ShowLog), SIGNAL(toggled(bool)), m_statusLog, SLOT(setVisible(bool)));
 }
 
@@ -227,6 +328,15 @@ void KvDeskMainWindow::placeTool(KvToolBase *tool)
 {
     m_toolColumn->addTool(tool);
     m_toolColumn->show();
+}
+
+void KvDeskMainWindow::startRecovery(const QString &folder)
+{
+    m_recovery = new KvDeskRecovery(m_session, m_files, this);
+    m_recoveryBar = new KvDeskRecoveryBar(m_recovery, m_imageView->parentWidget());
+    qobject_cast<QBoxLayout *>(m_imageView->parentWidget()->layout())->insertWidget(0, m_recoveryBar);
+    m_recovery->find(folder);
+    m_autosave = std::make_unique<KvDeskAutosave>(m_session, folder);
 }
 
 void KvDeskMainWindow::restoreTools()
@@ -262,11 +372,23 @@ void KvDeskMainWindow::restoreWindow()
     restoreState(bytes(stateKey));
     m_imageSplitter->restoreState(bytes(imageSplitterKey));
     m_logSplitter->restoreState(bytes(logSplitterKey));
+    const bool labelsVisible = ZtAppSettings::value(QLatin1String(labelsKey), true).toBool();
+    const bool rulersVisible = ZtAppSettings::value(QLatin1String(rulersKey), true).toBool();
+    const bool scaleBarVisible = ZtAppSettings::value(QLatin1String(scaleBarKey), false).toBool();
     const bool valuesVisible = ZtAppSettings::value(QLatin1String(valuesKey), true).toBool();
+    const bool galleryVisible = ZtAppSettings::value(QLatin1String(galleryKey), false).toBool();
     const bool logVisible = ZtAppSettings::value(QLatin1String(logKey), false).toBool();
     ZtAppSettings::endGroup();
+    m_actions->action(KvDeskActions::ShowLabels)->setChecked(labelsVisible);
+    m_imageView->slotSetLabelsVisible(labelsVisible);
+    m_actions->action(KvDeskActions::ShowRulers)->setChecked(rulersVisible);
+    m_imageView->slotSetRulersVisible(rulersVisible);
+    m_actions->action(KvDeskActions::ShowScaleBar)->setChecked(scaleBarVisible);
+    m_imageView->slotSetScaleBarVisible(scaleBarVisible);
     m_actions->action(KvDeskActions::ShowValues)->setChecked(valuesVisible);
     m_valueTable->setVisible(valuesVisible);
+    m_actions->action(KvDeskActions::ShowGallery)->setChecked(galleryVisible);
+    m_gallery->setVisible(galleryVisible);
     m_actions->action(KvDeskActions::ShowLog)->setChecked(logVisible);
     m_statusLog->setVisible(logVisible);
 }
@@ -278,8 +400,13 @@ void KvDeskMainWindow::saveWindow() const
     ZtAppSettings::setValue(QLatin1String(stateKey), saveState());
     ZtAppSettings::setValue(QLatin1String(imageSplitterKey), m_imageSplitter->saveState());
     ZtAppSettings::setValue(QLatin1String(logSplitterKey), m_logSplitter->saveState());
+    ZtAppSettings::setValue(QLatin1String(labelsKey), m_imageView->areLabelsVisible());
+    ZtAppSettings::setValue(QLatin1String(rulersKey), m_imageView->areRulersVisible());
+    ZtAppSettings::setValue(QLatin1String(scaleBarKey), m_imageView->isScaleBarVisible());
     ZtAppSettings::setValue(QLatin1String(valuesKey),
                             m_actions->action(KvDeskActions::ShowValues)->isChecked());
+    ZtAppSettings::setValue(QLatin1String(galleryKey),
+                            m_actions->action(KvDeskActions::ShowGallery)->isChecked());
     ZtAppSettings::setValue(QLatin1String(logKey), m_actions->action(KvDeskActions::ShowLog)->isChecked());
     ZtAppSettings::setValue(QLatin1String(toolsKey), activeTools());
     ZtAppSettings::endGroup();
@@ -294,6 +421,10 @@ void KvDeskMainWindow::closeEvent(QCloseEvent *event)
         return;
     }
     m_isClosed = true;
+    if (m_autosave) {
+        m_autosave->end();
+        m_recovery->end();
+    }
     saveWindow();
     emit ZtSignalCenter::getInstance()->signalAppAboutToClose();
     event->accept();
@@ -327,8 +458,30 @@ void KvDeskMainWindow::dropEvent(QDropEvent *event)
 {
     event->setDropAction(Qt::CopyAction);
     event->accept();
-    for (const QString &file : localFiles(event->mimeData()))
-        m_files->openFile(file);
+    // Later: the program that the files come from waits for the end of the drag.
+    QMetaObject::invokeMethod(this, "slotOpenDropped", Qt::QueuedConnection,
+                              Q_ARG(QStringList, localFiles(event->mimeData())));
+}
+
+void KvDeskMainWindow::showFolder(const QString &path)
+{
+    m_actions->action(KvDeskActions::ShowGallery)->setChecked(true);
+    m_gallery->showFolder(path);
+}
+
+void KvDeskMainWindow::slotOpenDropped(const QStringList &aPaths)
+{
+    QStringList files;
+    for (const QString &path : aPaths) {
+        const ZtFrameSourceInfo info = ZtFrameSourceCatalogue::infoOfPath(path);
+        if (info.kind == ZtFrameSourceInfo::ImageFolder)
+            showFolder(path);
+        else if (info.kind == ZtFrameSourceInfo::VideoFile)
+            m_sources->open(info);
+        else
+            files.append(path);
+    }
+    m_files->openFiles(files);
 }
 
 void KvDeskMainWindow::slotStateChanged()
@@ -342,7 +495,7 @@ void KvDeskMainWindow::slotStateChanged()
 void KvDeskMainWindow::slotImageStateChanged()
 {
     m_statusBar->setImage(m_imageView->frame().image().size(),
-                          m_session->document()->calibration().micrometresPerPixel());
+                          m_session->document()->calibration());
     m_statusBar->slotZoomChanged(m_imageView->zoom());
 }
 
@@ -372,9 +525,31 @@ void KvDeskMainWindow::slotHideValues()
     m_actions->action(KvDeskActions::ShowValues)->setChecked(false);
 }
 
+void KvDeskMainWindow::slotFilterValues()
+{
+    m_actions->action(KvDeskActions::ShowValues)->setChecked(true);
+    m_valueTable->slotFocusFilter();
+}
+
 void KvDeskMainWindow::slotHideLog()
 {
     m_actions->action(KvDeskActions::ShowLog)->setChecked(false);
+}
+
+void KvDeskMainWindow::slotHideGallery()
+{
+    m_actions->action(KvDeskActions::ShowGallery)->setChecked(false);
+}
+
+void KvDeskMainWindow::slotShowSnapshot(const QString &aPath)
+{
+    m_actions->action(KvDeskActions::ShowGallery)->setChecked(true);
+    m_gallery->slotShowFile(aPath);
+}
+
+void KvDeskMainWindow::slotOpenFromGallery(const QString &aPath)
+{
+    m_files->openImage(aPath);
 }
 
 void KvDeskMainWindow::slotToggleTheme()

@@ -4,16 +4,33 @@
 #include "common/ZtAppStatus.h"
 #include "gui/KvGuiMainWindowBase.h"
 
+#include <memory>
+
 class KvDeskActions;
+class KvDeskAutosave;
+class KvDeskCalibrationCommands;
+class KvDeskEditCommands;
 class KvDeskFileCommands;
+class KvDeskGallery;
 class KvDeskImageView;
+class KvDeskLiveBar;
+class KvDeskObjectEditor;
+class KvDeskRecovery;
+class KvDeskRecoveryBar;
+class KvDeskSelection;
 class KvDeskSession;
+class KvDeskSnapshots;
+class KvDeskSourceCommands;
+class KvDeskSourceMenu;
 class KvDeskStatusBar;
 class KvDeskStatusLog;
+class KvDeskToolBox;
 class KvDeskToolColumn;
+class KvDeskToolStrip;
 class KvDeskValueTable;
 class QMenu;
 class QSplitter;
+class QToolButton;
 class ZtMeasuringDocument;
 
 /**
@@ -33,10 +50,19 @@ public:
 
     KvDeskActions *actions() const { return m_actions; }
     KvDeskSession *session() const { return m_session; }
+    KvDeskSelection *selection() const { return m_selection; }
+    KvDeskObjectEditor *objectEditor() const { return m_objectEditor; }
     KvDeskFileCommands *files() const { return m_files; }
     KvDeskImageView *imageView() const { return m_imageView; }
+    KvDeskCalibrationCommands *calibrationCommands() const { return m_calibrationCommands; }
     KvDeskValueTable *valueTable() const { return m_valueTable; }
+    KvDeskGallery *gallery() const { return m_gallery; }
+    KvDeskLiveBar *liveBar() const { return m_liveBar; }
+    KvDeskSourceMenu *sourceMenu() const { return m_sourceMenu; }
+    KvDeskSourceCommands *sources() const { return m_sources; }
+    KvDeskSnapshots *snapshots() const { return m_snapshots; }
     KvDeskStatusLog *statusLog() const { return m_statusLog; }
+    KvDeskToolBox *toolBox() const { return m_toolBox; }
     KvDeskToolColumn *toolColumn() const { return m_toolColumn; }
     KvDeskStatusBar *deskStatusBar() const { return m_statusBar; }
     QMenu *recentMenu() const { return m_recentMenu; }
@@ -44,6 +70,11 @@ public:
     /** Activates the tools that were active last time; the first time, the first tool. Called after tools
      * came. */
     void restoreTools();
+
+    /** From now on unsaved changes are copied to a folder; what other programs left there is offered. */
+    void startRecovery(const QString &folder);
+    KvDeskAutosave *autosave() const { return m_autosave.get(); }
+    KvDeskRecoveryBar *recoveryBar() const { return m_recoveryBar; }
 
 signals:
     void signalClosed();
@@ -56,11 +87,16 @@ protected:
 
 private slots:
     void slotStateChanged();
+    void slotOpenDropped(const QStringList &aPaths);
     void slotImageStateChanged();
     void slotFillRecentMenu();
     void slotRecentTriggered(QAction *aAction);
     void slotHideValues();
     void slotHideLog();
+    void slotFilterValues();
+    void slotHideGallery();
+    void slotShowSnapshot(const QString &aPath);
+    void slotOpenFromGallery(const QString &aPath);
     void slotToggleTheme();
     void slotSettings();
     void slotAbout();
@@ -71,23 +107,40 @@ private:
     void createPanels();
     void createMenus();
     void createToolBar();
+    QWidget *createImageColumn();
+    QToolButton *createSourceButton(QWidget *parent);
     void connectSignals();
     void connectActions();
     void restoreWindow();
     void saveWindow() const;
     QStringList activeTools() const;
+    void showFolder(const QString &path);
     bool closeOtherWindows();
 
     KvDeskActions *m_actions;
     KvDeskSession *m_session;
+    KvDeskSelection *m_selection;
+    KvDeskObjectEditor *m_objectEditor;
     KvDeskFileCommands *m_files;
+    KvDeskSourceCommands *m_sources;
+    KvDeskSnapshots *m_snapshots;
+    KvDeskEditCommands *m_editCommands = nullptr;
+    KvDeskCalibrationCommands *m_calibrationCommands = nullptr;
+    KvDeskToolBox *m_toolBox = nullptr;
     KvDeskToolColumn *m_toolColumn = nullptr;
+    KvDeskToolStrip *m_toolStrip = nullptr;
     KvDeskImageView *m_imageView = nullptr;
     KvDeskValueTable *m_valueTable = nullptr;
+    KvDeskGallery *m_gallery = nullptr;
+    KvDeskLiveBar *m_liveBar = nullptr;
+    KvDeskSourceMenu *m_sourceMenu = nullptr;
     KvDeskStatusLog *m_statusLog = nullptr;
     KvDeskStatusBar *m_statusBar = nullptr;
     QSplitter *m_imageSplitter = nullptr;
     QSplitter *m_logSplitter = nullptr;
     QMenu *m_recentMenu = nullptr;
+    KvDeskRecovery *m_recovery = nullptr;
+    KvDeskRecoveryBar *m_recoveryBar = nullptr;
+    std::unique_ptr<KvDeskAutosave> m_autosave; ///< ends before the session does
     bool m_isClosed = false;
 };

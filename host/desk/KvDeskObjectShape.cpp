@@ -2,6 +2,7 @@
 #include "KvDeskObjectShape.h"
 
 #include "gui/QtAdvancedStylesheet.h"
+#include "measuring/ZtDrawnManipulator.h"
 #include "measuring/ZtDrawnObjectData.h"
 #include "measuring/ZtDrawnType.h"
 
@@ -31,7 +32,7 @@ KvDeskObjectShape::KvDeskObjectShape(int type, const ZtKernelObjectData *data)
     if (!drawnType || !drawn || !drawnType->acceptsPoints(drawn->points()))
         return;
     if (drawnType->outline)
-        m_outline = drawnType->outline(drawn->points());
+        m_outline = ZtDrawnManipulator::outlineOf(*drawnType, drawn->points());
     else
         m_markers = drawn->points();
 }

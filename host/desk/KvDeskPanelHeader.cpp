@@ -55,6 +55,11 @@ QToolButton *KvDeskPanelHeader::addButton(const QString &iconPath, const QString
     button->setFixedSize(buttonSize);
     button->setToolTip(toolTip);
     button->setAccessibleName(toolTip);
-    m_layout->insertWidget(m_layout->count() - (m_closeButton ? 1 : 0), button);
+    addWidget(button);
     return button;
+}
+
+void KvDeskPanelHeader::addWidget(QWidget *widget)
+{
+    m_layout->insertWidget(m_layout->count() - (m_closeButton ? 1 : 0), widget);
 }

@@ -17,7 +17,9 @@ public:
 
     void setNote(const QString &note);
     QString note() const;
-    /** Adds a button before the closing one. */
+    /** Adds something before the closing button. */
+    void addWidget(QWidget *widget);
+    /** The same for a button. */
     QToolButton *addButton(const QString &iconPath, const QString &toolTip);
     QToolButton *closeButton() const { return m_closeButton; }
 

@@ -10,6 +10,7 @@
 #include <QPluginLoader>
 
 #include <algorithm>
+#include <exception>
 
 namespace {
 
@@ -81,12 +82,27 @@ void KvDeskPlugins::load(const QStringList &folders)
         KvDeskStatus::log(ZtAppStatus::Information, tr("No plug-ins were found"), source());
 }
 
+bool KvDeskPlugins::isSafe(const QString &file, const std::function<void()> &call)
+{
+    try {
+        call();
+        return true;
+    } catch (const std::exception &error) {
+        report(file, tr("It failed: %1").arg(QString::fromLocal8Bit(error.what())));
+    } catch (...) {
+        report(file, tr("It failed for a reason of its own"));
+    }
+    return false;
+}
+
 void KvDeskPlugins::loadLibrary(const QString &file, std::vector<Plugin> *loaded)
 {
     QPluginLoader loader(file);
     // A symbol that is missing is found now rather than in the middle of the work.
     loader.setLoadHints(QLibrary::ResolveAllSymbolsHint | QLibrary::PreventUnloadHint);
-    QObject *const instance = loader.instance();
+    QObject *instance = nullptr;
+    if (!isSafe(file, [&]() { instance = loader.instance(); }))
+        return;
     if (!instance) {
         report(file, loader.errorString());
         return;
@@ -97,17 +113,30 @@ void KvDeskPlugins::loadLibrary(const QString &file, std::vector<Plugin> *loaded
         delete instance;
         return;
     }
-    loaded->push_back({instance, plugin, file, plugin->order()});
+    Plugin entry{instance, plugin, file, 0};
+    if (isSafe(file, [&]() { entry.order = plugin->order(); }))
+        loaded->push_back(entry);
+}
+
+bool KvDeskPlugins::startGroup(const Plugin &plugin, const QString &groupName)
+{
+    bool isStarted = false;
+    if (!isSafe(plugin.file, [&]() { isStarted = plugin.plugin->initialize(groupName, m_mainWindow); }))
+        return false;
+    if (!isStarted)
+        report(plugin.file, tr("Its tools \"%1\" could not be started").arg(groupName));
+    return isStarted;
 }
 
 bool KvDeskPlugins::start(const Plugin &plugin)
 {
+    QStringList groupNames;
+    if (!isSafe(plugin.file, [&]() { groupNames = plugin.plugin->groupNames(); }))
+        return false;
     bool isStarted = false;
-    for (const QString &groupName : plugin.plugin->groupNames()) {
-        if (plugin.plugin->initialize(groupName, m_mainWindow))
+    for (const QString &groupName : qAsConst(groupNames)) {
+        if (startGroup(plugin, groupName))
             isStarted = true;
-        else
-            report(plugin.file, tr("Its tools \"%1\" could not be started").arg(groupName));
     }
     if (isStarted)
         KvDeskStatus::log(ZtAppStatus::Information, tr("Plug-in loaded: %1").arg(shownPath(plugin.file)),

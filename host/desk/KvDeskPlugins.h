@@ -5,6 +5,7 @@
 #include <QPointer>
 #include <QStringList>
 
+#include <functional>
 #include <vector>
 
 class KvGuiMainWindowBase;
@@ -54,6 +55,9 @@ private:
     static void report(const QString &file, const QString &reason);
     void loadLibrary(const QString &file, std::vector<Plugin> *loaded);
     bool start(const Plugin &plugin);
+    bool startGroup(const Plugin &plugin, const QString &groupName);
+    /** What a plug-in throws is its own fault, and reported as such. False then. */
+    static bool isSafe(const QString &file, const std::function<void()> &call);
 
     KvGuiMainWindowBase *m_mainWindow;
     std::vector<Plugin> m_loaded;

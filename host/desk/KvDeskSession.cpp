@@ -3,7 +3,11 @@
 
 #include "kernel/ZtKernelData.h"
 #include "kernel/ZtSignalCenter.h"
+#include "measuring/ZtFrameSource.h"
+#include "measuring/ZtImportedTable.h"
+#include "measuring/ZtLoadedSession.h"
 #include "measuring/ZtMeasuringDocument.h"
+#include "measuring/ZtTableImport.h"
 
 #include <QFileInfo>
 #include <QScopedValueRollback>
@@ -45,54 +49,128 @@ void KvDeskSession::clear()
         const QScopedValueRollback<bool> replacing(m_isReplacing, true);
         m_document->clear();
     }
+    m_stamp = KvDeskFileStamp();
+    emit signalReplaced();
     setState(QString(), false);
 }
 
 bool KvDeskSession::open(const QString &path, bool withoutImage, ZtFault *fault)
 {
-    const auto missing = withoutImage ? ZtMeasuringDocument::MissingImage::IsIgnored
-                                      : ZtMeasuringDocument::MissingImage::IsFault;
+    const KvDeskFileStamp stamp = KvDeskFileStamp::of(path);
+    ZtLoadedSession loaded;
+    if (!loaded.read(path, fault))
+        return false;
+    if (!withoutImage && !loaded.imageFault.isNull()) {
+        *fault = {path, 0, 0, QStringLiteral("image"), loaded.imageFault.text()};
+        return false;
+    }
+    setSession(&loaded, path, stamp);
+    return true;
+}
+
+void KvDeskSession::setSession(ZtLoadedSession *loaded, const QString &path, const KvDeskFileStamp &stamp)
+{
+    replaceBy(loaded, stamp);
+    setState(QFileInfo(path).absoluteFilePath(), false);
+}
+
+void KvDeskSession::restore(ZtLoadedSession *loaded, const QString &path, const KvDeskFileStamp &stamp)
+{
+    replaceBy(loaded, stamp);
+    ++m_changeCount;
+    setState(path, true);
+}
+
+void KvDeskSession::replaceBy(ZtLoadedSession *loaded, const KvDeskFileStamp &stamp)
+{
     {
         const QScopedValueRollback<bool> replacing(m_isReplacing, true);
-        if (!m_document->loadSession(path, fault, missing))
-            return false;
+        m_document->setSession(loaded);
     }
-    setState(QFileInfo(path).absoluteFilePath(), false);
-    return true;
+    m_stamp = stamp;
+    emit signalReplaced();
 }
 
 bool KvDeskSession::save(const QString &path, ZtFault *fault)
 {
     if (!m_document->saveSession(path, fault))
         return false;
-    setState(QFileInfo(path).absoluteFilePath(), false);
+    setSaved(path, m_changeCount);
     return true;
+}
+
+void KvDeskSession::setSaved(const QString &path, quint64 changeCount)
+{
+    m_stamp = KvDeskFileStamp::of(path);
+    setState(QFileInfo(path).absoluteFilePath(), m_isModified && changeCount != m_changeCount);
+}
+
+// Of a file that is gone nothing is lost by writing it.
+bool KvDeskSession::isChangedOnDisk() const
+{
+    const KvDeskFileStamp stamp = KvDeskFileStamp::of(m_path);
+    return stamp.exists() && stamp != m_stamp;
 }
 
 bool KvDeskSession::openImage(const QString &path, ZtFault *fault)
 {
+    std::unique_ptr<ZtStillImageSource> image = ZtStillImageSource::load(path, fault);
+    if (!image)
+        return false;
+    showImage(std::move(image));
+    return true;
+}
+
+void KvDeskSession::showImage(std::unique_ptr<ZtStillImageSource> image)
+{
     const bool isFresh = m_path.isEmpty() && objectCount() == 0;
     const QScopedValueRollback<bool> replacing(m_isReplacing, isFresh);
-    if (!m_document->loadImage(path, fault))
-        return false;
+    m_document->showImage(std::move(image));
     if (!m_document->calibration().isCalibrated() && objectCount() == 0)
-        m_document->setCalibration(m_document->offeredCalibration());
+        m_document->setCalibration(offeredNow());
     slotMarkModified();
-    return true;
+    emit signalImageOpened();
+}
+
+ZtCalibration KvDeskSession::offeredNow() const
+{
+    ZtCalibration calibration = m_document->offeredCalibration();
+    if (calibration.isCalibrated())
+        calibration.setDate(QDateTime::currentDateTimeUtc());
+    return calibration;
+}
+
+void KvDeskSession::showSource(std::unique_ptr<ZtFrameSource> source)
+{
+    const bool isFresh = m_path.isEmpty() && objectCount() == 0;
+    const QScopedValueRollback<bool> replacing(m_isReplacing, isFresh);
+    m_document->setFrameSource(std::move(source));
+    slotMarkModified();
 }
 
 bool KvDeskSession::importTable(const QString &path, ZtFault *fault, QStringList *notes)
 {
-    if (!m_document->importTable(path, ZtTableImportOptions(), fault, notes))
+    ZtImportedTable table;
+    if (!ZtTableImport::readFile(path, ZtTableImportOptions(), &table, fault))
         return false;
-    slotMarkModified();
+    *notes = table.notes;
+    addTable(table);
     return true;
+}
+
+void KvDeskSession::addTable(const ZtImportedTable &table)
+{
+    m_document->addTable(table);
+    slotMarkModified();
 }
 
 void KvDeskSession::slotMarkModified()
 {
-    if (!m_isReplacing)
-        setState(m_path, true);
+    if (m_isReplacing)
+        return;
+    ++m_changeCount;
+    setState(m_path, true);
+    emit signalChanged();
 }
 
 void KvDeskSession::setState(const QString &path, bool isModified)

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskStatusBar.h"
 
+#include "KvDeskCalibrationText.h"
 #include "KvDeskElidedLabel.h"
 #include "KvDeskStatus.h"
 #include "gui/QtAdvancedStylesheet.h"
@@ -32,6 +33,7 @@ KvDeskStatusBar::KvDeskStatusBar(QWidget *parent)
     , m_icon(new QLabel(this))
     , m_category(new QLabel(this))
     , m_message(new KvDeskElidedLabel(this))
+    , m_statistics(caption(this))
     , m_position(caption(this))
     , m_image(caption(this))
     , m_zoom(caption(this))
@@ -47,7 +49,7 @@ KvDeskStatusBar::KvDeskStatusBar(QWidget *parent)
     layout->addWidget(m_category);
     layout->addWidget(m_message, 1);
     addWidget(messageRow, 1);
-    for (QLabel *const label : {m_position, m_image, m_zoom}) {
+    for (QLabel *const label : {m_statistics, m_position, m_image, m_zoom}) {
         label->setContentsMargins(8, 0, 8, 0);
         addPermanentWidget(label);
     }
@@ -56,7 +58,9 @@ KvDeskStatusBar::KvDeskStatusBar(QWidget *parent)
     connect(log, SIGNAL(signalCleared()), this, SLOT(slotCleared()));
     connect(acss::QtAdvancedStylesheet::getInstance(), SIGNAL(currentThemeChanged(QString)), this,
                                                               SLOT(slotThemeChanged()));
-    setImage(QSize(), 0.0);
+    m_statistics->setAccessibleName(tr("Statistics of the selected values"));
+    m_statistics->hide();
+    setImage(QSize(), ZtCalibration());
     showLastEntry();
 }
 
@@ -102,11 +106,15 @@ QString KvDeskStatusBar::message() const
     return m_message->text();
 }
 
-void KvDeskStatusBar::setImage(const QSize &size, double pixelSize)
+void KvDeskStatusBar::setImage(const QSize &size, const ZtCalibration &calibration)
 {
     QString text = size.isEmpty() ? QString() : tr("%1 × %2 px").arg(size.width()).arg(size.height());
-    if (!size.isEmpty() && pixelSize > 0.0)
-        text += tr(", %1 μm/px", "size of a pixel").arg(pixelSize, 0, 'g', 4);
+    if (!size.isEmpty() && calibration.isCalibrated()) {
+        const QString objective = calibration.objective();
+        text += objective.isEmpty() ? QString() : tr(", %1", "objective").arg(objective);
+        text += tr(", %1/px", "size of a pixel").arg(KvDeskCalibrationText::pixelSize(calibration));
+    }
+    m_image->setToolTip(KvDeskCalibrationText::summary(calibration));
     m_image->setText(text);
     m_image->setVisible(!text.isEmpty());
     m_zoom->setVisible(!text.isEmpty());
@@ -126,6 +134,18 @@ QString KvDeskStatusBar::zoomText() const
 QString KvDeskStatusBar::positionText() const
 {
     return m_position->text();
+}
+
+QString KvDeskStatusBar::statisticsText() const
+{
+    return m_statistics->text();
+}
+
+void KvDeskStatusBar::slotSetStatistics(const QString &aText, const QString &aDetails)
+{
+    m_statistics->setText(aText);
+    m_statistics->setToolTip(aDetails);
+    m_statistics->setVisible(!aText.isEmpty());
 }
 
 void KvDeskStatusBar::slotZoomChanged(double aZoom)

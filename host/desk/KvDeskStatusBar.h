@@ -8,6 +8,7 @@
 
 class KvDeskElidedLabel;
 class QLabel;
+class ZtCalibration;
 
 /** Status bar: the newest message of the status log with its category, and what is known about the image. */
 class KvDeskStatusBar : public QStatusBar
@@ -16,14 +17,17 @@ class KvDeskStatusBar : public QStatusBar
 public:
     explicit KvDeskStatusBar(QWidget *parent = nullptr);
 
-    /** Size of the image in pixels (empty: there is none) and micrometres per pixel (0: uncalibrated). */
-    void setImage(const QSize &size, double pixelSize);
+    /** Size of the image in pixels (empty: there is none) and what it is measured with. */
+    void setImage(const QSize &size, const ZtCalibration &calibration);
     QString message() const;
     QString imageText() const;
     QString zoomText() const;
     QString positionText() const;
+    QString statisticsText() const;
 
 public slots:
+    /** What the selected values come to, in one line and as a tool tip; empty for none. */
+    void slotSetStatistics(const QString &aText, const QString &aDetails);
     /** \a aZoom is 1 for 100 %. */
     void slotZoomChanged(double aZoom);
     void slotPointerMoved(QPointF aPosition);
@@ -41,6 +45,7 @@ private:
     QLabel *m_icon;
     QLabel *m_category;
     KvDeskElidedLabel *m_message;
+    QLabel *m_statistics;
     QLabel *m_position;
     QLabel *m_image;
     QLabel *m_zoom;

@@ -5,6 +5,7 @@
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QHeaderView>
+#include <QMimeData>
 
 #include <algorithm>
 
@@ -13,10 +14,29 @@ namespace {
 constexpr int tableRowHeight = 24;
 constexpr int fontPixelSize = 12;
 
+QString htmlRow(const QStringList &texts, const QString &tag)
+{
+    QString html = QStringLiteral("<tr>");
+    for (const QString &text : texts)
+        html += QLatin1Char('<') + tag + QLatin1Char('>') + text.toHtmlEscaped() + QStringLiteral("</") +
+                tag + QLatin1Char('>');
+    return html + QStringLiteral("</tr>\n");
+}
+
+// A tabulator or line end in a text would break the table.
+QString textRow(const QStringList &texts)
+{
+    QStringList fields;
+    for (const QString &text : texts)
+        fields.append(text.simplified());
+    return fields.join(QLatin1Char('\t')) + QLatin1Char('\n');
+}
+
 } // namespace
 
 KvDeskTableView::KvDeskTableView(QWidget *parent)
     : QTableView(parent)
+    , m_copy(new QAction(tr("Copy"), this))
 {
     QFont small = font();
     small.setPixelSize(fontPixelSize);
@@ -37,39 +57,76 @@ KvDeskTableView::KvDeskTableView(QWidget *parent)
     horizontalHeader()->setHighlightSections(false);
     horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
 
-    auto *const copy = new QAction(tr("Copy"), this);
-    copy->setShortcut(QKeySequence::Copy);
-    copy->setShortcutContext(Qt::WidgetShortcut);
-    connect(copy, SIGNAL(triggered()), this, SLOT(slotCopy()));
-    addAction(copy);
+    m_copy->setShortcut(QKeySequence::Copy);
+    m_copy->setShortcutContext(Qt::WidgetShortcut);
+    connect(m_copy, SIGNAL(triggered()), this, SLOT(slotCopy()));
+    addAction(m_copy);
     setContextMenuPolicy(Qt::ActionsContextMenu);
+}
+
+// Asking the selection model for its rows would take time for every pair of selected ranges.
+QVector<int> KvDeskTableView::selectedRows() const
+{
+    QVector<int> rows;
+    if (!selectionModel())
+        return rows;
+    for (const QItemSelectionRange &range : selectionModel()->selection()) {
+        for (int row = range.top(); row <= range.bottom(); ++row)
+            rows.append(row);
+    }
+    std::sort(rows.begin(), rows.end());
+    rows.erase(std::unique(rows.begin(), rows.end()), rows.end());
+    return rows;
 }
 
 QString KvDeskTableView::selectedText() const
 {
-    if (!selectionModel())
-        return QString();
-    QVector<int> rows;
-    for (const QModelIndex &index : selectionModel()->selectedRows())
-        rows.append(index.row());
-    std::sort(rows.begin(), rows.end());
     QString text;
-    for (const int row : qAsConst(rows))
-        text += rowText(row) + QLatin1Char('\n');
+    for (const int row : selectedRows())
+        text += textRow(rowTexts(row));
     return text;
 }
 
-QString KvDeskTableView::rowText(int row) const
+std::unique_ptr<QMimeData> KvDeskTableView::selectedData() const
+{
+    const QVector<int> rows = selectedRows();
+    if (rows.isEmpty())
+        return nullptr;
+    QString text;
+    QString html = QStringLiteral("<table>\n");
+    if (m_copiesHeadings) {
+        text += textRow(headings());
+        html += htmlRow(headings(), QStringLiteral("th"));
+    }
+    for (const int row : rows) {
+        const QStringList texts = rowTexts(row);
+        text += textRow(texts);
+        html += htmlRow(texts, QStringLiteral("td"));
+    }
+    auto copied = std::make_unique<QMimeData>();
+    copied->setText(text);
+    copied->setHtml(html + QStringLiteral("</table>\n"));
+    return copied;
+}
+
+QStringList KvDeskTableView::rowTexts(int row) const
 {
     QStringList fields;
     for (int column = 0; column < model()->columnCount(); ++column)
         fields.append(model()->index(row, column).data().toString());
-    return fields.join(QLatin1Char('\t'));
+    return fields;
+}
+
+QStringList KvDeskTableView::headings() const
+{
+    QStringList fields;
+    for (int column = 0; column < model()->columnCount(); ++column)
+        fields.append(model()->headerData(column, Qt::Horizontal).toString());
+    return fields;
 }
 
 void KvDeskTableView::slotCopy()
 {
-    const QString text = selectedText();
-    if (!text.isEmpty())
-        QGuiApplication::clipboard()->setText(text);
+    if (std::unique_ptr<QMimeData> copied = selectedData())
+        QGuiApplication::clipboard()->setMimeData(copied.release());
 }

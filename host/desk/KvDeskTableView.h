@@ -3,6 +3,10 @@
 
 #include <QTableView>
 
+#include <memory>
+
+class QMimeData;
+
 /** Table of the program's panels: whole rows, no grid, copied to the clipboard with the shortcut for copying.
  */
 class KvDeskTableView : public QTableView
@@ -13,11 +17,23 @@ public:
 
     /** The selected rows as shown, top to bottom: fields with tabulators between them, one line each. */
     QString selectedText() const;
+    /** What is copied: selectedText(), below the headings where they are wanted, and the same as an HTML
+     * table; null without a selection. */
+    std::unique_ptr<QMimeData> selectedData() const;
+
+    /** Whether the headings are copied, too; at first they are not. */
+    void setCopiesHeadings(bool copies) { m_copiesHeadings = copies; }
+    QAction *copyAction() const { return m_copy; }
 
 public slots:
-    /** Puts selectedText() on the clipboard; without a selection the clipboard stays. */
+    /** Puts selectedData() on the clipboard; without a selection the clipboard stays. */
     void slotCopy();
 
 private:
-    QString rowText(int row) const;
+    QVector<int> selectedRows() const;
+    QStringList rowTexts(int row) const;
+    QStringList headings() const;
+
+    QAction *m_copy;
+    bool m_copiesHeadings = false;
 };

@@ -2,15 +2,25 @@
 #include "KvDeskValueTable.h"
 
 #include "KvDeskEmptyState.h"
+#include "KvDeskObjectEditor.h"
 #include "KvDeskPanelHeader.h"
+#include "KvDeskSelectionStatistics.h"
 #include "KvDeskTableView.h"
+#include "KvDeskValueCommands.h"
 #include "KvDeskValueDelegate.h"
+#include "KvDeskValueSelection.h"
 #include "KvDeskValueSortModel.h"
 #include "KvDeskValueTableModel.h"
 
+#include <QAction>
+#include <QFrame>
 #include <QHeaderView>
+#include <QKeyEvent>
 #include <QLayout>
+#include <QLineEdit>
 #include <QScopedValueRollback>
+#include <QScrollBar>
+#include <QVBoxLayout>
 
 #include <numeric>
 
@@ -18,7 +28,9 @@ namespace {
 
 constexpr int minimumColumnWidth = 48;
 constexpr int largestUnitWidth = 80;
-constexpr int rounding = 2; ///< pixels by which a text may be wider than its whole pixels
+constexpr int rounding = 2;       ///< pixels by which a text may be wider than its whole pixels
+constexpr int sampledRows = 1000; ///< whose texts are measured at first, spread over the table
+constexpr int smallSpacing = 8;
 
 } // namespace
 
@@ -28,22 +40,62 @@ KvDeskValueTable::KvDeskValueTable(QWidget *parent)
     , m_sorted(new KvDeskValueSortModel(m_model, this))
 {
     createView();
+    createFilter();
+    createEmptyStates();
     setUpColumns();
-    setContent(m_view);
+    auto *const content = new QFrame(this);
+    content->setProperty("panel", true);
+    auto *const layout = new QVBoxLayout(content);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(0);
+    auto *const filterRow = new QHBoxLayout;
+    filterRow->setContentsMargins(smallSpacing, 0, smallSpacing, smallSpacing);
+    filterRow->addWidget(m_filter);
+    layout->addLayout(filterRow);
+    layout->addWidget(m_view, 1);
+    setContent(content);
+    m_filterTimer.setSingleShot(true);
+    m_filterTimer.setInterval(filterDelayMs);
+    m_measureTimer.setSingleShot(true);
     connectSignals();
-    slotRowsChanged();
+    slotRowsReset();
 }
+
+KvDeskValueTable::~KvDeskValueTable() = default;
 
 void KvDeskValueTable::createView()
 {
     m_view = new KvDeskTableView(this);
     m_view->setAccessibleName(tr("Measured values"));
     m_view->setModel(m_sorted);
+    m_view->setCopiesHeadings(true);
     m_delegate = new KvDeskValueDelegate(m_view);
     m_view->setItemDelegateForColumn(KvDeskValueTableModel::ValueColumn, m_delegate);
+    m_selection = new KvDeskValueSelection(m_view, m_sorted, m_model, this);
+}
+
+void KvDeskValueTable::createFilter()
+{
+    m_filter = new QLineEdit(this);
+    m_filter->setPlaceholderText(tr("Filter by type, object or value name"));
+    m_filter->setAccessibleName(tr("Filter of the measured values"));
+    m_filter->setToolTip(tr("Shows only rows that have all of these words (Ctrl+F)"));
+    m_filter->setClearButtonEnabled(true);
+    // Files that are dropped on it are for the window.
+    m_filter->setAcceptDrops(false);
+    m_filter->installEventFilter(this);
+    setTabOrder(m_filter, m_view);
+}
+
+void KvDeskValueTable::createEmptyStates()
+{
     m_emptyState = new KvDeskEmptyState(
         tr("Measured values appear here once a session is opened or a table is imported"),
         m_view->viewport());
+    m_noMatchState = new KvDeskEmptyState(tr("No measured value matches the filter"), m_view->viewport());
+    auto *const clear = new QAction(tr("Clear the filter"), this);
+    connect(clear, SIGNAL(triggered()), this, SLOT(slotClearFilter()));
+    m_noMatchState->addAction(clear, false);
 }
 
 void KvDeskValueTable::setUpColumns()
@@ -60,91 +112,139 @@ void KvDeskValueTable::setUpColumns()
 
 void KvDeskValueTable::connectSignals()
 {
-    connect(m_view->selectionModel(), SIGNAL(selectionChanged(QItemSelection,QItemSelection)), this,
-                                             SLOT(slotSelectionChanged(QItemSelection,QItemSelection)));
     connect(m_view->horizontalHeader(), SIGNAL(sectionResized(int,int,int)), this,
                                                SLOT(slotColumnResized(int,int,int)));
-    connect(m_sorted, SIGNAL(modelReset()), this, SLOT(slotRowsChanged()));
-    connect(m_sorted, SIGNAL(dataChanged(QModelIndex,QModelIndex,QVector<int>)), this,
-                             SLOT(slotRowsChanged()));
+    connect(m_view->verticalScrollBar(), SIGNAL(valueChanged(int)), &m_measureTimer, SLOT(start()));
+    connect(m_sorted, SIGNAL(modelReset()), this, SLOT(slotRowsReset()));
+    connect(m_sorted, SIGNAL(rowsInserted(QModelIndex,int,int)), this, SLOT(slotRowsChanged()));
+    connect(m_sorted, SIGNAL(rowsRemoved(QModelIndex,int,int)), this, SLOT(slotRowsChanged()));
+    connect(m_sorted, SIGNAL(dataChanged(QModelIndex,QModelIndex,QVector<int>)), &m_measureTimer,
+                             SLOT(start()));
+    connect(m_selection, SIGNAL(signalValuesSelected()), this, SLOT(slotUpdateStatistics()));
+    connect(&m_measureTimer, SIGNAL(timeout()), this, SLOT(slotMeasureTexts()));
+    connect(&m_filterTimer, SIGNAL(timeout()), this, SLOT(slotApplyFilter()));
+    connect(m_filter, SIGNAL(textChanged(QString)), this, SLOT(slotFilterChanged()));
 }
 
-KvDeskObjectId KvDeskValueTable::objectAt(const QModelIndex &index) const
+void KvDeskValueTable::setEditor(KvDeskObjectEditor *editor)
 {
-    return index.isValid() ? m_model->row(m_sorted->mapToSource(index).row()).object : KvDeskObjectId();
+    m_selection->setObjects(editor->selection());
+    m_commands = new KvDeskValueCommands(m_view, m_selection, editor, this);
+    connect(m_model, SIGNAL(signalRenamed(int,int,QString)), m_commands, SLOT(slotRenamed(int,int,QString)));
 }
 
-void KvDeskValueTable::slotSelectionChanged(const QItemSelection &aSelected,
-                                            const QItemSelection &aDeselected)
+void KvDeskValueTable::slotFocusFilter()
 {
-    Q_UNUSED(aSelected)
-    Q_UNUSED(aDeselected)
-    if (m_isSelecting)
-        return;
-    const bool hasSelection = m_view->selectionModel()->hasSelection();
-    const KvDeskObjectId object = hasSelection ? objectAt(m_view->currentIndex()) : KvDeskObjectId();
-    if (object == m_selected)
-        return;
-    m_selected = object;
-    emit signalObjectSelected(object.type, object.id);
+    m_filter->setFocus(Qt::ShortcutFocusReason);
+    m_filter->selectAll();
 }
 
-void KvDeskValueTable::slotSelectObject(int aType, int aId)
+void KvDeskValueTable::slotClearFilter()
 {
-    m_selected = {aType, aId};
-    selectRows();
-    const QModelIndexList rows = m_view->selectionModel()->selectedRows();
-    if (rows.isEmpty())
-        return;
-    // All of them if they fit, the first in any case.
-    m_view->scrollTo(rows.last());
-    m_view->scrollTo(rows.first());
+    m_filter->clear();
+    slotApplyFilter();
 }
 
-void KvDeskValueTable::selectRows()
+void KvDeskValueTable::slotFilterChanged()
 {
-    const QScopedValueRollback<bool> selecting(m_isSelecting, true);
-    QItemSelection selection;
-    const QVector<int> rows = m_selected.isNull() ? QVector<int>() : m_model->rowsOf(m_selected);
-    for (const int row : rows) {
-        const QModelIndex index = m_sorted->mapFromSource(m_model->index(row, 0));
-        selection.select(index, index);
+    m_filterTimer.start();
+}
+
+void KvDeskValueTable::slotApplyFilter()
+{
+    m_filterTimer.stop();
+    m_sorted->setFilter(m_filter->text());
+}
+
+bool KvDeskValueTable::eventFilter(QObject *watched, QEvent *event)
+{
+    if (watched == m_filter && event->type() == QEvent::KeyPress &&
+        filterKeyPressed(static_cast<QKeyEvent *>(event)->key()))
+        return true;
+    return KvDeskPanel::eventFilter(watched, event);
+}
+
+// Escape shows everything again, and goes back to the table when it does already.
+bool KvDeskValueTable::filterKeyPressed(int key)
+{
+    switch (key) {
+    case Qt::Key_Escape:
+        if (m_filter->text().isEmpty())
+            m_view->setFocus();
+        else
+            slotClearFilter();
+        return true;
+    case Qt::Key_Return:
+    case Qt::Key_Enter:
+    case Qt::Key_Down:
+        slotApplyFilter();
+        m_view->setFocus();
+        return true;
+    default:
+        return false;
     }
-    QItemSelectionModel *const model = m_view->selectionModel();
-    model->select(selection, QItemSelectionModel::ClearAndSelect | QItemSelectionModel::Rows);
-    // The table stays where the user looks.
-    m_view->setAutoScroll(false);
-    if (!rows.isEmpty())
-        model->setCurrentIndex(selection.first().topLeft(), QItemSelectionModel::NoUpdate);
-    m_view->setAutoScroll(true);
+}
+
+QString KvDeskValueTable::note() const
+{
+    const int all = m_model->rowCount();
+    if (all == 0)
+        return QString();
+    if (!m_sorted->isFiltered())
+        return QString::number(all);
+    //: rows that match the filter, all rows
+    return tr("%1 of %2").arg(m_sorted->rowCount()).arg(all);
+}
+
+void KvDeskValueTable::updateEmptyStates()
+{
+    const bool isEmpty = m_model->rowCount() == 0;
+    m_emptyState->setVisible(isEmpty);
+    m_noMatchState->setVisible(!isEmpty && m_sorted->rowCount() == 0);
+    m_view->horizontalHeader()->setVisible(!isEmpty);
+    m_filter->setEnabled(!isEmpty || m_sorted->isFiltered());
+    header()->setNote(note());
+}
+
+void KvDeskValueTable::slotRowsReset()
+{
+    m_numberWidth = 0;
+    m_unitWidth = 0;
+    const int step = qMax(1, m_sorted->rowCount() / sampledRows);
+    for (int row = 0; row < m_sorted->rowCount(); row += step)
+        measureRow(row);
+    slotRowsChanged();
 }
 
 void KvDeskValueTable::slotRowsChanged()
 {
-    const int count = m_model->rowCount();
-    m_emptyState->setVisible(count == 0);
-    m_view->horizontalHeader()->setVisible(count > 0);
-    header()->setNote(count > 0 ? QString::number(count) : QString());
-    updateUnitWidth();
-    if (m_selected.isNull())
-        return;
-    const bool isThere = !m_model->rowsOf(m_selected).isEmpty();
-    if (isThere && !m_view->selectionModel()->hasSelection()) {
-        selectRows();
-    } else if (!isThere) {
-        m_selected = KvDeskObjectId();
-        emit signalObjectSelected(0, 0);
-    }
+    updateEmptyStates();
+    slotMeasureTexts();
+    m_selection->slotRowsChanged();
 }
 
-void KvDeskValueTable::updateUnitWidth()
+void KvDeskValueTable::measureRow(int row)
 {
     const QFontMetrics metrics(m_view->font());
-    int width = 0;
-    for (const QString &unit : m_model->units())
-        width = qMax(width, metrics.horizontalAdvance(unit) + rounding);
-    m_delegate->setUnitWidth(qMin(width, largestUnitWidth));
-    m_valueWidth = m_delegate->widthFor(metrics.horizontalAdvance(m_model->longestNumber()) + rounding);
+    const QString text = m_model->text(m_sorted->sourceRow(row), KvDeskValueTableModel::ValueColumn);
+    m_numberWidth =
+        qMax(m_numberWidth, metrics.horizontalAdvance(KvDeskValueTableModel::numberOf(text)) + rounding);
+    const QString unit = KvDeskValueTableModel::unitOf(text);
+    if (!unit.isEmpty())
+        m_unitWidth = qMax(m_unitWidth, metrics.horizontalAdvance(unit) + rounding);
+}
+
+// The texts of all rows would take long to make: those that are seen decide.
+void KvDeskValueTable::slotMeasureTexts()
+{
+    if (m_sorted->rowCount() > 0) {
+        const int bottom = m_view->rowAt(m_view->viewport()->height() - 1);
+        const int last = bottom < 0 ? m_sorted->rowCount() - 1 : bottom;
+        for (int row = qMax(0, m_view->rowAt(0)); row <= qMin(last, m_view->rowAt(0) + sampledRows); ++row)
+            measureRow(row);
+    }
+    m_delegate->setUnitWidth(qMin(m_unitWidth, largestUnitWidth));
+    m_valueWidth = m_delegate->widthFor(m_numberWidth);
     makeRoomForValues();
 }
 
@@ -168,10 +268,17 @@ void KvDeskValueTable::slotColumnResized(int aColumn, int aOldWidth, int aNewWid
         m_textWidths[aColumn] = aNewWidth;
 }
 
+void KvDeskValueTable::slotUpdateStatistics()
+{
+    const KvDeskSelectionStatistics statistics = m_selection->statistics();
+    emit signalStatisticsChanged(statistics.text(), statistics.details());
+}
+
 void KvDeskValueTable::resizeEvent(QResizeEvent *event)
 {
     QWidget::resizeEvent(event);
     // Of the layout's, not the one before it.
     layout()->activate();
     makeRoomForValues();
+    m_measureTimer.start();
 }

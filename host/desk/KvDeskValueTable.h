@@ -4,60 +4,87 @@
 #include "KvDeskObjectId.h"
 #include "KvDeskPanel.h"
 
+#include <QStringList>
+#include <QTimer>
 #include <QVector>
 
 class KvDeskEmptyState;
+class KvDeskObjectEditor;
 class KvDeskTableView;
+class KvDeskValueCommands;
 class KvDeskValueDelegate;
+class KvDeskValueSelection;
 class KvDeskValueSortModel;
 class KvDeskValueTableModel;
-class QItemSelection;
+class QLineEdit;
 
-/** Panel with the table of measured values. */
+/** Panel with the table of measured values and a field that filters them. */
 class KvDeskValueTable : public KvDeskPanel
 {
     Q_OBJECT
 public:
+    static constexpr int filterDelayMs = 150;
+
     explicit KvDeskValueTable(QWidget *parent = nullptr);
+    ~KvDeskValueTable() override;
+
+    /** Does what the user asks for, and has the selected objects; called once, has to outlive this. */
+    void setEditor(KvDeskObjectEditor *editor);
 
     KvDeskValueTableModel *model() const { return m_model; }
     KvDeskTableView *view() const { return m_view; }
-    /** The object of the current row; none without a selection. */
-    KvDeskObjectId selectedObject() const { return m_selected; }
+    KvDeskValueSelection *selection() const { return m_selection; }
+    /** Null without an editor. */
+    KvDeskValueCommands *commands() const { return m_commands; }
+    QLineEdit *filterField() const { return m_filter; }
+
+public slots:
+    void slotFocusFilter();
+    void slotClearFilter();
+
+signals:
+    /** What the selected values come to, in one line and in several; empty for none. */
+    void signalStatisticsChanged(const QString &aText, const QString &aDetails);
 
 protected:
     void resizeEvent(QResizeEvent *event) override;
-
-public slots:
-    /** Selects the rows of an object and scrolls to them; an \a aId of 0 selects nothing. Emits nothing. */
-    void slotSelectObject(int aType, int aId);
-
-signals:
-    /** The user selected another object; \a aId is 0 when there is none any more. */
-    void signalObjectSelected(int aType, int aId);
+    bool eventFilter(QObject *watched, QEvent *event) override;
 
 private slots:
-    void slotSelectionChanged(const QItemSelection &aSelected, const QItemSelection &aDeselected);
+    void slotFilterChanged();
+    void slotApplyFilter();
+    void slotRowsReset();
     void slotRowsChanged();
+    void slotMeasureTexts();
     void slotColumnResized(int aColumn, int aOldWidth, int aNewWidth);
+    void slotUpdateStatistics();
 
 private:
     void createView();
+    void createFilter();
+    void createEmptyStates();
     void setUpColumns();
     void connectSignals();
-    void selectRows();
-    void updateUnitWidth();
+    void updateEmptyStates();
+    QString note() const;
+    void measureRow(int row);
     void makeRoomForValues();
-    KvDeskObjectId objectAt(const QModelIndex &index) const;
+    bool filterKeyPressed(int key);
 
     KvDeskValueTableModel *m_model;
     KvDeskValueSortModel *m_sorted;
     KvDeskTableView *m_view = nullptr;
+    KvDeskValueSelection *m_selection = nullptr;
+    KvDeskValueCommands *m_commands = nullptr;
     KvDeskValueDelegate *m_delegate = nullptr;
     KvDeskEmptyState *m_emptyState = nullptr;
-    KvDeskObjectId m_selected;
-    int m_valueWidth = 0;       ///< pixels that the longest number and its unit take
-    QVector<int> m_textWidths;  ///< of the columns before the values, as the user wants them
-    bool m_isFitting = false;   ///< columns change because of the program
-    bool m_isSelecting = false; ///< the selection changes because of the program
+    KvDeskEmptyState *m_noMatchState = nullptr;
+    QLineEdit *m_filter = nullptr;
+    QTimer m_filterTimer;
+    QTimer m_measureTimer;
+    int m_numberWidth = 0;     ///< pixels of the longest number seen so far
+    int m_unitWidth = 0;       ///< pixels of the longest unit seen so far
+    int m_valueWidth = 0;      ///< pixels that both take
+    QVector<int> m_textWidths; ///< of the columns before the values, as the user wants them
+    bool m_isFitting = false;  ///< columns change because of the program
 };

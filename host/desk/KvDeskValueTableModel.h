@@ -5,32 +5,35 @@
 #include "KvDeskObjectId.h"
 
 #include <QAbstractTableModel>
-#include <QStringList>
+#include <QCollator>
+#include <QHash>
+#include <QPair>
 #include <QVector>
 
-class ZtGsManipulator;
-class ZtKernelObjectData;
+#include <optional>
+#include <vector>
 
-/** One measured value of one object, as the table shows it. */
+/** One measured value of one object. */
 struct KvDeskValueRow
 {
     KvDeskObjectId object;
-    QString typeName;
-    QString objectName;
-    QString valueName;
-    QString text;       ///< number, blank, unit
-    double value = 0.0; ///< in base units
-    int kind = 0;       ///< ZtGsManipulator::MeasureKind
+    int objectIndex = 0; ///< among the objects of the table
+    int position = 0;    ///< among the names of the type's values
+    int kind = 0;        ///< ZtGsManipulator::MeasureKind
+    double value = 0.0;  ///< in base units
 
     bool isSameValue(const KvDeskValueRow &other) const
     {
-        return object == other.object && valueName == other.valueName;
+        return object == other.object && position == other.position;
     }
 };
 
 /**
  * The measured values of all objects, one row each, in the order of types, objects and values; the rows are
  * those that reports show. Follows the kernel's objects; many changes at a time are one update.
+ *
+ * A change costs what it changes: only the objects that came, went or changed are read again, and texts are
+ * made when they are asked for. When many objects come or go at once, the model is reset.
  */
 class KvDeskValueTableModel : public QAbstractTableModel
 {
@@ -38,20 +41,36 @@ class KvDeskValueTableModel : public QAbstractTableModel
 public:
     enum Column { TypeColumn, ObjectColumn, NameColumn, ValueColumn, ColumnCount };
 
+    /** Rows that lie next to each other. */
+    struct Range
+    {
+        int first = 0;
+        int count = 0;
+    };
+
+    /** With more objects than this coming or going at a time, the model is reset. */
+    static constexpr int maximumMoves = 8;
+
     explicit KvDeskValueTableModel(QObject *parent = nullptr);
 
     int rowCount(const QModelIndex &parent = QModelIndex()) const override;
     int columnCount(const QModelIndex &parent = QModelIndex()) const override;
     QVariant data(const QModelIndex &index, int role = Qt::DisplayRole) const override;
     QVariant headerData(int section, Qt::Orientation orientation, int role = Qt::DisplayRole) const override;
+    /** Names of objects can be edited. */
+    Qt::ItemFlags flags(const QModelIndex &index) const override;
+    /** Asks for another name of an object; an answer of true says only that it was asked for. */
+    bool setData(const QModelIndex &index, const QVariant &value, int role = Qt::EditRole) override;
 
-    const KvDeskValueRow &row(int row) const { return m_rows.at(row); }
-    /** The rows of an object, ascending. */
-    QVector<int> rowsOf(const KvDeskObjectId &object) const;
-    /** All units that the values' texts end with, each once. */
-    const QStringList &units() const { return m_units; }
-    /** The number with the most characters. */
-    QString longestNumber() const { return m_longestNumber; }
+    const KvDeskValueRow &row(int row) const { return m_rows[static_cast<std::size_t>(row)]; }
+    QString text(int row, int column) const;
+    /** The rows of an object; none for an object without values. */
+    Range rowsOf(const KvDeskObjectId &object) const;
+    /** The row of one value, or -1. */
+    int rowOf(const KvDeskObjectId &object, int position) const;
+    /** Less than, equal to or greater than 0 as people sort the texts of two rows: "Circle 2" comes before
+     * "Circle 10". */
+    int compareTexts(int left, int right, int column) const;
 
     /** Number and unit of a value's text; a text that does not start with a number has no unit. */
     static QString numberOf(const QString &text);
@@ -60,19 +79,61 @@ public:
     /** Shows pending changes at once. */
     void flush() { m_changes.flush(); }
 
+signals:
+    /** Rows changed, ascending; \a aNamesChanged: more than their values. Comes before dataChanged(). */
+    void signalRowsChanged(const QVector<int> &aRows, bool aNamesChanged);
+    /** The user gave an object another name. */
+    void signalRenamed(int aType, int aId, const QString &aName);
+
 private slots:
     void slotRefresh();
 
 private:
-    static QVector<KvDeskValueRow> readRows();
-    static void readObject(const ZtGsManipulator &manipulator, const KvDeskObjectId &object,
-                           const ZtKernelObjectData *data, QVector<KvDeskValueRow> *rows);
-    bool hasSameValues(const QVector<KvDeskValueRow> &rows) const;
-    void setRows(QVector<KvDeskValueRow> rows);
-    QString text(const KvDeskValueRow &row, int column) const;
+    struct Object
+    {
+        KvDeskObjectId id;
+        int firstRow = 0;
+        QString name;
+        mutable std::optional<QCollatorSortKey> sortKey;
+    };
+    using Rows = std::vector<KvDeskValueRow>;
+    using Objects = std::vector<Object>;
+
+    /** What a batch means to the objects of the table. */
+    struct Moves
+    {
+        QVector<KvDeskObjectId> came;
+        QVector<KvDeskObjectId> went;
+        QVector<KvDeskObjectId> changed;
+    };
+
+    void reset();
+    void readAgain();
+    static void readAll(Objects *objects, Rows *rows);
+    static void readObject(Object *object, Rows *rows);
+    bool sortOut(const KvDeskObjectChanges::Batch &batch, Moves *moves) const;
+    bool isInStep(const Moves &moves) const;
+    void addDependent(const QSet<KvDeskObjectId> &touched, Moves *moves) const;
+    void apply(const Moves &moves);
+    void insertObject(const KvDeskObjectId &id);
+    void removeObject(const KvDeskObjectId &id);
+    void changeObjects(const QVector<KvDeskObjectId> &ids);
+    void reshapeObject(std::size_t index);
+    bool rename(std::size_t index, const QString &name);
+    bool hasRows(std::size_t index, const Rows &rows) const;
+    void replaceRows(std::size_t index, Rows rows);
+    void shiftRows(std::size_t fromObject, int count);
+    void announceRows(const QVector<int> &rows, bool namesChanged);
+    std::size_t lowerBound(const KvDeskObjectId &id) const;
+    bool isKnown(const KvDeskObjectId &id) const;
+    int knownCount(int type) const;
+    Range rowsAt(std::size_t object) const;
+    const QCollatorSortKey &sortKey(int row, int column) const;
 
     KvDeskObjectChanges m_changes;
-    QVector<KvDeskValueRow> m_rows;
-    QStringList m_units;
-    QString m_longestNumber;
+    Objects m_objects; ///< ascending
+    Rows m_rows;
+    QCollator m_collator;
+    mutable QHash<QPair<int, int>, QCollatorSortKey> m_nameKeys; ///< of values, by type and position
+    mutable QHash<int, QCollatorSortKey> m_typeKeys;
 };

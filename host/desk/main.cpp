@@ -4,6 +4,7 @@
 #include "KvDeskLanguages.h"
 #include "KvDeskMainWindow.h"
 #include "KvDeskPlugins.h"
+#include "KvDeskRecoveryFile.h"
 #include "KvDeskResources.h"
 #include "KvDeskTheme.h"
 #include "KvDeskTranslation.h"
@@ -58,6 +59,7 @@ int run(const KvDeskCommandLine &commandLine)
     plugins.load(KvDeskPlugins::folders(commandLine.pluginFolders()));
     window.restoreTools();
     QObject::connect(&window, SIGNAL(signalClosed()), qApp, SLOT(quit()));
+    window.startRecovery(KvDeskRecoveryFile::standardFolder());
     window.show();
     openFiles(commandLine, window.files());
     return QApplication::exec();

@@ -171,6 +171,20 @@ bool ZtAppSettings::contains(const QString &key)
     return self->m_values.contains(self->fullKey(key));
 }
 
+QStringList ZtAppSettings::childKeys()
+{
+    ZtAppSettings *const self = getInstance();
+    self->ensureLoaded();
+    const QString base = self->prefix();
+    QStringList keys;
+    for (auto it = self->m_values.constBegin(); it != self->m_values.constEnd(); ++it) {
+        if (it.key().startsWith(base) && it.key().indexOf(QLatin1Char('/'), base.size()) < 0)
+            keys.append(it.key().mid(base.size()));
+    }
+    keys.sort();
+    return keys;
+}
+
 void ZtAppSettings::remove(const QString &key)
 {
     ZtAppSettings *const self = getInstance();

@@ -47,6 +47,8 @@ public:
     /** Stores a value; a real change is announced by signalValuesModified() once no group is open. */
     static void setValue(const QString &key, const QVariant &value);
     static bool contains(const QString &key);
+    /** Keys of the values that lie directly in the open group, sorted. */
+    static QStringList childKeys();
     /** Removes a value and the group of the same name; an empty \a key empties the open group. */
     static void remove(const QString &key);
 

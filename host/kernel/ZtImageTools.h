@@ -15,7 +15,8 @@ public:
     static ZtImageTools *getInstance();
 
     /**
-     * Draws the objects of ZtKernelData onto \a image.
+     * Draws the objects of ZtKernelData onto \a image, as the application shows them. On large pictures lines
+     * and texts are wider, so that they can still be seen when the picture is shown or printed as a whole.
      * \param transform from scene coordinates to the image's pixels
      * \param types     the object types to draw; empty means all
      */

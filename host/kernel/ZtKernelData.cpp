@@ -100,7 +100,12 @@ int ZtKernelData::addObject(int type, std::unique_ptr<ZtKernelObjectData> object
         removeObject(type, id);
 
     ZtKernelObjectData *const added = object.release();
-    m_objects[type].insert(id, added);
+    ZtObjectMap &objects = m_objects[type];
+    // Many objects mostly come in the order of their ids: then there is no place to look for.
+    if (objects.isEmpty() || objects.lastKey() < id)
+        objects.insert(objects.constEnd(), id, added);
+    else
+        objects.insert(id, added);
     if (m_blockers == 0)
         emit ZtSignalCenter::getInstance()->signalObjectCreated(type, id, added);
     return id;

@@ -9,6 +9,7 @@
 #include <memory>
 
 class iZTKernelImage;
+class iZTObjectPainter;
 class ZtGsManipulator;
 class ZtKernelObjectData;
 class ZtKernelObjectDataDescr;
@@ -40,6 +41,11 @@ public:
     iZTKernelImage *kernelImage() const { return m_image; }
     /** Installs the image; not owned, and forgotten by the caller with null before it dies. */
     void setKernelImage(iZTKernelImage *image) { m_image = image; }
+
+    /** Draws all objects at once, or null: then every manipulator draws its own. */
+    const iZTObjectPainter *objectPainter() const { return m_objectPainter; }
+    /** Installs the painter; not owned, and forgotten by the caller with null before it dies. */
+    void setObjectPainter(const iZTObjectPainter *painter) { m_objectPainter = painter; }
 
     /** Makes a type known, replacing what was registered under its id. Either pointer may be null. */
     void registerType(int type, std::unique_ptr<ZtGsManipulator> manipulator,
@@ -79,5 +85,6 @@ private:
     std::map<int, std::unique_ptr<ZtGsManipulator>> m_manipulators;
     std::map<int, std::unique_ptr<ZtKernelObjectDataDescr>> m_descriptors;
     iZTKernelImage *m_image = nullptr;
+    const iZTObjectPainter *m_objectPainter = nullptr;
     int m_blockers = 0;
 };

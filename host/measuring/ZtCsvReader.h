@@ -9,6 +9,8 @@
 #include <string_view>
 #include <vector>
 
+class ZtProgress;
+
 /** One row of a table; its fields point into the reader's text and into the row itself. */
 struct ZtCsvRow
 {
@@ -29,6 +31,10 @@ public:
     /** \a text has to outlive the reader. */
     ZtCsvReader(std::string_view text, char separator);
 
+    /** Rows are counted for \a progress from now on; reading ends with a fault when it is cancelled. */
+    void setProgress(ZtProgress *progress) { m_progress = progress; }
+    ZtProgress *progress() const { return m_progress; }
+
     /** Goes back to the first row. */
     void rewind();
 
@@ -39,6 +45,7 @@ public:
     char separator() const { return m_separator; }
 
 private:
+    bool goOn();
     bool readRow(ZtCsvRow *row);
     bool readField(ZtCsvRow *row);
     bool readQuotedField(ZtCsvRow *row);
@@ -52,5 +59,7 @@ private:
     char m_separator;
     std::size_t m_position = 0;
     int m_line = 1;
+    ZtProgress *m_progress = nullptr;
+    qint64 m_rowsUntilLook = 0;
     ZtFault m_fault;
 };

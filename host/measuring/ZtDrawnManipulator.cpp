@@ -66,15 +66,16 @@ double ZtDrawnManipulator::inBaseUnits(const ZtDrawnValue &definition, const ZtD
 {
     if (!definition.measure)
         return countShare(object);
-    const double measured = definition.measure(object.points());
     const double factor = m_calibration->factor();
     switch (definition.kind) {
     case ZtGsManipulator::Length:
-        return measured * factor;
+        return definition.measure(m_calibration->toPlane(object.points())) * factor;
     case ZtGsManipulator::Area:
-        return measured * factor * factor;
+        return definition.measure(m_calibration->toPlane(object.points())) * factor * factor;
+    case ZtGsManipulator::Angle:
+        return definition.measure(m_calibration->toPlane(object.points()));
     default:
-        return measured;
+        return definition.measure(object.points());
     }
 }
 
@@ -114,30 +115,69 @@ QString ZtDrawnManipulator::valueText(const QString &valueName, const ZtKernelOb
 
 QString ZtDrawnManipulator::lengthText(const ZtDrawnObjectData &object) const
 {
-    const double length = ZtGeometry::pathLength(object.points()) * m_calibration->factor();
+    const double length =
+        ZtGeometry::pathLength(m_calibration->toPlane(object.points())) * m_calibration->factor();
     return m_calibration->isCalibrated() ? ZtMeasureFormat::drawnText(length, Length)
                                          : ZtMeasureFormat::pixelText(length, 1);
 }
 
-QString ZtDrawnManipulator::label(int id, const ZtDrawnObjectData &object) const
+QString ZtDrawnManipulator::firstValueText(const ZtDrawnObjectData &object) const
 {
-    if (m_type.id == ZtDrawnType::TextNote)
-        return object.text();
-    if (m_type.id == ZtDrawnType::ScaleBar)
-        return lengthText(object);
-    return getObjectName(id);
+    const QStringList names = getValueNames();
+    for (int i = 0; i < names.size(); ++i) {
+        if (isValueShown(object, i))
+            return valueText(names.at(i), &object);
+    }
+    return QString();
 }
 
-void ZtDrawnManipulator::draw(QPainter *painter, int id, const ZtKernelObjectData *object) const
+QString ZtDrawnManipulator::labelText(int id, const ZtKernelObjectData *object) const
+{
+    if (!object || !m_type.acceptsPoints(drawn(object).points()))
+        return QString();
+    if (m_type.id == ZtDrawnType::TextNote)
+        return drawn(object).text();
+    if (m_type.id == ZtDrawnType::ScaleBar)
+        return lengthText(drawn(object));
+    const QString name = getObjectName(id);
+    const QString value = firstValueText(drawn(object));
+    return value.isEmpty() ? name : name + QStringLiteral("  ") + value;
+}
+
+QPainterPath ZtDrawnManipulator::outline(const QPolygonF &points) const
+{
+    if (!m_type.outline)
+        return QPainterPath();
+    const QPainterPath inPlane = m_type.outline(m_calibration->toPlane(points));
+    return m_calibration->isSquare() ? inPlane
+                                     : QTransform::fromScale(1.0, 1.0 / m_calibration->aspect()).map(inPlane);
+}
+
+QPainterPath ZtDrawnManipulator::outlineOf(const ZtDrawnType &type, const QPolygonF &points)
+{
+    const auto *const manipulator =
+        dynamic_cast<const ZtDrawnManipulator *>(ZtKernelData::getInstance()->getGsManipulator(type.id));
+    if (manipulator)
+        return manipulator->outline(points);
+    return type.outline ? type.outline(points) : QPainterPath();
+}
+
+void ZtDrawnManipulator::drawShape(QPainter *painter, const ZtKernelObjectData *object) const
 {
     if (!object || !m_type.acceptsPoints(drawn(object).points()))
         return;
     const QPolygonF &points = drawn(object).points();
     const ZtDrawnObjectPainter objectPainter(painter);
     if (m_type.outline)
-        objectPainter.drawOutline(m_type.outline(points));
+        objectPainter.drawOutline(outline(points));
     if (m_type.id == ZtDrawnType::Counter)
         objectPainter.drawMarkers(points);
-    if (!points.isEmpty())
-        objectPainter.drawLabel(points.first(), label(id, drawn(object)));
+}
+
+void ZtDrawnManipulator::draw(QPainter *painter, int id, const ZtKernelObjectData *object) const
+{
+    drawShape(painter, object);
+    const QString text = labelText(id, object);
+    if (!text.isEmpty() && !drawn(object).points().isEmpty())
+        ZtDrawnObjectPainter(painter).drawLabel(drawn(object).points().first(), text);
 }

@@ -5,6 +5,7 @@
 
 #include <memory>
 
+class QPainterPath;
 class ZtCalibration;
 class ZtDrawnObjectData;
 struct ZtDrawnType;
@@ -26,7 +27,20 @@ public:
     QString valueText(const QString &valueName, const ZtKernelObjectData *object) const override;
     void draw(QPainter *painter, int id, const ZtKernelObjectData *object) const override;
 
+    /** As draw(), without the label. */
+    void drawShape(QPainter *painter, const ZtKernelObjectData *object) const;
+    /** What the object's label reads: its name and the first value that is shown; of types without values
+     * what they are there for. May be empty. */
+    QString labelText(int id, const ZtKernelObjectData *object) const;
+
     const ZtDrawnType &type() const { return m_type; }
+
+    /** The lines of an object with these points, in image pixels: a circle is one in reality, and an ellipse
+     * on an image whose pixels are not square. Empty for types without lines. */
+    QPainterPath outline(const QPolygonF &points) const;
+    /** The same by the manipulator that is registered for the type; with square pixels where there is none.
+     */
+    static QPainterPath outlineOf(const ZtDrawnType &type, const QPolygonF &points);
 
     /** Fetches the names again after the language changed. */
     void retranslate();
@@ -35,7 +49,7 @@ private:
     bool measure(const QString &valueName, const ZtKernelObjectData *object, double *baseValue,
                  const ZtDrawnValue **definition) const;
     double inBaseUnits(const ZtDrawnValue &definition, const ZtDrawnObjectData &object) const;
-    QString label(int id, const ZtDrawnObjectData &object) const;
+    QString firstValueText(const ZtDrawnObjectData &object) const;
     QString lengthText(const ZtDrawnObjectData &object) const;
 
     const ZtDrawnType &m_type;

@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtDrawnObjectPainter.h"
 
+#include "measuring/ZtLabelLayout.h"
+
 #include <QFontMetricsF>
+#include <QGuiApplication>
 #include <QPainter>
 #include <QPainterPath>
 
@@ -25,14 +28,11 @@ QPen linePen(const QColor &color, double width)
     return QPen(color, width, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin);
 }
 
-// The nearest place where a box can be seen; its upper left corner where it does not fit.
-QRectF movedInto(QRectF box, const QRectF &page)
+QFont labelFont()
 {
-    box.moveRight(qMin(box.right(), page.right()));
-    box.moveBottom(qMin(box.bottom(), page.bottom()));
-    box.moveLeft(qMax(box.left(), page.left()));
-    box.moveTop(qMax(box.top(), page.top()));
-    return box;
+    QFont font = QGuiApplication::font();
+    font.setPixelSize(labelPixelSize);
+    return font;
 }
 
 } // namespace
@@ -68,29 +68,43 @@ void ZtDrawnObjectPainter::strokeOnDevice(const QPainterPath &path) const
     m_painter->restore();
 }
 
+QRectF ZtDrawnObjectPainter::page(const QPainter &painter)
+{
+    const QPaintDevice *const device = painter.device();
+    // Pictures tell their size in pixels; all other devices, and the painter, count in larger units.
+    const bool isPicture = device->devType() == QInternal::Image || device->devType() == QInternal::Pixmap;
+    const double ratio = isPicture ? device->devicePixelRatioF() : 1.0;
+    return QRectF(QPointF(), QSizeF(device->width(), device->height()) / ratio);
+}
+
+QSizeF ZtDrawnObjectPainter::labelSize(const QString &text)
+{
+    const QSizeF size = QFontMetricsF(labelFont()).size(0, text);
+    return size + QSizeF(2.0 * labelPadding, 2.0 * labelPadding);
+}
+
 void ZtDrawnObjectPainter::drawLabel(const QPointF &anchor, const QString &text) const
 {
     if (text.isEmpty())
         return;
-    const QPointF corner = m_painter->worldTransform().map(anchor) + QPointF(labelOffset, -labelOffset);
+    const QPointF place = m_painter->worldTransform().map(anchor);
+    QRectF box(QPointF(), labelSize(text));
+    box.moveBottomLeft(place + QPointF(labelOffset - labelPadding, labelPadding - labelOffset));
+    const QRectF page = ZtDrawnObjectPainter::page(*m_painter);
+    drawLabelBox(page.contains(place) ? ZtLabelLayout::movedInto(box, page) : box, text);
+}
+
+void ZtDrawnObjectPainter::drawLabelBox(const QRectF &box, const QString &text) const
+{
     m_painter->save();
-    QFont font = m_painter->font();
-    font.setPixelSize(labelPixelSize);
-    m_painter->setFont(font);
-    const QFontMetricsF metrics(font);
-    QRectF box(QPointF(), metrics.size(0, text));
-    box.moveBottomLeft(corner);
-    box.adjust(-labelPadding, -labelPadding, labelPadding, labelPadding);
-    const QRectF page = m_painter->window();
-    if (page.contains(m_painter->worldTransform().map(anchor)))
-        box = movedInto(box, page);
     m_painter->setWorldTransform(QTransform());
     m_painter->setRenderHint(QPainter::Antialiasing);
+    m_painter->setFont(labelFont());
     m_painter->setPen(Qt::NoPen);
     m_painter->setBrush(haloColor);
     m_painter->drawRoundedRect(box, labelPadding, labelPadding);
-    box.adjust(labelPadding, labelPadding, -labelPadding, -labelPadding);
     m_painter->setPen(labelColor);
-    m_painter->drawText(box, Qt::AlignLeft | Qt::TextDontClip, text);
+    const QRectF inside = box.adjusted(labelPadding, labelPadding, -labelPadding, -labelPadding);
+    m_painter->drawText(inside, Qt::AlignLeft | Qt::TextDontClip, text);
     m_painter->restore();
 }

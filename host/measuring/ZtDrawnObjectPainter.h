@@ -7,6 +7,8 @@ class QPainter;
 class QPainterPath;
 class QPointF;
 class QPolygonF;
+class QRectF;
+class QSizeF;
 class QString;
 
 /**
@@ -30,6 +32,14 @@ public:
     /** A text in a dark box, its lower left corner near \a anchor; moved so that it stays on the device when
      * \a anchor is on it. */
     void drawLabel(const QPointF &anchor, const QString &text) const;
+
+    /** What a painter can reach, in the coordinates that it has without a transform. */
+    static QRectF page(const QPainter &painter);
+
+    /** The size of a label's box on the device. */
+    static QSizeF labelSize(const QString &text);
+    /** A text in a dark box that lies at \a box on the device, whatever the transform. */
+    void drawLabelBox(const QRectF &box, const QString &text) const;
 
 private:
     void strokeOnDevice(const QPainterPath &path) const;

@@ -15,8 +15,8 @@ struct ZtDrawnValue
 {
     const char *name; ///< English name, also the key in files
     ZtGsManipulator::MeasureKind kind;
-    /** The value in pixels, square pixels, degrees or pieces; null for a share, which depends on other
-     * objects. */
+    /** The value in pixels, square pixels, degrees or pieces, of points in a plane with the same scale in
+     * both directions; null for a share, which depends on other objects. */
     double (*measure)(const QPolygonF &points);
 };
 
@@ -49,7 +49,9 @@ struct ZT_MEASURING_EXPORT ZtDrawnType
     int minimumPoints;
     int maximumPoints; ///< unlimitedPoints for as many as the user draws
     std::vector<ZtDrawnValue> values;
-    QPainterPath (*outline)(const QPolygonF &points); ///< in scene coordinates; null for types without lines
+    /** The lines of an object in the plane of its points; null for types without lines. On the image it is
+     * ZtDrawnManipulator::outline(). */
+    QPainterPath (*outline)(const QPolygonF &points);
 
     static constexpr int unlimitedPoints = 1000000;
     /** Coordinates beyond this are no image pixels, and their products would lose all digits. */

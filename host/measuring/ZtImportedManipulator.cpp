@@ -57,5 +57,6 @@ QVariant ZtImportedManipulator::value(const QString &valueName, const ZtKernelOb
 QString ZtImportedManipulator::valueText(const QString &valueName, const ZtKernelObjectData *object) const
 {
     const ZtImportedCell *found = cell(valueName, object);
-    return found ? ZtMeasureFormat::importedText(found->value, m_type->unit(*found), found->text) : QString();
+    return found ? ZtMeasureFormat::importedText(found->value, m_type->unit(*found), m_type->text(*found))
+                 : QString();
 }

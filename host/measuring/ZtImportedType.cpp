@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtImportedType.h"
 
+#include "measuring/ZtMeasureFormat.h"
+
 #include <algorithm>
 
 QStringList ZtImportedType::valueNames() const
@@ -41,6 +43,15 @@ const ZtImportedCell *ZtImportedType::cell(int row, int valueIndex) const
 
 QString ZtImportedType::numberText(const ZtImportedCell &cell) const
 {
-    const int unitSize = unit(cell).text().size();
-    return unitSize == 0 ? cell.text : cell.text.left(cell.text.size() - unitSize - 1);
+    const std::string_view written = number(cell);
+    return QString::fromLatin1(written.data(), static_cast<int>(written.size()));
+}
+
+QString ZtImportedType::text(const ZtImportedCell &cell) const
+{
+    m_texts.resize(m_cells.size());
+    QString &text = m_texts[static_cast<std::size_t>(&cell - m_cells.data())];
+    if (text.isNull())
+        text = ZtMeasureFormat::withUnit(numberText(cell), unit(cell).text());
+    return text;
 }

@@ -8,6 +8,8 @@
 #include <QStringList>
 #include <QVector>
 
+#include <string>
+#include <string_view>
 #include <vector>
 
 /** A value that the objects of an imported type may have. */
@@ -20,8 +22,9 @@ struct ZtImportedValue
 /** One number of a table. */
 struct ZtImportedCell
 {
-    double value = 0.0; ///< in base units
-    QString text;       ///< number as written in the table, blank, unit
+    double value = 0.0;    ///< in base units
+    quint32 textStart = 0; ///< where the number as written begins among the type's texts
+    quint32 textSize = 0;
     int valueIndex = 0; ///< position in ZtImportedType::values()
     int unitIndex =
         0; ///< position in the type's units; a table may give one value in mm here and in cm there
@@ -60,8 +63,15 @@ public:
 
     /** The unit in which a cell was written. */
     const ZtUnit &unit(const ZtImportedCell &cell) const { return m_units.at(cell.unitIndex); }
-    /** The number of a cell as written, without its unit. */
+    /** The number of a cell as written with a decimal point, without its unit. */
+    std::string_view number(const ZtImportedCell &cell) const
+    {
+        return std::string_view(m_numbers).substr(cell.textStart, cell.textSize);
+    }
     QString numberText(const ZtImportedCell &cell) const;
+    /** Number as written, blank, unit. Made once: reports ask again and again, but not for all cells. GUI
+     * thread only. */
+    QString text(const ZtImportedCell &cell) const;
 
 private:
     friend class ZtImportedTypeBuilder;
@@ -73,4 +83,6 @@ private:
     QVector<QString> m_rowNames;
     std::vector<std::size_t> m_rowStarts; ///< one more than rows: where each row's cells begin
     std::vector<ZtImportedCell> m_cells;
+    std::string m_numbers; ///< as written, one after another: a text for each would take most of the time
+    mutable std::vector<QString> m_texts; ///< of the cells that were asked for; empty before the first one
 };

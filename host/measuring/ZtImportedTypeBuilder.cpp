@@ -3,7 +3,6 @@
 
 #include "kernel/ZtGsManipulator.h"
 #include "measuring/ZtFault.h"
-#include "measuring/ZtMeasureFormat.h"
 
 #include <QCoreApplication>
 
@@ -59,7 +58,7 @@ int ZtImportedTypeBuilder::unitIndex(const ZtUnit &unit)
     return m_type->m_units.size() - 1;
 }
 
-bool ZtImportedTypeBuilder::addCell(int row, int valueIndex, double number, const QString &numberText,
+bool ZtImportedTypeBuilder::addCell(int row, int valueIndex, double number, std::string_view numberText,
                                     const ZtUnit &unit, const ZtTablePlace &place)
 {
     if (!m_hasUnit.at(valueIndex)) {
@@ -70,7 +69,9 @@ bool ZtImportedTypeBuilder::addCell(int row, int valueIndex, double number, cons
         return false;
     ZtImportedCell cell;
     cell.value = unit.toBase(number);
-    cell.text = ZtMeasureFormat::withUnit(numberText, unit.text());
+    cell.textStart = static_cast<quint32>(m_type->m_numbers.size());
+    cell.textSize = static_cast<quint32>(numberText.size());
+    m_type->m_numbers.append(numberText);
     cell.valueIndex = valueIndex;
     cell.unitIndex = unitIndex(unit);
     m_entries.push_back({row, place, std::move(cell)});

@@ -37,11 +37,11 @@ public:
 
     /**
      * Adds a number, which is finite in base units.
-     * \param numberText the number as written, with a decimal point
+     * \param numberText the number as written, in ASCII with a decimal point
      * \param place      where the file has it, for later faults
      * \return false when \a unit does not fit the unit of this value
      */
-    bool addCell(int row, int valueIndex, double number, const QString &numberText, const ZtUnit &unit,
+    bool addCell(int row, int valueIndex, double number, std::string_view numberText, const ZtUnit &unit,
                  const ZtTablePlace &place = ZtTablePlace());
 
     /** The finished type; null, with message and place in \a fault, when a row has the same value twice. */

@@ -10,6 +10,8 @@
 #include "measuring/ZtImportedManipulator.h"
 #include "measuring/ZtImportedObjectData.h"
 #include "measuring/ZtKernelImage.h"
+#include "measuring/ZtLoadedSession.h"
+#include "measuring/ZtObjectsPainter.h"
 #include "measuring/ZtSession.h"
 #include "measuring/ZtStillImageSource.h"
 #include "measuring/ZtTableImport.h"
@@ -25,14 +27,6 @@ ZtKernelData *kernel()
 const ZtImportedManipulator *importedManipulator(int typeId)
 {
     return static_cast<const ZtImportedManipulator *>(kernel()->getGsManipulator(typeId));
-}
-
-// The name that the user or a table gave an object; empty for the name that it has by itself.
-QString ownName(const ZtGsManipulator &manipulator, int id)
-{
-    const QString name = manipulator.getObjectName(id);
-    const QString standard = manipulator.objectTypeName(id) + QLatin1Char(' ') + QString::number(id);
-    return name == standard ? QString() : name;
 }
 
 void hideValues(int typeId, int id, const QVector<int> &positions)
@@ -59,25 +53,11 @@ ZtSessionObject toSessionObject(const ZtDrawnType &type, int id, const ZtKernelO
     ZtSessionObject object;
     object.type = &type;
     object.id = id;
-    object.name = ownName(*kernel()->getGsManipulator(type.id), id);
+    object.name = static_cast<ZtMeasuringManipulator *>(kernel()->getGsManipulator(type.id))->ownName(id);
     object.text = drawn->text();
     object.points = drawn->points();
     object.hiddenValues = drawn->hiddenValues();
     return object;
-}
-
-ZtSessionTable toSessionTable(int typeId)
-{
-    const ZtImportedManipulator *manipulator = importedManipulator(typeId);
-    ZtSessionTable table;
-    table.type = manipulator->sharedType();
-    const ZtObjectMap objects = kernel()->objects().value(typeId);
-    table.rows.reserve(objects.size());
-    for (auto it = objects.constBegin(); it != objects.constEnd(); ++it) {
-        const auto *object = static_cast<const ZtImportedObjectData *>(it.value());
-        table.rows.append({it.key(), object->row(), ownName(*manipulator, it.key()), object->hiddenValues()});
-    }
-    return table;
 }
 
 } // namespace
@@ -86,17 +66,21 @@ ZtMeasuringDocument::ZtMeasuringDocument(QObject *parent)
     : QObject(parent)
     , m_calibration(std::make_shared<ZtCalibration>())
     , m_kernelImage(std::make_unique<ZtKernelImage>())
+    , m_objectsPainter(std::make_unique<ZtObjectsPainter>(m_calibration))
 {
     // From now on changed unit settings are announced.
     ZtUnitSettings::getInstance();
     registerTypes();
     kernel()->setKernelImage(m_kernelImage.get());
+    kernel()->setObjectPainter(m_objectsPainter.get());
 }
 
 ZtMeasuringDocument::~ZtMeasuringDocument()
 {
     if (kernel()->kernelImage() == m_kernelImage.get())
         kernel()->setKernelImage(nullptr);
+    if (kernel()->objectPainter() == m_objectsPainter.get())
+        kernel()->setObjectPainter(nullptr);
     removeImportedTypes();
     for (const ZtDrawnType &type : ZtDrawnType::all())
         kernel()->unregisterType(type.id);
@@ -150,9 +134,11 @@ void ZtMeasuringDocument::setCalibration(const ZtCalibration &calibration)
 {
     if (calibration == *m_calibration)
         return;
+    const bool isSameSize = calibration.hasSamePixelSize(*m_calibration);
     *m_calibration = calibration;
     emit signalCalibrationChanged();
-    emit ZtSignalCenter::getInstance()->signalLengthUnitChanged();
+    if (!isSameSize)
+        emit ZtSignalCenter::getInstance()->signalLengthUnitChanged();
 }
 
 bool ZtMeasuringDocument::loadImage(const QString &path, ZtFault *fault)
@@ -160,11 +146,11 @@ bool ZtMeasuringDocument::loadImage(const QString &path, ZtFault *fault)
     std::unique_ptr<ZtStillImageSource> source = ZtStillImageSource::load(path, fault);
     if (!source)
         return false;
-    useImage(std::move(source));
+    showImage(std::move(source));
     return true;
 }
 
-void ZtMeasuringDocument::useImage(std::unique_ptr<ZtStillImageSource> source)
+void ZtMeasuringDocument::showImage(std::unique_ptr<ZtStillImageSource> source)
 {
     const QString path = source->path();
     const ZtCalibration offered = source->offeredCalibration();
@@ -213,7 +199,9 @@ bool ZtMeasuringDocument::importTable(const QString &path, const ZtTableImportOp
     ZtImportedTable table;
     if (!ZtTableImport::readFile(path, options, &table, fault))
         return false;
-    addImported(table, notes);
+    if (notes)
+        *notes = table.notes;
+    addTable(table);
     return true;
 }
 
@@ -223,14 +211,14 @@ bool ZtMeasuringDocument::importTable(QIODevice *device, const QString &fileName
     ZtImportedTable table;
     if (!ZtTableImport::readDevice(device, fileName, options, &table, fault))
         return false;
-    addImported(table, notes);
+    if (notes)
+        *notes = table.notes;
+    addTable(table);
     return true;
 }
 
-void ZtMeasuringDocument::addImported(const ZtImportedTable &table, QStringList *notes)
+void ZtMeasuringDocument::addTable(const ZtImportedTable &table)
 {
-    if (notes)
-        *notes = table.notes;
     m_importedTypes += ZtTableImport::apply(table);
 }
 
@@ -250,6 +238,14 @@ std::optional<ZtUnit> ZtMeasuringDocument::importedUnit(const QString &typeName,
 
 ZtSession ZtMeasuringDocument::toSession() const
 {
+    ZtSession session = toSessionWithoutTables();
+    for (const int id : m_importedTypes)
+        session.tables.append(toSessionTable(id));
+    return session;
+}
+
+ZtSession ZtMeasuringDocument::toSessionWithoutTables() const
+{
     ZtSession session;
     session.imagePath = m_imagePath;
     session.calibration = *m_calibration;
@@ -258,9 +254,21 @@ ZtSession ZtMeasuringDocument::toSession() const
         for (auto it = objects.constBegin(); it != objects.constEnd(); ++it)
             session.objects.append(toSessionObject(type, it.key(), it.value()));
     }
-    for (const int id : m_importedTypes)
-        session.tables.append(toSessionTable(id));
     return session;
+}
+
+ZtSessionTable ZtMeasuringDocument::toSessionTable(int importedType) const
+{
+    const ZtImportedManipulator *manipulator = importedManipulator(importedType);
+    ZtSessionTable table;
+    table.type = manipulator->sharedType();
+    const ZtObjectMap objects = kernel()->objects().value(importedType);
+    table.rows.reserve(objects.size());
+    for (auto it = objects.constBegin(); it != objects.constEnd(); ++it) {
+        const auto *object = static_cast<const ZtImportedObjectData *>(it.value());
+        table.rows.append({it.key(), object->row(), manipulator->ownName(it.key()), object->hiddenValues()});
+    }
+    return table;
 }
 
 bool ZtMeasuringDocument::saveSession(const QString &path, ZtFault *fault) const
@@ -270,24 +278,24 @@ bool ZtMeasuringDocument::saveSession(const QString &path, ZtFault *fault) const
 
 bool ZtMeasuringDocument::loadSession(const QString &path, ZtFault *fault, MissingImage missingImage)
 {
-    ZtSession session;
-    if (!ZtSession::load(path, &session, fault))
+    ZtLoadedSession loaded;
+    if (!loaded.read(path, fault))
         return false;
-    std::unique_ptr<ZtStillImageSource> image;
-    if (!session.imagePath.isEmpty()) {
-        ZtFault imageFault;
-        image = ZtStillImageSource::load(session.imagePath, &imageFault);
-        if (!image && missingImage == MissingImage::IsFault) {
-            *fault = {path, 0, 0, QStringLiteral("image"), imageFault.text()};
-            return false;
-        }
+    if (!loaded.imageFault.isNull() && missingImage == MissingImage::IsFault) {
+        *fault = {path, 0, 0, QStringLiteral("image"), loaded.imageFault.text()};
+        return false;
     }
-    clear();
-    if (image)
-        useImage(std::move(image));
-    m_imagePath = session.imagePath;
-    apply(session);
+    setSession(&loaded);
     return true;
+}
+
+void ZtMeasuringDocument::setSession(ZtLoadedSession *loaded)
+{
+    clear();
+    if (loaded->image)
+        showImage(std::move(loaded->image));
+    m_imagePath = loaded->session.imagePath;
+    apply(loaded->session);
 }
 
 void ZtMeasuringDocument::apply(const ZtSession &session)

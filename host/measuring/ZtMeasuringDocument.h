@@ -17,9 +17,12 @@
 class QIODevice;
 class ZtFrameSource;
 class ZtKernelImage;
+class ZtObjectsPainter;
 class ZtStillImageSource;
 struct ZtImportedTable;
+struct ZtLoadedSession;
 struct ZtSession;
+struct ZtSessionTable;
 
 /**
  * What a measuring application works on: the image, its calibration, and the objects in ZtKernelData.
@@ -41,14 +44,16 @@ public:
     void clear();
 
     const ZtCalibration &calibration() const { return *m_calibration; }
-    /** Changes the measured values of all drawn objects, which is announced as a change of the length unit.
-     */
+    /** Another pixel size changes the measured values of all drawn objects, which is announced as a change of
+     * the length unit. */
     void setCalibration(const ZtCalibration &calibration);
 
     /** Absolute path of the image file; empty when there is none. */
     QString imagePath() const { return m_imagePath; }
     /** Shows an image file. The calibration stays; what the file says about it is in offeredCalibration(). */
     bool loadImage(const QString &path, ZtFault *fault);
+    /** Shows an image file that was read already. */
+    void showImage(std::unique_ptr<ZtStillImageSource> source);
     /** The pixel size that the image file states; uncalibrated when it states none. */
     ZtCalibration offeredCalibration() const { return m_offered; }
 
@@ -56,6 +61,9 @@ public:
     /** Takes frames from another source, such as a camera, or from none. */
     void setFrameSource(std::unique_ptr<ZtFrameSource> source);
     ZtKernelImage *kernelImage() const { return m_kernelImage.get(); }
+
+    /** Draws all objects with their labels, on pictures as on the screen. */
+    ZtObjectsPainter *objectsPainter() const { return m_objectsPainter.get(); }
 
     /**
      * Draws an object and returns its id: the next free one of its type, or \a id, then in place of the
@@ -74,6 +82,8 @@ public:
                      QStringList *notes = nullptr);
     bool importTable(QIODevice *device, const QString &fileName, const ZtTableImportOptions &options,
                      ZtFault *fault, QStringList *notes = nullptr);
+    /** Adds the objects of a table that was read already. */
+    void addTable(const ZtImportedTable &table);
     /** Ids of the types that tables brought, in ascending order. */
     const QVector<int> &importedTypes() const { return m_importedTypes; }
 
@@ -86,7 +96,14 @@ public:
     /** Replaces everything by a session's contents. An image that is missing can be ignored; its path is
      * kept. */
     bool loadSession(const QString &path, ZtFault *fault, MissingImage missingImage = MissingImage::IsFault);
+    /** Replaces everything by a session that was read already; takes its image. */
+    void setSession(ZtLoadedSession *loaded);
     bool saveSession(const QString &path, ZtFault *fault) const;
+    /** Everything that a session file holds, as it is now. */
+    ZtSession toSession() const;
+    /** The same without the imported tables, and the table of one of importedTypes(). */
+    ZtSession toSessionWithoutTables() const;
+    ZtSessionTable toSessionTable(int importedType) const;
 
     /** Fetches the names of the built-in types again after the language changed. */
     void retranslate();
@@ -99,17 +116,15 @@ private:
     void registerTypes();
     void removeObjects();
     void removeImportedTypes();
-    void addImported(const ZtImportedTable &table, QStringList *notes);
-    void useImage(std::unique_ptr<ZtStillImageSource> source);
     void useSource(std::unique_ptr<ZtFrameSource> source, const QString &imagePath,
                    const ZtCalibration &offered);
-    ZtSession toSession() const;
     void apply(const ZtSession &session);
     void addSessionObjects(const ZtSession &session);
     void addSessionTables(const ZtSession &session);
 
     std::shared_ptr<ZtCalibration> m_calibration;
     std::unique_ptr<ZtKernelImage> m_kernelImage;
+    std::unique_ptr<ZtObjectsPainter> m_objectsPainter;
     std::unique_ptr<ZtFrameSource> m_source;
     QString m_imagePath;
     ZtCalibration m_offered;

@@ -42,6 +42,13 @@ QStringList ZtMeasuringManipulator::valueSet(int id) const
     return shown;
 }
 
+QString ZtMeasuringManipulator::ownName(int id) const
+{
+    const QString name = getObjectName(id);
+    const QString standard = objectTypeName(id) + QLatin1Char(' ') + QString::number(id);
+    return name == standard ? QString() : name;
+}
+
 void ZtMeasuringManipulator::setValueShown(ZtMeasuredObjectData *object, int position, bool shown)
 {
     object->m_hidden.removeAll(position);

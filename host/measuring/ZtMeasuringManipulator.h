@@ -23,6 +23,9 @@ public:
      * name. */
     int position(const QString &valueName) const { return m_positions.value(valueName, -1); }
 
+    /** The name that the user or a table gave an object; empty for the one that it has by itself. */
+    QString ownName(int id) const;
+
     /** Shows or hides a value of one object; announcing the change is up to the caller. */
     void setValueShown(ZtMeasuredObjectData *object, int position, bool shown);
     bool isValueShown(const ZtMeasuredObjectData &object, int position) const;

@@ -3,6 +3,8 @@
 
 #include "measuring/ZtBoundedRead.h"
 #include "measuring/ZtFault.h"
+#include "measuring/ZtProgress.h"
+#include "measuring/ZtSafeFile.h"
 #include "measuring/ZtSessionReader.h"
 #include "measuring/ZtSessionWriter.h"
 
@@ -10,7 +12,6 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QJsonDocument>
-#include <QSaveFile>
 
 namespace {
 
@@ -19,6 +20,10 @@ class Text
 {
     Q_DECLARE_TR_FUNCTIONS(ZtSession)
 };
+
+// How much of the time passes until the bytes are there, and until they are JSON.
+constexpr double readShare = 0.05;
+constexpr double jsonShare = 0.4;
 
 bool fail(const QString &message, ZtFault *fault)
 {
@@ -34,7 +39,12 @@ bool failParse(const QByteArray &bytes, const QJsonParseError &error, ZtFault *f
     return fail(Text::tr("The file is not valid JSON (%1)").arg(error.errorString()), fault);
 }
 
-bool readBytes(const QString &path, QByteArray *bytes, ZtFault *fault)
+bool failCancelled(ZtFault *fault)
+{
+    return fail(Text::tr("Reading was cancelled"), fault);
+}
+
+bool readBytes(const QString &path, QByteArray *bytes, ZtFault *fault, ZtProgress *progress)
 {
     QFile file(path);
     if (!QFileInfo::exists(path))
@@ -45,7 +55,9 @@ bool readBytes(const QString &path, QByteArray *bytes, ZtFault *fault)
         return fail(Text::tr("The file cannot be read (%1)").arg(file.errorString()), fault);
     if (file.size() > ZtSession::maximumBytes)
         return fail(Text::tr("The file is too large for a session"), fault);
-    *bytes = ztReadAtMost(&file, ZtSession::maximumBytes + 1);
+    *bytes = ztReadAtMost(&file, ZtSession::maximumBytes + 1, progress);
+    if (ZtProgress::isCancelled(progress))
+        return failCancelled(fault);
     if (bytes->size() > ZtSession::maximumBytes)
         return fail(Text::tr("The file is too large for a session"), fault);
     if (file.error() != QFileDevice::NoError)
@@ -55,15 +67,17 @@ bool readBytes(const QString &path, QByteArray *bytes, ZtFault *fault)
 
 } // namespace
 
-bool ZtSession::load(const QString &path, ZtSession *session, ZtFault *fault)
+bool ZtSession::load(const QString &path, ZtSession *session, ZtFault *fault, ZtProgress *progress)
 {
     *fault = ZtFault();
     fault->file = path;
     QByteArray bytes;
-    return readBytes(path, &bytes, fault) && parse(bytes, path, session, fault);
+    ZtProgress::setPart(progress, 0.0, readShare);
+    return readBytes(path, &bytes, fault, progress) && parse(bytes, path, session, fault, progress);
 }
 
-bool ZtSession::parse(const QByteArray &bytes, const QString &path, ZtSession *session, ZtFault *fault)
+bool ZtSession::parse(const QByteArray &bytes, const QString &path, ZtSession *session, ZtFault *fault,
+                      ZtProgress *progress)
 {
     *fault = ZtFault();
     fault->file = path;
@@ -75,7 +89,10 @@ bool ZtSession::parse(const QByteArray &bytes, const QString &path, ZtSession *s
         return failParse(bytes, error, fault);
     if (!document.isObject())
         return fail(Text::tr("The file is not a session"), fault);
-    ZtSessionReader reader(path);
+    if (ZtProgress::isCancelled(progress))
+        return failCancelled(fault);
+    ZtProgress::setPart(progress, jsonShare, 1.0);
+    ZtSessionReader reader(path, progress);
     if (reader.read(document.object(), session))
         return true;
     *fault = reader.fault();
@@ -85,16 +102,13 @@ bool ZtSession::parse(const QByteArray &bytes, const QString &path, ZtSession *s
 
 QByteArray ZtSession::toJson(const QString &path) const
 {
-    return QJsonDocument(ZtSessionWriter::toJson(*this, path)).toJson(QJsonDocument::Compact) + '\n';
+    return ZtSessionWriter::toJson(*this, path) + '\n';
 }
 
-bool ZtSession::save(const QString &path, ZtFault *fault) const
+bool ZtSession::save(const QString &path, ZtFault *fault, ZtProgress *progress) const
 {
-    *fault = ZtFault();
-    fault->file = path;
-    QSaveFile file(path);
+    ZtProgress::setPart(progress, 0.0, jsonShare);
     const QByteArray bytes = toJson(path);
-    if (file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() && file.commit())
-        return true;
-    return fail(Text::tr("The file cannot be written (%1)").arg(file.errorString()), fault);
+    ZtProgress::setPart(progress, jsonShare, 1.0);
+    return ZtSafeFile::write(path, bytes, fault, progress);
 }

@@ -9,6 +9,7 @@
 
 #include <memory>
 
+class ZtProgress;
 struct ZtDrawnType;
 struct ZtFault;
 
@@ -39,7 +40,12 @@ struct ZtSessionTable
     QVector<ZtSessionRow> rows;
 };
 
-/** What a session file holds: image, calibration, drawn objects and imported tables. */
+/**
+ * What a session file holds: image, calibration, drawn objects and imported tables.
+ *
+ * Copies share their contents, so that a snapshot costs little and can be written by another thread. What
+ * takes long ends with a fault when its progress is cancelled.
+ */
 struct ZT_MEASURING_EXPORT ZtSession
 {
     QString imagePath; ///< absolute; empty for a session without an image
@@ -48,12 +54,13 @@ struct ZT_MEASURING_EXPORT ZtSession
     QVector<ZtSessionTable> tables;
 
     /** Reads and checks a whole file; false with the first fault found, then \a session is untouched. */
-    static bool load(const QString &path, ZtSession *session, ZtFault *fault);
+    static bool load(const QString &path, ZtSession *session, ZtFault *fault, ZtProgress *progress = nullptr);
     /** As load(), from the bytes of a file \a path. */
-    static bool parse(const QByteArray &bytes, const QString &path, ZtSession *session, ZtFault *fault);
+    static bool parse(const QByteArray &bytes, const QString &path, ZtSession *session, ZtFault *fault,
+                      ZtProgress *progress = nullptr);
 
     /** Writes the file as a whole or not at all. */
-    bool save(const QString &path, ZtFault *fault) const;
+    bool save(const QString &path, ZtFault *fault, ZtProgress *progress = nullptr) const;
     /** The bytes of a file \a path: the image's path is stored relative to its folder. */
     QByteArray toJson(const QString &path) const;
 

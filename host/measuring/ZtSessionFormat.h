@@ -7,11 +7,13 @@
 namespace ZtSessionFormat {
 
 inline const QString formatName = QStringLiteral("statreport-session");
-constexpr int version = 1;
+constexpr int version = 2;      ///< that is written
+constexpr int firstVersion = 1; ///< that is read; gives square pixels by micrometresPerPixel alone
 
 inline const QString format = QStringLiteral("format");
 inline const QString versionKey = QStringLiteral("version");
 inline const QString image = QStringLiteral("image");
+inline const QString calibration = QStringLiteral("calibration");
 inline const QString micrometresPerPixel = QStringLiteral("micrometresPerPixel");
 inline const QString objects = QStringLiteral("objects");
 inline const QString tables = QStringLiteral("tables");

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtSessionReader.h"
 
+#include "measuring/ZtCalibrationJson.h"
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtImportedTypeBuilder.h"
+#include "measuring/ZtProgress.h"
 #include "measuring/ZtSessionFormat.h"
 #include "measuring/ZtTableNumber.h"
 
@@ -39,8 +41,9 @@ QStringList englishValueNames(const ZtDrawnType &type)
 
 } // namespace
 
-ZtSessionReader::ZtSessionReader(const QString &path)
+ZtSessionReader::ZtSessionReader(const QString &path, ZtProgress *progress)
     : m_path(path)
+    , m_progress(progress)
 {}
 
 bool ZtSessionReader::fail(const QString &place, const QString &message)
@@ -81,6 +84,11 @@ bool ZtSessionReader::readText(const QJsonObject &json, const QString &key, QStr
     return true;
 }
 
+bool ZtSessionReader::goOn(int done, int count)
+{
+    return ZtProgress::look(m_progress, done, count) || fail(QString(), tr("Reading was cancelled"));
+}
+
 bool ZtSessionReader::readId(const QJsonValue &json, int *id)
 {
     const double number = json.toDouble(0.0);
@@ -107,10 +115,17 @@ bool ZtSessionReader::readVersion(const QJsonObject &json)
     const QJsonValue version = json.value(Format::versionKey);
     if (!version.isDouble())
         return fail(Format::versionKey, tr("This must be a number"));
-    if (version.toDouble() != Format::version)
+    if (version.toDouble() > Format::version)
         return fail(Format::versionKey,
-                    tr("Sessions of version %1 are not known; this program reads version %2")
+                    tr("The session is of the newer version %1; this program reads versions up to %2")
                         .arg(version.toDouble())
+                        .arg(Format::version));
+    m_version = version.toInt();
+    if (m_version < Format::firstVersion)
+        return fail(Format::versionKey,
+                    tr("Sessions of version %1 are not known; this program reads versions %2 to %3")
+                        .arg(version.toDouble())
+                        .arg(Format::firstVersion)
                         .arg(Format::version));
     return true;
 }
@@ -126,6 +141,19 @@ bool ZtSessionReader::readImage(const QJsonObject &json, ZtSession *session)
 }
 
 bool ZtSessionReader::readCalibration(const QJsonObject &json, ZtSession *session)
+{
+    if (m_version == Format::firstVersion)
+        return readPixelSize(json, session);
+    const QJsonValue value = json.value(Format::calibration);
+    if (value.isUndefined())
+        return true;
+    if (!value.isObject())
+        return fail(Format::calibration, tr("This must be an object"));
+    return ZtCalibrationJson::read(value.toObject(), &session->calibration, &m_fault) ||
+           inside(Format::calibration);
+}
+
+bool ZtSessionReader::readPixelSize(const QJsonObject &json, ZtSession *session)
 {
     const QJsonValue value = json.value(Format::micrometresPerPixel);
     if (value.isUndefined())
@@ -144,7 +172,7 @@ bool ZtSessionReader::readObjects(const QJsonObject &json, ZtSession *session)
     QSet<QPair<int, int>> taken;
     for (int i = 0; i < array.size(); ++i) {
         ZtSessionObject object;
-        if (!readObject(array.at(i), &object))
+        if (!goOn(i, array.size()) || !readObject(array.at(i), &object))
             return inside(Format::objects, i);
         const QPair<int, int> key(object.type->id, object.id);
         if (taken.contains(key)) {
@@ -286,7 +314,7 @@ bool ZtSessionReader::readRows(const QJsonObject &json, ZtImportedTypeBuilder *b
     int lastId = 0;
     for (int i = 0; i < array.size(); ++i) {
         ZtSessionRow row;
-        if (!readRow(array.at(i).toArray(), builder, &row))
+        if (!goOn(i, array.size()) || !readRow(array.at(i).toArray(), builder, &row))
             return inside(Format::rows, i);
         if (row.id <= lastId) {
             fail(QStringLiteral("[0]"), tr("The numbers of the rows must rise"));
@@ -347,16 +375,17 @@ bool ZtSessionReader::readCell(const QJsonValue &json, ZtImportedTypeBuilder *bu
         return fail(QString(), tr("The table has no such value"));
     if (json.isNull())
         return true;
-    const QJsonArray pair = json.toArray();
+    const QJsonArray pair = json.isArray() ? json.toArray() : QJsonArray();
     const bool hasUnit = pair.size() == 2 && pair.at(1).isString();
     const QJsonValue text = hasUnit ? pair.at(0) : json;
     const ZtUnit unit = hasUnit ? ZtUnit::parse(pair.at(1).toString()) : builder->value(valueIndex).unit;
-    const QByteArray bytes = text.toString().toUtf8();
+    // Numbers are ASCII; any other character is replaced by one that no number has.
+    const QByteArray bytes = text.toString().toLatin1();
     const auto field = std::string_view(bytes.constData(), static_cast<std::size_t>(bytes.size()));
     const ZtTableNumber number = ZtTableNumber::read(field, false);
     if (number.kind != ZtTableNumber::Number || !std::isfinite(unit.toBase(number.value)))
         return fail(QString(), tr("This must be the text of a number"));
-    if (builder->addCell(row, valueIndex, number.value, ZtTableNumber::textOf(field, false), unit))
+    if (builder->addCell(row, valueIndex, number.value, ZtTableNumber::trimmed(field), unit))
         return true;
     return fail(QString(), tr("The unit does not fit that of the value"));
 }

@@ -10,6 +10,7 @@
 
 class QJsonArray;
 class ZtImportedTypeBuilder;
+class ZtProgress;
 
 /** Makes a session of JSON; every part is checked before the caller gets any of it. */
 class ZtSessionReader
@@ -17,7 +18,7 @@ class ZtSessionReader
     Q_DECLARE_TR_FUNCTIONS(ZtSession)
 public:
     /** \a path is the file that was read: relative image paths start in its folder. */
-    explicit ZtSessionReader(const QString &path);
+    explicit ZtSessionReader(const QString &path, ZtProgress *progress = nullptr);
 
     bool read(const QJsonObject &json, ZtSession *session);
     /** Place and message of what made read() fail. */
@@ -27,6 +28,7 @@ private:
     bool readVersion(const QJsonObject &json);
     bool readImage(const QJsonObject &json, ZtSession *session);
     bool readCalibration(const QJsonObject &json, ZtSession *session);
+    bool readPixelSize(const QJsonObject &json, ZtSession *session);
     bool readObjects(const QJsonObject &json, ZtSession *session);
     bool readObject(const QJsonValue &json, ZtSessionObject *object);
     bool readObjectType(const QJsonObject &json, ZtSessionObject *object);
@@ -40,6 +42,8 @@ private:
     bool readCell(const QJsonValue &json, ZtImportedTypeBuilder *builder, int row, int valueIndex);
     bool readHidden(const QJsonValue &json, const QStringList &names, QVector<int> *positions);
 
+    /** False, with a fault, when the file is not wanted any more. */
+    bool goOn(int done, int count);
     bool readId(const QJsonValue &json, int *id);
     bool readArray(const QJsonObject &json, const QString &key, QJsonArray *array);
     bool readText(const QJsonObject &json, const QString &key, QString *text);
@@ -49,6 +53,8 @@ private:
     bool inside(const QString &place, int index);
 
     QString m_path;
+    ZtProgress *m_progress;
+    int m_version = 0;        ///< of the file
     QStringList m_valueNames; ///< of the table that is being read
     ZtFault m_fault;
 };

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QJsonObject>
+#include <QByteArray>
 
 struct ZtSession;
 
@@ -10,5 +10,5 @@ class ZtSessionWriter
 {
 public:
     /** \a path is the file to write: the image's path is stored relative to its folder. */
-    static QJsonObject toJson(const ZtSession &session, const QString &path);
+    static QByteArray toJson(const ZtSession &session, const QString &path);
 };

@@ -3,6 +3,8 @@
 
 #include "measuring/ZtCalibration.h"
 #include "measuring/ZtFrameSource.h"
+#include "measuring/ZtPicture.h"
+#include "measuring/ZtPictureReader.h"
 
 #include <memory>
 
@@ -13,29 +15,38 @@ class ZT_MEASURING_EXPORT ZtStillImageSource : public ZtFrameSource
 {
     Q_OBJECT
 public:
-    /** Larger pictures are refused: their pixels would take more than 1.6 GB. */
-    static constexpr qint64 maximumPixels = 400LL * 1000 * 1000;
+    /** Larger pictures are refused. */
+    static constexpr qint64 maximumPixels = ZtPictureReader::maximumPixels;
 
-    /** Loads a picture of any format that Qt decodes, turned upright; null with a fault when it cannot be
-     * used. */
+    /** Loads a TIFF or a picture of any format that Qt decodes, turned upright; null with a fault when it
+     * cannot be used. */
     static std::unique_ptr<ZtStillImageSource> load(const QString &path, ZtFault *fault,
                                                     qint64 pixelLimit = maximumPixels);
 
-    QImage frame() const override { return m_image; }
+    QImage frame() const override { return m_picture.image; }
     QString displayName() const override;
 
     /** Absolute path of the file. */
     QString path() const { return m_path; }
 
-    /**
-     * The pixel size that the file states. Uncalibrated when it states none, another one per direction, or a
-     * resolution that programs write without meaning it (72, 96, 120, 144 and 192 dots per inch).
+    /** The bits that the grey values of the file take; frame() shows the upper eight. 8 for all other
+     * pictures.
      */
+    int greyBits() const { return m_picture.greyBits; }
+
+    /**
+     * The pixel size that the file states: by OME-XML, by ImageJ, by the resolution of the format. Unknown
+     * when it states none, or a resolution that programs write without meaning it (72, 96, 120, 144 and 192
+     * dots per inch).
+     */
+    ZtOfferedPixelSize offeredPixelSize() const { return m_picture.pixelSize; }
+
+    /** The same as a calibration that has the name of the file; uncalibrated when it states none. */
     ZtCalibration offeredCalibration() const;
 
 private:
-    ZtStillImageSource(const QString &path, const QImage &image);
+    ZtStillImageSource(const QString &path, const ZtPicture &picture);
 
     QString m_path;
-    QImage m_image;
+    ZtPicture m_picture;
 };

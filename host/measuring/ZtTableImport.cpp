@@ -9,6 +9,7 @@
 #include "measuring/ZtCsvReader.h"
 #include "measuring/ZtImportedManipulator.h"
 #include "measuring/ZtImportedObjectData.h"
+#include "measuring/ZtProgress.h"
 #include "measuring/ZtTableDialect.h"
 #include "measuring/ZtTableNumber.h"
 #include "measuring/ZtTextDecoder.h"
@@ -66,10 +67,12 @@ std::unique_ptr<ZtTableReader> makeReader(const ZtCsvRow &firstRow, ZtCsvReader 
 }
 
 bool readText(std::string_view text, const ZtTableImportOptions &options, ZtImportedTable *table,
-              ZtFault *fault)
+              ZtFault *fault, ZtProgress *progress)
 {
     const bool knownComma = options.decimalMark == ZtTableImportOptions::Comma;
     ZtCsvReader rows(text, ZtTableDialect::findSeparator(text, knownComma));
+    rows.setProgress(progress);
+    ZtProgress::setPart(progress, 0.1, 0.9);
     ZtCsvRow firstRow;
     if (!rows.next(&firstRow)) {
         *fault = rows.fault();
@@ -105,7 +108,7 @@ void addObjects(int typeId, const ZtImportedType &type)
 } // namespace
 
 bool ZtTableImport::readFile(const QString &path, const ZtTableImportOptions &options, ZtImportedTable *table,
-                             ZtFault *fault)
+                             ZtFault *fault, ZtProgress *progress)
 {
     QFile file(path);
     *fault = ZtFault();
@@ -116,35 +119,43 @@ bool ZtTableImport::readFile(const QString &path, const ZtTableImportOptions &op
         return fail(Text::tr("This is a folder, not a file"), fault);
     if (!file.open(QIODevice::ReadOnly))
         return fail(Text::tr("The file cannot be read (%1)").arg(file.errorString()), fault);
-    return readDevice(&file, path, options, table, fault);
+    return readDevice(&file, path, options, table, fault, progress);
 }
 
 bool ZtTableImport::readDevice(QIODevice *device, const QString &fileName,
-                               const ZtTableImportOptions &options, ZtImportedTable *table, ZtFault *fault)
+                               const ZtTableImportOptions &options, ZtImportedTable *table, ZtFault *fault,
+                               ZtProgress *progress)
 {
     *fault = ZtFault();
     fault->file = fileName;
     if (!device->isReadable())
         return fail(Text::tr("The table is not open for reading"), fault);
     const qint64 limit = qMin(options.maximumBytes, largestFile);
-    const QByteArray bytes = ztReadAtMost(device, limit + 1);
+    // Known beforehand for files: what is too large need not be read.
+    if (!device->isSequential() && device->size() - device->pos() > limit)
+        return failTooLarge(limit, fault);
+    ZtProgress::setPart(progress, 0.0, 0.1);
+    const QByteArray bytes = ztReadAtMost(device, limit + 1, progress);
+    if (ZtProgress::isCancelled(progress))
+        return fail(Text::tr("Reading was cancelled"), fault);
     const auto *file = qobject_cast<QFileDevice *>(device);
     if (file && file->error() != QFileDevice::NoError)
         return fail(Text::tr("The file cannot be read (%1)").arg(file->errorString()), fault);
     if (bytes.size() > limit)
         return failTooLarge(limit, fault);
-    return parse(bytes, fileName, options, table, fault);
+    return parse(bytes, fileName, options, table, fault, progress);
 }
 
 bool ZtTableImport::parse(const QByteArray &bytes, const QString &fileName,
-                          const ZtTableImportOptions &options, ZtImportedTable *table, ZtFault *fault)
+                          const ZtTableImportOptions &options, ZtImportedTable *table, ZtFault *fault,
+                          ZtProgress *progress)
 {
     *fault = ZtFault();
     QByteArray utf8;
     bool isRead = bytes.size() <= options.maximumBytes || failTooLarge(options.maximumBytes, fault);
     isRead = isRead && ZtTextDecoder::toUtf8(bytes, &utf8, fault);
     const std::string_view text(utf8.constData(), static_cast<std::size_t>(utf8.size()));
-    isRead = isRead && readText(text, options, table, fault);
+    isRead = isRead && readText(text, options, table, fault, progress);
     if (!isRead)
         fault->file = fileName;
     return isRead;

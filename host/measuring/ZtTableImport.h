@@ -8,6 +8,7 @@
 
 class QByteArray;
 class QIODevice;
+class ZtProgress;
 
 /**
  * Reads tables of measurements: one value per row, one object per row, or results as ImageJ writes them.
@@ -21,13 +22,16 @@ public:
     /** First id of the object types that tables bring; built-in types have smaller ones. */
     static constexpr int firstTypeId = 0x20000;
 
-    /** Each reads a whole table; false with the first fault found. \a fileName is only for the fault. */
+    /**
+     * Each reads a whole table; false with the first fault found. From any thread. \a fileName is only for
+     * the fault; a \a progress that is cancelled is a fault, too.
+     */
     static bool readFile(const QString &path, const ZtTableImportOptions &options, ZtImportedTable *table,
-                         ZtFault *fault);
+                         ZtFault *fault, ZtProgress *progress = nullptr);
     static bool readDevice(QIODevice *device, const QString &fileName, const ZtTableImportOptions &options,
-                           ZtImportedTable *table, ZtFault *fault);
+                           ZtImportedTable *table, ZtFault *fault, ZtProgress *progress = nullptr);
     static bool parse(const QByteArray &bytes, const QString &fileName, const ZtTableImportOptions &options,
-                      ZtImportedTable *table, ZtFault *fault);
+                      ZtImportedTable *table, ZtFault *fault, ZtProgress *progress = nullptr);
 
     /**
      * Makes every type of a table, with its objects, known to ZtKernelData under the next free ids from

@@ -84,6 +84,9 @@ ZtTableNumber::Kind readUnsignedWithComma(std::string_view text, double *value)
 
 std::string_view ZtTableNumber::trimmed(std::string_view text)
 {
+    // Most fields have none.
+    if (!text.empty() && text.front() > ' ' && text.back() > ' ')
+        return text;
     const std::string_view blanks = " \t\r\n";
     const std::size_t first = text.find_first_not_of(blanks);
     if (first == std::string_view::npos)
@@ -95,7 +98,8 @@ ZtTableNumber ZtTableNumber::read(std::string_view field, bool decimalComma)
 {
     const std::string_view text = trimmed(field);
     ZtTableNumber result;
-    if (isMissing(text))
+    const bool startsAsNumber = !text.empty() && isDigit(text.front());
+    if (!startsAsNumber && isMissing(text))
         return result;
     const std::string_view digits = withoutSign(text);
     const char mark = decimalComma ? ',' : '.';
@@ -110,11 +114,12 @@ ZtTableNumber ZtTableNumber::read(std::string_view field, bool decimalComma)
     return result;
 }
 
-QString ZtTableNumber::textOf(std::string_view field, bool decimalComma)
+std::string_view ZtTableNumber::textOf(std::string_view field, bool decimalComma, std::string *buffer)
 {
     const std::string_view text = trimmed(field);
-    QString result = QString::fromLatin1(text.data(), static_cast<int>(text.size()));
-    if (decimalComma)
-        result.replace(QLatin1Char(','), QLatin1Char('.'));
-    return result;
+    if (!decimalComma)
+        return text;
+    buffer->assign(text);
+    std::replace(buffer->begin(), buffer->end(), ',', '.');
+    return *buffer;
 }

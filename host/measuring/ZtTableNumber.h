@@ -3,8 +3,7 @@
 
 #include "measuring/ZtMeasuringGlobal.h"
 
-#include <QString>
-
+#include <string>
 #include <string_view>
 
 /** What a field of a table holds. */
@@ -26,8 +25,8 @@ struct ZT_MEASURING_EXPORT ZtTableNumber
      */
     static ZtTableNumber read(std::string_view field, bool decimalComma);
 
-    /** The field of a Number as written, with a decimal point. */
-    static QString textOf(std::string_view field, bool decimalComma);
+    /** The field of a Number as written, with a decimal point; where that is another text, in \a buffer. */
+    static std::string_view textOf(std::string_view field, bool decimalComma, std::string *buffer);
 
     /** \a text without blanks at its ends. */
     static std::string_view trimmed(std::string_view text);

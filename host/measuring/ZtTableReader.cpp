@@ -133,7 +133,8 @@ bool ZtTableReader::addNumber(const ZtCsvRow &row, int column, const Target &tar
     const bool isAdded =
         builder(target.type)
             .addCell(target.object, target.valueIndex, number.value,
-                     ZtTableNumber::textOf(field, m_decimalComma), unit, {row.line, column + 1});
+                     ZtTableNumber::textOf(field, m_decimalComma, &m_numberText), unit,
+                     {row.line, column + 1});
     return isAdded || failUnit(row, column, target, unit);
 }
 

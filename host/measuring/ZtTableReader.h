@@ -4,6 +4,7 @@
 #include "measuring/ZtCsvReader.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtImportedTable.h"
+#include "measuring/ZtProgress.h"
 #include "measuring/ZtTableHeader.h"
 #include "measuring/ZtTableImportOptions.h"
 #include "measuring/ZtTableUnits.h"
@@ -41,6 +42,8 @@ protected:
     bool readHeader();
     /** Goes back to the row after the header. */
     void rewindToFirstRow();
+    /** The rows from here to the end take this part of the time that the whole table takes, 0 to 1. */
+    void beginPass(double from, double to) { ZtProgress::setPart(m_rows->progress(), from, to); }
     /** The next row; false at the end and after a fault, which hasFault() tells apart. */
     bool nextRow(ZtCsvRow *row);
     bool nextRowLikeHeader(ZtCsvRow *row);
@@ -93,5 +96,6 @@ private:
     QHash<QString, int> m_typesByName;    ///< by its display name
     std::vector<std::unique_ptr<ZtImportedTypeBuilder>> m_builders;
     QStringList m_notes;
+    std::string m_numberText; ///< of the field that is being read
     ZtFault m_fault;
 };

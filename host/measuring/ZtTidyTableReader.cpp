@@ -15,6 +15,8 @@ const QStringList objectKeys = {QStringLiteral("object_index"),
                                 QStringLiteral("name"),
                                 QStringLiteral("label"),
                                 QStringLiteral("id")};
+const QStringList numberKeys = {QStringLiteral("object_index"), QStringLiteral("index")};
+const QStringList objectNameKeys = {QStringLiteral("object_name")};
 const QStringList valueNameKeys = {QStringLiteral("value_name"), QStringLiteral("measurement"),
                                    QStringLiteral("variable"), QStringLiteral("parameter")};
 const QStringList unitKeys = {QStringLiteral("unit"), QStringLiteral("units")};
@@ -60,6 +62,9 @@ bool ZtTidyTableReader::chooseColumns()
         m_objectColumn = ZtTableHeader::findKey(headers(), objectKeys, m_typeColumn);
     if (options().typeColumn.isEmpty())
         m_typeColumn = ZtTableHeader::findKey(headers(), typeKeys, m_objectColumn);
+    // Where numbers tell the objects apart, a further column may name them.
+    if (m_objectColumn >= 0 && numberKeys.contains(headers().at(m_objectColumn).key()))
+        m_objectNameColumn = ZtTableHeader::findKey(headers(), objectNameKeys, m_typeColumn);
     m_nameColumn = ZtTableHeader::findKey(headers(), valueNameKeys);
     m_unitColumn = ZtTableHeader::findKey(headers(), unitKeys);
     m_valueColumn = ZtTableHeader::findKey(headers(), valueKeys);
@@ -70,7 +75,8 @@ bool ZtTidyTableReader::chooseColumns()
 void ZtTidyTableReader::noteLeftOutColumns()
 {
     QStringList leftOut;
-    const QVector<int> used = {m_typeColumn, m_objectColumn, m_nameColumn, m_unitColumn, m_valueColumn};
+    const QVector<int> used = {m_typeColumn, m_objectColumn, m_objectNameColumn,
+                               m_nameColumn, m_unitColumn,   m_valueColumn};
     for (int i = 0; i < headers().size(); ++i) {
         if (!used.contains(i))
             leftOut.append(headers().at(i).written);
@@ -126,40 +132,64 @@ bool ZtTidyTableReader::findObject(const ZtCsvRow &row, int type, int valueIndex
         return true;
     }
     const std::string_view key = field(row, m_objectColumn);
+    *object = state.lastObjectIndex;
+    if (state.lastObjectIndex >= 0 && state.lastObject == lookUpKey(key))
+        return true;
     if (ZtTableNumber::read(key, false).kind == ZtTableNumber::Missing)
         return fail(row.line, m_objectColumn + 1, tr("The row does not say which object it belongs to"));
     const auto found = state.objects.constFind(lookUpKey(key));
     if (found != state.objects.constEnd()) {
         *object = *found;
-        return true;
+    } else {
+        *object = addNamedObject(type, key, field(row, m_objectNameColumn));
+        state.objects.insert(toBytes(key), *object);
     }
-    *object = addObject(type, key);
-    state.objects.insert(toBytes(key), *object);
+    state.lastObject = toBytes(key);
+    state.lastObjectIndex = *object;
     return true;
+}
+
+int ZtTidyTableReader::addNamedObject(int type, std::string_view key, std::string_view name)
+{
+    const QString text = QString::fromUtf8(name.data(), static_cast<int>(name.size())).simplified();
+    if (text.isEmpty())
+        return addObject(type, key);
+    ZtImportedTypeBuilder &objects = builder(type);
+    const QString standard = objects.name() + QLatin1Char(' ') + QString::number(objects.rowCount() + 1);
+    return objects.addRow(text == standard ? QString() : text);
 }
 
 bool ZtTidyTableReader::readValue(const ZtCsvRow &row, int type, int object, int valueIndex)
 {
-    ZtUnit unit;
-    return readUnit(row, builder(type).value(valueIndex).name, &unit) &&
-           addNumber(row, m_valueColumn, {type, object, valueIndex}, unit);
+    const ZtUnit *unit = nullptr;
+    return findUnit(row, type, valueIndex, &unit) &&
+           addNumber(row, m_valueColumn, {type, object, valueIndex}, *unit);
+}
+
+bool ZtTidyTableReader::findUnit(const ZtCsvRow &row, int type, int valueIndex, const ZtUnit **unit)
+{
+    std::vector<WrittenUnit> &units = m_types[static_cast<std::size_t>(type)].units;
+    units.resize(static_cast<std::size_t>(builder(type).valueCount()));
+    WrittenUnit &last = units[static_cast<std::size_t>(valueIndex)];
+    *unit = &last.unit;
+    const std::string_view written = field(row, m_unitColumn);
+    if (last.isRead && last.written == lookUpKey(written))
+        return true;
+    if (!readUnit(row, builder(type).value(valueIndex).name, &last.unit))
+        return false;
+    last.isRead = true;
+    last.written = toBytes(written);
+    return true;
 }
 
 bool ZtTidyTableReader::readUnit(const ZtCsvRow &row, const QString &valueName, ZtUnit *unit)
 {
     const std::string_view written = field(row, m_unitColumn);
-    const QByteArray key = toBytes(field(row, m_nameColumn)) + '\n' + toBytes(written);
-    const auto found = m_unitCache.constFind(key);
-    if (found != m_unitCache.constEnd()) {
-        *unit = *found;
-        return true;
-    }
     const ZtTableNumber::Kind kind = ZtTableNumber::read(written, isDecimalComma()).kind;
     if (kind == ZtTableNumber::Number)
         return fail(row.line, m_unitColumn + 1, tr("%1 is not a unit").arg(quoted(written)));
     const bool isStated = kind != ZtTableNumber::Missing;
     *unit =
         units().unitOf(valueName, isStated ? QString::fromUtf8(toBytes(written)).simplified() : QString());
-    m_unitCache.insert(key, *unit);
     return true;
 }

@@ -18,28 +18,39 @@ protected:
     int unitColumn() const override { return m_unitColumn; }
 
 private:
+    struct WrittenUnit
+    {
+        bool isRead = false;
+        QByteArray written;
+        ZtUnit unit;
+    };
     /** What is known about the objects of one type. */
     struct TypeState
     {
         QHash<QByteArray, int> objects;      ///< by their key in the table
         QHash<QByteArray, int> valueIndexes; ///< by the value's name in the table
         QVector<int> occurrences;            ///< of each value, where objects have no key
+        QByteArray lastObject; ///< key of the row before: rows of one object often come together
+        int lastObjectIndex = -1;
+        std::vector<WrittenUnit> units; ///< of each value, as it came last
     };
 
     bool chooseColumns();
     void noteLeftOutColumns();
     bool readRow(const ZtCsvRow &row);
     bool readValue(const ZtCsvRow &row, int type, int object, int valueIndex);
+    bool findUnit(const ZtCsvRow &row, int type, int valueIndex, const ZtUnit **unit);
     bool readUnit(const ZtCsvRow &row, const QString &valueName, ZtUnit *unit);
     bool findValue(const ZtCsvRow &row, int type, int *valueIndex);
     bool findObject(const ZtCsvRow &row, int type, int valueIndex, int *object);
+    int addNamedObject(int type, std::string_view key, std::string_view name);
     std::string_view field(const ZtCsvRow &row, int column) const;
 
     int m_typeColumn = -1;
     int m_objectColumn = -1;
+    int m_objectNameColumn = -1; ///< where the objects are told apart by numbers, and named as well
     int m_nameColumn = -1;
     int m_unitColumn = -1;
     int m_valueColumn = -1;
     std::vector<TypeState> m_types;
-    QHash<QByteArray, ZtUnit> m_unitCache; ///< by value name and unit as written
 };

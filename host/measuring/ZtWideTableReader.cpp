@@ -26,7 +26,7 @@ const QStringList &typeKeys()
 
 bool ZtWideTableReader::readTable()
 {
-    if (!readHeader() || !scanColumns() || !chooseColumns())
+    if (!readHeader() || !findOptions() || !scanColumns() || !chooseColumns())
         return false;
     nameValues();
     noteLeftOutColumns();
@@ -35,17 +35,18 @@ bool ZtWideTableReader::readTable()
 
 bool ZtWideTableReader::scanColumns()
 {
+    beginPass(0.1, 0.4);
     m_columns.resize(headers().size());
     ZtCsvRow row;
     while (nextRowLikeHeader(&row)) {
         ++m_rowCount;
         for (int i = 0; i < m_columns.size(); ++i)
-            scanCell(row.fields[static_cast<std::size_t>(i)], &m_columns[i]);
+            scanCell(row.fields[static_cast<std::size_t>(i)], i == m_nameColumn, &m_columns[i]);
     }
     return !hasFault();
 }
 
-void ZtWideTableReader::scanCell(std::string_view field, Column *column) const
+void ZtWideTableReader::scanCell(std::string_view field, bool isName, Column *column) const
 {
     switch (ZtTableNumber::read(field, isDecimalComma()).kind) {
     case ZtTableNumber::Missing:
@@ -58,7 +59,8 @@ void ZtWideTableReader::scanCell(std::string_view field, Column *column) const
         break;
     }
     ++column->texts;
-    if (column->repeats)
+    // Whether names come twice is of no interest, and to find out takes long.
+    if (column->repeats || isName)
         return;
     const QByteArray text(field.data(), static_cast<int>(field.size()));
     column->repeats = column->seen.contains(text);
@@ -67,13 +69,19 @@ void ZtWideTableReader::scanCell(std::string_view field, Column *column) const
         column->seen.clear();
 }
 
-bool ZtWideTableReader::chooseColumns()
+// The headings alone say which column has the names.
+bool ZtWideTableReader::findOptions()
 {
     if (!findColumnOption(options().typeColumn, &m_typeColumn) ||
         !findColumnOption(options().nameColumn, &m_nameColumn))
         return false;
     if (options().nameColumn.isEmpty())
         m_nameColumn = detectNameColumn();
+    return true;
+}
+
+bool ZtWideTableReader::chooseColumns()
+{
     if (options().typeColumn.isEmpty())
         m_typeColumn = detectTypeColumn();
     chooseValueColumns();
@@ -116,7 +124,9 @@ void ZtWideTableReader::chooseValueColumns()
 {
     for (int i = 0; i < m_columns.size(); ++i) {
         Column &column = m_columns[i];
-        const bool hasOtherRole = i == m_nameColumn || i == m_typeColumn || (i == 0 && isResultsTable());
+        const bool isNumber = m_nameColumn >= 0 && headers().at(i).key() == QLatin1String("object_index");
+        const bool hasOtherRole =
+            i == m_nameColumn || i == m_typeColumn || isNumber || (i == 0 && isResultsTable());
         column.isValue = !hasOtherRole && column.numbers > 0 && column.numbers >= column.texts;
     }
 }
@@ -174,6 +184,7 @@ int ZtWideTableReader::typeOf(const ZtCsvRow &row)
 bool ZtWideTableReader::readRows()
 {
     rewindToFirstRow();
+    beginPass(0.4, 0.9);
     ZtCsvRow row;
     while (nextRowLikeHeader(&row)) {
         const int type = typeOf(row);

@@ -32,8 +32,9 @@ private:
         ZtUnit unit;
     };
 
+    bool findOptions();
     bool scanColumns();
-    void scanCell(std::string_view field, Column *column) const;
+    void scanCell(std::string_view field, bool isName, Column *column) const;
     bool chooseColumns();
     int detectNameColumn() const;
     int detectTypeColumn() const;

@@ -180,6 +180,9 @@ private:
         const QPoint far(2 * QApplication::startDragDistance(), 0);
         QTest::mousePress(window, Qt::LeftButton, Qt::NoModifier, inWindow(from, start));
         QTest::mouseMove(window, inWindow(from, start + far));
+        // Lists of Qt's take one move more.
+        if (!QTest::qWaitFor([&catcher]() { return catcher.data() != nullptr; }, 100))
+            QTest::mouseMove(window, inWindow(from, start + 2 * far));
         QTRY_VERIFY(catcher.data());
         QTest::mouseRelease(window, Qt::LeftButton, Qt::NoModifier, inWindow(from, start + far));
         QDragEnterEvent enter(end, Qt::CopyAction | Qt::MoveAction, catcher.data(), Qt::LeftButton,

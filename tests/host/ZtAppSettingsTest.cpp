@@ -101,6 +101,7 @@ private slots:
     void superfluousSlashesDoNotMatter();
     void anEmptyKeyIsRefused();
     void endingNoGroupIsHarmless();
+    void listsTheKeysOfTheOpenGroup();
     void removingTakesWhatIsBelow();
     void removingTheOpenGroup();
     void anInvalidValueRemoves();
@@ -245,6 +246,21 @@ void ZtAppSettingsTest::endingNoGroupIsHarmless()
     ZtAppSettings::endGroup();
     setValueIn(QStringLiteral("G"), QStringLiteral("k"), 1);
     QCOMPARE(valueIn(QStringLiteral("G"), QStringLiteral("k")).toInt(), 1);
+}
+
+void ZtAppSettingsTest::listsTheKeysOfTheOpenGroup()
+{
+    QCOMPARE(ZtAppSettings::childKeys(), QStringList());
+    ZtAppSettings::setValue(QStringLiteral("b"), 1);
+    ZtAppSettings::setValue(QStringLiteral("G/z"), 2);
+    ZtAppSettings::setValue(QStringLiteral("G/a b"), 3);
+    ZtAppSettings::setValue(QStringLiteral("G/deeper/c"), 4);
+    ZtAppSettings::setValue(QStringLiteral("GG/d"), 5);
+    QCOMPARE(ZtAppSettings::childKeys(), QStringList(QStringLiteral("b")));
+    ZtAppSettings::beginGroup(QStringLiteral("G"));
+    const QStringList keys = ZtAppSettings::childKeys();
+    ZtAppSettings::endGroup();
+    QCOMPARE(keys, QStringList({QStringLiteral("a b"), QStringLiteral("z")}));
 }
 
 void ZtAppSettingsTest::removingTakesWhatIsBelow()

@@ -28,6 +28,13 @@ public:
         m_timer.start(5);
     }
 
+    /** Presses the button with a text. */
+    explicit MessageBoxAnswerer(const QString &buttonText)
+        : MessageBoxAnswerer(QMessageBox::NoButton)
+    {
+        m_buttonText = buttonText;
+    }
+
     const QVector<SeenMessageBox> &boxes() const { return m_boxes; }
 
 private:
@@ -38,13 +45,23 @@ private:
             return;
         m_boxes.append({box->windowTitle(), box->text(), box->icon(), box->standardButtons(), box->isModal(),
                         box->parentWidget() != nullptr});
-        if (QAbstractButton *button = box->button(m_answer))
+        if (QAbstractButton *button = m_buttonText.isEmpty() ? box->button(m_answer) : buttonWithText(*box))
             button->click();
         else
             box->reject();
     }
 
+    QAbstractButton *buttonWithText(const QMessageBox &box) const
+    {
+        for (QAbstractButton *button : box.buttons()) {
+            if (button->text().remove(QLatin1Char('&')) == m_buttonText)
+                return button;
+        }
+        return nullptr;
+    }
+
     QMessageBox::StandardButton m_answer;
+    QString m_buttonText;
     QTimer m_timer;
     QVector<SeenMessageBox> m_boxes;
 };

@@ -19,8 +19,9 @@ public:
         : m_isSuperuser(geteuid() == 0)
     {
         const QString folder = QFileInfo(StatReportTest::temporaryPath(QStringLiteral("any"))).path();
-        QFile::setPermissions(folder,
-                              QFile::permissions(folder) | QFileDevice::ReadOther | QFileDevice::ExeOther);
+        // The superuser's group stays.
+        QFile::setPermissions(folder, QFile::permissions(folder) | QFileDevice::ReadGroup | QFileDevice::ExeGroup |
+                                          QFileDevice::ReadOther | QFileDevice::ExeOther);
         m_isUnprivileged = !m_isSuperuser || seteuid(kNobody) == 0;
     }
     ~UnprivilegedUser()

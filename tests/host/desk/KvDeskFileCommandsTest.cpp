@@ -4,6 +4,7 @@
 #include "DeskFiles.h"
 #include "DeskLog.h"
 #include "FileDialogAnswerer.h"
+#include "KvDeskProgress.h"
 #include "KvDeskRecentFiles.h"
 #include "KvDeskSession.h"
 #include "host/measuring/Polygon.h"
@@ -11,6 +12,12 @@
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "support/MessageBoxAnswerer.h"
+#include "support/UnprivilegedUser.h"
+
+#include <QProgressBar>
+#include <QPushButton>
+
+#include <sys/stat.h>
 
 namespace {
 
@@ -46,8 +53,27 @@ private slots:
     void startsWhereTheLastFileWas();
     void newSessionAsks();
     void recentSessions();
+    void dropsAreOpenedByKind();
+    void faultsOfDropsAreToldAtOnce();
+    void secondSessionOfADropIsLeftOut();
+    void fileOfAnotherProgram_data();
+    void fileOfAnotherProgram();
+    void writeProtectedFile_data();
+    void writeProtectedFile();
+    void newerVersionIsRefused();
+    void badFilesOfAnySize_data();
+    void badFilesOfAnySize();
+    void cutSessionsLoseNothing();
+    void longWorkCanBeCancelled_data();
+    void longWorkCanBeCancelled();
+    void millionRows();
+    void largeSessionIsSavedAndRead();
+    void savingCanBeCancelled();
 
 private:
+    void cancelWhenShown(QTimer *timer);
+    void cancelSoon(QTimer *timer);
+
     QWidget m_window;
     std::unique_ptr<ZtMeasuringDocument> m_document;
     std::unique_ptr<KvDeskSession> m_session;
@@ -325,6 +351,319 @@ void KvDeskFileCommandsTest::recentSessions()
     QVERIFY(m_commands->openSession(DeskFiles::demoSession()));
     QVERIFY(m_commands->openImage(DeskFiles::image(QStringLiteral("recent.png"))));
     QCOMPARE(KvDeskRecentFiles::paths(), QStringList({DeskFiles::demoSession(), path}));
+}
+
+void KvDeskFileCommandsTest::dropsAreOpenedByKind()
+{
+    m_commands->openFiles({DeskFiles::table(QStringLiteral("d.csv")),
+                           DeskFiles::image(QStringLiteral("d.png")), DeskFiles::demoSession()});
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Information),
+             QStringList({QStringLiteral("Session opened: demo.json (objects: 33)"),
+                          QStringLiteral("Image opened: d.png"),
+                          QStringLiteral("Table imported: d.csv (objects: 2)")}));
+    QCOMPARE(m_session->objectCount(), 35);
+}
+
+void KvDeskFileCommandsTest::faultsOfDropsAreToldAtOnce()
+{
+    const MessageBoxAnswerer answerer;
+    QStringList files;
+    for (int i = 0; i < 12; ++i)
+        files.append(DeskFiles::text(QStringLiteral("broken%1.png").arg(i), "text"));
+    files.append(DeskFiles::table());
+    m_commands->openFiles(files);
+    QCOMPARE(answerer.boxes().size(), 1);
+    QCOMPARE(answerer.boxes().first().text, QStringLiteral("12 files were not opened."));
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Error).size(), 12);
+    QCOMPARE(m_session->objectCount(), 2);
+    // The next fault is a new one.
+    m_commands->openFiles({files.first()});
+    QCOMPARE(answerer.boxes().size(), 2);
+    QCOMPARE(answerer.boxes().last().text, QStringLiteral("The image \"broken0.png\" was not opened."));
+}
+
+void KvDeskFileCommandsTest::secondSessionOfADropIsLeftOut()
+{
+    const QString other = temporaryPath(QStringLiteral("other.json"));
+    QVERIFY(m_commands->saveSession(other));
+    m_session->clear();
+    m_commands->openFiles({DeskFiles::demoSession(), other});
+    QCOMPARE(m_session->path(), DeskFiles::demoSession());
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Warning),
+             QStringList(QStringLiteral("Only one session can be open; not opened: other.json")));
+}
+
+void KvDeskFileCommandsTest::fileOfAnotherProgram_data()
+{
+    QTest::addColumn<QString>("button");
+    QTest::addColumn<QString>("written");
+    QTest::newRow("overwrite") << QStringLiteral("Overwrite") << QStringLiteral("shared.json");
+    QTest::newRow("save as") << QStringLiteral("Save as...") << QStringLiteral("mine.json");
+    QTest::newRow("cancel") << QStringLiteral("Cancel") << QString();
+}
+
+void KvDeskFileCommandsTest::fileOfAnotherProgram()
+{
+    QFETCH(QString, button);
+    QFETCH(QString, written);
+    const QString path = temporaryPath(QStringLiteral("shared.json"));
+    const QString mine = temporaryPath(QStringLiteral("mine.json"));
+    QFile::remove(mine);
+    QVERIFY(m_commands->saveSession(path));
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    const QByteArray theirs = DeskFiles::bytes(path) + "\n\n";
+    DeskFiles::text(QStringLiteral("shared.json"), theirs);
+    const MessageBoxAnswerer answerer(button);
+    const FileDialogAnswerer dialogs(mine);
+    QCOMPARE(m_commands->slotSaveSession(), !written.isEmpty());
+    QCOMPARE(answerer.boxes().size(), 1);
+    QCOMPARE(answerer.boxes().first().text,
+             QStringLiteral("\"shared.json\" was changed by another program. Overwrite its changes?"));
+    QCOMPARE(DeskFiles::bytes(path) != theirs, written == QStringLiteral("shared.json"));
+    QCOMPARE(QFileInfo::exists(mine), written == QStringLiteral("mine.json"));
+    QCOMPARE(m_session->isModified(), written.isEmpty());
+    // It was decided: no more questions.
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    if (!written.isEmpty())
+        QVERIFY(m_commands->slotSaveSession());
+    QCOMPARE(answerer.boxes().size(), 1);
+}
+
+void KvDeskFileCommandsTest::writeProtectedFile_data()
+{
+    QTest::addColumn<QString>("button");
+    QTest::addColumn<bool>("isSaved");
+    QTest::newRow("save as") << QStringLiteral("Save as...") << true;
+    QTest::newRow("cancel") << QStringLiteral("Cancel") << false;
+}
+
+void KvDeskFileCommandsTest::writeProtectedFile()
+{
+    QFETCH(QString, button);
+    QFETCH(bool, isSaved);
+    const QString folder = temporaryPath(QStringLiteral("protected") + button.left(4));
+    QVERIFY(QDir().mkpath(folder));
+    const QString path = folder + QStringLiteral("/protected.json");
+    QVERIFY(m_commands->saveSession(path));
+    const QByteArray before = DeskFiles::bytes(path);
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    QFile::setPermissions(path, QFile::ReadOwner | QFile::ReadGroup | QFile::ReadOther);
+    QFile::setPermissions(folder, QFile::Permissions(0x7777));
+    const UnprivilegedUser user;
+    if (!user.isUnprivileged())
+        QSKIP("needs a user whom permissions stop");
+    const MessageBoxAnswerer answerer(button);
+    const FileDialogAnswerer dialogs(folder + QStringLiteral("/elsewhere.json"));
+    QCOMPARE(m_commands->slotSaveSession(), isSaved);
+    QCOMPARE(answerer.boxes().size(), 1);
+    QCOMPARE(answerer.boxes().first().text, QStringLiteral("The session \"protected.json\" was not saved."));
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Error),
+             QStringList(QStringLiteral("The session \"protected.json\" was not saved. %1: The file is "
+                                        "write-protected")
+                             .arg(path)));
+    QCOMPARE(DeskFiles::bytes(path), before);
+    QCOMPARE(m_session->isModified(), !isSaved);
+    QCOMPARE(m_session->path(), isSaved ? folder + QStringLiteral("/elsewhere.json") : path);
+}
+
+void KvDeskFileCommandsTest::newerVersionIsRefused()
+{
+    const QString path =
+        DeskFiles::text(QStringLiteral("future.json"),
+                        "{\"format\": \"statreport-session\", \"version\": 99, \"objects\": {}}");
+    const MessageBoxAnswerer answerer;
+    QVERIFY(!m_commands->openSession(path));
+    QCOMPARE(answerer.boxes().size(), 1);
+    QCOMPARE(answerer.boxes().first().text, QStringLiteral("The session \"future.json\" was not opened."));
+    const QString sentence = DeskLog::messages(ZtAppStatus::Error).first();
+    QVERIFY2(sentence.contains(
+                 QStringLiteral("The session is of the newer version 99; this program reads versions "
+                                "up to ")),
+             qPrintable(sentence));
+}
+
+void KvDeskFileCommandsTest::badFilesOfAnySize_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<qint64>("size");
+    QTest::addColumn<QString>("reason");
+    const qint64 huge = 2LL * 1024 * 1024 * 1024 + 1;
+    QTest::newRow("no session") << QStringLiteral("s.json") << qint64(0)
+                                << QStringLiteral("The file is empty");
+    QTest::newRow("no image") << QStringLiteral("i.png") << qint64(0) << QStringLiteral("the file is empty");
+    QTest::newRow("no table") << QStringLiteral("t.csv") << qint64(0) << QStringLiteral("The file is empty");
+    QTest::newRow("huge session") << QStringLiteral("s.json") << huge
+                                  << QStringLiteral("The file is too large for a session");
+    QTest::newRow("huge image") << QStringLiteral("i.png") << huge
+                                << QStringLiteral("The picture cannot be decoded");
+    QTest::newRow("huge tiff") << QStringLiteral("i.tif") << huge
+                               << QStringLiteral("The picture cannot be decoded");
+    QTest::newRow("huge table") << QStringLiteral("t.csv") << huge
+                                << QStringLiteral("The file is larger than 512 MB");
+}
+
+void KvDeskFileCommandsTest::badFilesOfAnySize()
+{
+    QFETCH(QString, name);
+    QFETCH(qint64, size);
+    QFETCH(QString, reason);
+    QVERIFY(m_commands->openSession(DeskFiles::demoSession()));
+    ZtStatusLog::getInstance()->clear();
+    // Takes no room on the disk: nobody writes it.
+    QFile file(temporaryPath(name));
+    QVERIFY(file.open(QIODevice::WriteOnly));
+    QVERIFY(file.resize(size));
+    file.close();
+    const MessageBoxAnswerer answerer;
+    QElapsedTimer clock;
+    clock.start();
+    QVERIFY(!m_commands->openFile(file.fileName()));
+    QVERIFY2(clock.elapsed() < 10000, qPrintable(QString::number(clock.elapsed())));
+    QCOMPARE(answerer.boxes().size(), 1);
+    const QString error = DeskLog::messages(ZtAppStatus::Error).value(0);
+    QVERIFY2(error.contains(reason), qPrintable(error));
+    QCOMPARE(m_session->objectCount(), 33);
+    QVERIFY(!m_session->isModified());
+    QFile::remove(file.fileName());
+}
+
+void KvDeskFileCommandsTest::cutSessionsLoseNothing()
+{
+    const QByteArray whole = DeskFiles::bytes(DeskFiles::demoSession());
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    m_session->setUnmodified();
+    const MessageBoxAnswerer answerer;
+    for (const int percent : {1, 25, 50, 75, 99}) {
+        const QString path =
+            DeskFiles::text(QStringLiteral("cut.json"), whole.left(whole.size() * percent / 100));
+        QVERIFY(!m_commands->openSession(path));
+        QCOMPARE(m_session->objectCount(), 1);
+        QCOMPARE(DeskFiles::bytes(path).size(), whole.size() * percent / 100);
+    }
+    QCOMPARE(answerer.boxes().size(), 5);
+}
+
+void KvDeskFileCommandsTest::cancelWhenShown(QTimer *timer)
+{
+    connect(timer, &QTimer::timeout, this, [this]() {
+        if (m_commands->progress()->isVisibleTo(&m_window))
+            m_commands->progress()->cancelButton()->click();
+    });
+    timer->start(5);
+}
+
+// Fast machines are done before anything is shown.
+void KvDeskFileCommandsTest::cancelSoon(QTimer *timer)
+{
+    connect(timer, SIGNAL(timeout()), m_commands->progress()->cancelButton(), SLOT(click()));
+    timer->start(1);
+}
+
+void KvDeskFileCommandsTest::longWorkCanBeCancelled_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QString>("message");
+    QTest::newRow("table") << QStringLiteral("fifo.csv")
+                           << QStringLiteral("The table \"fifo.csv\" was not imported.");
+}
+
+void KvDeskFileCommandsTest::longWorkCanBeCancelled()
+{
+    QFETCH(QString, name);
+    QFETCH(QString, message);
+    QVERIFY(m_commands->openSession(DeskFiles::demoSession()));
+    ZtStatusLog::getInstance()->clear();
+    // Reading it takes until somebody writes to it: as long as the test wants.
+    const QByteArray path = QFile::encodeName(temporaryPath(name));
+    QCOMPARE(mkfifo(path.constData(), 0600), 0);
+    QTimer timer;
+    cancelWhenShown(&timer);
+    const MessageBoxAnswerer answerer;
+    QElapsedTimer clock;
+    clock.start();
+    QVERIFY(!m_commands->importTable(temporaryPath(name)));
+    QVERIFY(clock.elapsed() >= KvDeskProgress::delayMs - 50);
+    QCOMPARE(answerer.boxes().size(), 0);
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Information), QStringList(message));
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Error), QStringList());
+    QCOMPARE(m_session->objectCount(), 33);
+    QVERIFY(!m_session->isModified());
+    // The thread that still waits is let go.
+    QFile writer(temporaryPath(name));
+    QVERIFY(writer.open(QIODevice::WriteOnly));
+}
+
+void KvDeskFileCommandsTest::millionRows()
+{
+    constexpr int rows = 1000000;
+    const QString path = temporaryPath(QStringLiteral("million.csv"));
+    QFile file(path);
+    QVERIFY(file.open(QIODevice::WriteOnly));
+    file.write("Name,Length [mm]\n");
+    for (int i = 0; i < rows; ++i)
+        file.write("A,1.5\n");
+    file.close();
+    // What happens while the thread works shows that the interface lives.
+    int ticks = 0;
+    double fraction = 0.0;
+    QTimer timer;
+    connect(&timer, &QTimer::timeout, this, [&]() {
+        ticks += m_commands->progress()->isRunning() ? 1 : 0;
+        fraction = qMax(fraction, m_commands->progress()->bar()->value() / 1000.0);
+    });
+    timer.start(20);
+    {
+        QTimer canceller;
+        cancelSoon(&canceller);
+        QVERIFY(!m_commands->importTable(path));
+        QCOMPARE(m_session->objectCount(), 0);
+        QVERIFY(!m_session->isModified());
+    }
+    QVERIFY(m_commands->importTable(path));
+    QVERIFY(ticks > 5);
+    QCOMPARE(m_session->objectCount(), rows);
+    QVERIFY(fraction > 0.2);
+    QFile::remove(path);
+}
+
+void KvDeskFileCommandsTest::largeSessionIsSavedAndRead()
+{
+    constexpr int rows = 50000;
+    QByteArray table = "Name,Length [mm]\n";
+    for (int i = 0; i < rows; ++i)
+        table += "A" + QByteArray::number(i) + ",1.5\n";
+    QVERIFY(m_commands->importTable(DeskFiles::text(QStringLiteral("large.csv"), table)));
+    const QString path = temporaryPath(QStringLiteral("large.json"));
+    QVERIFY(m_commands->saveSession(path));
+    QVERIFY(!m_session->isModified());
+    m_session->clear();
+    QVERIFY(m_commands->openSession(path));
+    QCOMPARE(m_session->objectCount(), rows);
+}
+
+void KvDeskFileCommandsTest::savingCanBeCancelled()
+{
+    constexpr int rows = 200000;
+    QByteArray table = "Name,Length [mm]\n";
+    for (int i = 0; i < rows; ++i)
+        table += "A" + QByteArray::number(i) + ",1.5\n";
+    const QString path = temporaryPath(QStringLiteral("cancelled.json"));
+    QVERIFY(m_commands->saveSession(path));
+    const QByteArray before = DeskFiles::bytes(path);
+    QVERIFY(m_commands->importTable(DeskFiles::text(QStringLiteral("cancelled.csv"), table)));
+    ZtStatusLog::getInstance()->clear();
+    const MessageBoxAnswerer answerer;
+    // Handled as soon as the wait for the writer begins, before any word from it.
+    QMetaObject::invokeMethod(m_commands->progress()->cancelButton(), "click", Qt::QueuedConnection);
+    QVERIFY(!m_commands->saveSession(path));
+    QCOMPARE(answerer.boxes().size(), 0);
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Information),
+             QStringList(QStringLiteral("The session \"cancelled.json\" was not saved.")));
+    QCOMPARE(DeskFiles::bytes(path), before);
+    QVERIFY(m_session->isModified());
+    QVERIFY(!m_session->isChangedOnDisk());
+    QVERIFY(m_commands->saveSession(path));
+    QVERIFY(!m_session->isModified());
 }
 
 STATREPORT_TEST_MAIN(KvDeskFileCommandsTest)

@@ -10,6 +10,8 @@ class KvDeskFileKindTest : public StatReportTest
 private slots:
     void kinds_data();
     void kinds();
+    void known_data();
+    void known();
     void patterns();
 };
 
@@ -40,6 +42,35 @@ void KvDeskFileKindTest::kinds()
     QFETCH(QString, path);
     QFETCH(int, kind);
     QCOMPARE(static_cast<int>(KvDeskFileKind::of(path)), kind);
+}
+
+void KvDeskFileKindTest::known_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::addColumn<bool>("isKnown");
+    QTest::newRow("none") << QStringLiteral("/none/a.json") << false;
+    QTest::newRow("folder") << QDir::tempPath() << false;
+    QTest::newRow("session") << DeskFiles::demoSession() << true;
+    QTest::newRow("image") << DeskFiles::image(QStringLiteral("known.png")) << true;
+    QTest::newRow("table") << DeskFiles::table(QStringLiteral("known.csv")) << true;
+    QTest::newRow("broken image") << DeskFiles::text(QStringLiteral("broken.png"), "") << true;
+    QTest::newRow("text") << DeskFiles::text(QStringLiteral("values"), "a;b\r\n1\t2\n") << true;
+    QTest::newRow("accents") << DeskFiles::text(QStringLiteral("values.dat"), "L\xC3\xA4nge\n1\n") << true;
+    QTest::newRow("UTF-16") << DeskFiles::text(QStringLiteral("values.16"), QByteArray("\xFF\xFE"
+                                                                                       "a\0",
+                                                                                       4))
+                            << true;
+    QTest::newRow("document") << DeskFiles::text(QStringLiteral("a.pdf"), QByteArray("%PDF\n\0\1\2", 8))
+                              << false;
+    QTest::newRow("program") << QStringLiteral("/proc/self/exe") << false;
+    QTest::newRow("empty") << DeskFiles::text(QStringLiteral("empty"), "") << false;
+}
+
+void KvDeskFileKindTest::known()
+{
+    QFETCH(QString, path);
+    QFETCH(bool, isKnown);
+    QCOMPARE(KvDeskFileKind::isKnown(path), isKnown);
 }
 
 void KvDeskFileKindTest::patterns()

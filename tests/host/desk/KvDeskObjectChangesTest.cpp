@@ -67,6 +67,17 @@ private slots:
     void announcesOnce_data();
     void announcesOnce();
     void isNotPutOff();
+    void tellsWhatChanged();
+    void emptiedTypesAreTold();
+    void changesOfReceiversComeNext();
+
+public slots:
+    void slotChanged();
+
+private:
+    KvDeskObjectChanges *m_changes = nullptr;
+    QVector<KvDeskObjectChanges::Batch> m_batches;
+    bool m_answers = false; ///< with another change
 };
 
 void KvDeskObjectChangesTest::cleanup()
@@ -112,6 +123,68 @@ void KvDeskObjectChangesTest::isNotPutOff()
     connect(&timer, &QTimer::timeout, &changeOne);
     timer.start(1);
     QVERIFY(spy.wait(5000));
+}
+
+void KvDeskObjectChangesTest::slotChanged()
+{
+    m_batches.append(m_changes->batch());
+    if (m_batches.size() == 1 && m_answers)
+        emit ZtSignalCenter::getInstance()->signalObjectChanged(3, 4, nullptr);
+}
+
+void KvDeskObjectChangesTest::tellsWhatChanged()
+{
+    KvDeskObjectChanges changes;
+    m_changes = &changes;
+    m_batches.clear();
+    connect(&changes, SIGNAL(signalChanged()), this, SLOT(slotChanged()));
+    changeOne();
+    changeOne();
+    emit ZtSignalCenter::getInstance()->signalObjectCreated(2, 5, nullptr);
+    changes.flush();
+    changeLengthUnit();
+    changes.flush();
+    QCOMPARE(m_batches.size(), 2);
+    QCOMPARE(m_batches.at(0).objects, QSet<KvDeskObjectId>({{1, 1}, {2, 5}}));
+    QVERIFY(!m_batches.at(0).isReadingChanged);
+    QVERIFY(m_batches.at(1).objects.isEmpty());
+    QVERIFY(m_batches.at(1).isReadingChanged);
+    QVERIFY(changes.batch().objects.isEmpty());
+}
+
+void KvDeskObjectChangesTest::emptiedTypesAreTold()
+{
+    KvDeskObjectChanges changes;
+    m_changes = &changes;
+    m_batches.clear();
+    connect(&changes, SIGNAL(signalChanged()), this, SLOT(slotChanged()));
+    ZtKernelData *const kernel = ZtKernelData::getInstance();
+    kernel->addObject(1, std::make_unique<ZtKernelObjectData>());
+    kernel->addObject(1, std::make_unique<ZtKernelObjectData>());
+    kernel->removeObject(1, 1);
+    changes.flush();
+    kernel->removeObject(1, 2);
+    kernel->addObject(1, std::make_unique<ZtKernelObjectData>());
+    changes.flush();
+    kernel->clearObjects();
+    QCOMPARE(m_batches.size(), 2);
+    QVERIFY(m_batches.at(0).emptiedTypes.isEmpty());
+    QCOMPARE(m_batches.at(1).emptiedTypes, QSet<int>({1}));
+}
+
+void KvDeskObjectChangesTest::changesOfReceiversComeNext()
+{
+    KvDeskObjectChanges changes;
+    m_changes = &changes;
+    m_batches.clear();
+    connect(&changes, SIGNAL(signalChanged()), this, SLOT(slotChanged()));
+    m_answers = true;
+    changeOne();
+    changes.flush();
+    m_answers = false;
+    changes.flush();
+    QCOMPARE(m_batches.size(), 2);
+    QCOMPARE(m_batches.at(1).objects, QSet<KvDeskObjectId>({{3, 4}}));
 }
 
 STATREPORT_TEST_MAIN(KvDeskObjectChangesTest)

@@ -80,6 +80,20 @@ void KvDeskPluginsTest::failures_data()
                                            "Its tools \"FailingPlugin tools\" could not be started");
     QTest::newRow("another program's")
         << folderOf("OtherPlugin") << QStringLiteral("It is no plug-in for this program");
+    QTest::newRow("throws while it starts")
+        << folderOf("ThrowingPlugin") << QStringLiteral("It failed: no licence for the tools");
+    QTest::newRow("throws while it is made")
+        << folderOf("UnbornPlugin") << QStringLiteral("It failed for a reason of its own");
+    QTest::newRow("lacks a library") << folderOf("UnresolvedPlugin") << QStringLiteral("functionOfNobody");
+    const QString cut = temporaryPath(QStringLiteral("cut"));
+    QDir().mkpath(cut);
+    const QByteArray whole = DeskFiles::bytes(folderOf("GoodPlugin") + QStringLiteral("/libGoodPlugin.so"));
+    DeskFiles::text(QStringLiteral("cut/Cut.so"), whole.left(whole.size() / 2));
+    QTest::newRow("cut in the middle") << cut << QStringLiteral("Cut.so");
+    const QString empty = temporaryPath(QStringLiteral("empty"));
+    QDir().mkpath(empty);
+    DeskFiles::text(QStringLiteral("empty/Empty.so"), "");
+    QTest::newRow("empty") << empty << QStringLiteral("Empty.so");
     const QString folder = temporaryPath(QStringLiteral("garbage"));
     QDir().mkpath(folder);
     DeskFiles::text(QStringLiteral("garbage/Garbage.so"), "this is no library");
@@ -97,6 +111,8 @@ void KvDeskPluginsTest::failures()
     QVERIFY2(warnings().first().startsWith(QStringLiteral("Plug-in not loaded: ") + folder),
              qPrintable(warnings().first()));
     QVERIFY2(warnings().first().contains(reason), qPrintable(warnings().first()));
+    // A reason is more than the name of the file.
+    QVERIFY(warnings().first().size() > folder.size() + 40);
     QCOMPARE(m_window.tools().size(), 0);
 }
 
@@ -107,9 +123,10 @@ void KvDeskPluginsTest::goodOnesWorkBesideBadOnes()
     DeskFiles::text(QStringLiteral("beside/A.so"), "this is no library");
     DeskFiles::text(QStringLiteral("beside/notes.txt"), "this is none, and does not pretend");
     KvDeskPlugins plugins(&m_window);
-    plugins.load({garbage, folderOf("FailingPlugin"), folderOf("OtherPlugin"), folderOf("GoodPlugin")});
+    plugins.load({garbage, folderOf("FailingPlugin"), folderOf("OtherPlugin"), folderOf("ThrowingPlugin"),
+                  folderOf("UnbornPlugin"), folderOf("UnresolvedPlugin"), folderOf("GoodPlugin")});
     QCOMPARE(plugins.count(), 1);
-    QCOMPARE(warnings().size(), 3);
+    QCOMPARE(warnings().size(), 6);
     QCOMPARE(m_window.tools().size(), 1);
     QCOMPARE(ZtStatusLog::getInstance()->entries().last().message, QStringLiteral("Plug-in loaded: ") +
                                                                        folderOf("GoodPlugin") +

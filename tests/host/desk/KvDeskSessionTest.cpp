@@ -6,6 +6,7 @@
 #include "kernel/ZtKernelData.h"
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtFault.h"
+#include "measuring/ZtLoadedSession.h"
 #include "measuring/ZtMeasuringDocument.h"
 
 namespace {
@@ -46,6 +47,10 @@ private slots:
     void failedImportChangesNothing();
     void clears();
     void opensWithoutItsImage();
+    void noticesOtherProgramsWriting();
+    void changesWhileSavingStayUnsaved();
+    void everyChangeIsAnnounced();
+    void restoredSessionIsUnsaved();
 
 private:
     std::unique_ptr<ZtMeasuringDocument> m_document;
@@ -206,6 +211,61 @@ void KvDeskSessionTest::opensWithoutItsImage()
     QVERIFY(m_session->open(path, true, &m_fault));
     QCOMPARE(m_session->path(), path);
     QCOMPARE(m_document->imagePath(), temporaryPath(QStringLiteral("gone.png")));
+}
+
+void KvDeskSessionTest::noticesOtherProgramsWriting()
+{
+    QVERIFY(!m_session->isChangedOnDisk());
+    const QString path = temporaryPath(QStringLiteral("watched.json"));
+    QVERIFY(m_session->save(path, &m_fault));
+    QVERIFY(!m_session->isChangedOnDisk());
+    const QByteArray bytes = DeskFiles::bytes(path);
+    DeskFiles::text(QStringLiteral("watched.json"), bytes + '\n');
+    QVERIFY(m_session->isChangedOnDisk());
+    QVERIFY(m_session->open(path, false, &m_fault));
+    QVERIFY(!m_session->isChangedOnDisk());
+    // Nothing would be lost by writing it again.
+    QVERIFY(QFile::remove(path));
+    QVERIFY(!m_session->isChangedOnDisk());
+    m_session->clear();
+    QVERIFY(!m_session->isChangedOnDisk());
+}
+
+void KvDeskSessionTest::changesWhileSavingStayUnsaved()
+{
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    const QString path = temporaryPath(QStringLiteral("meanwhile.json"));
+    const quint64 written = m_session->changeCount();
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    m_session->setSaved(path, written);
+    QCOMPARE(m_session->path(), path);
+    QVERIFY(m_session->isModified());
+    m_session->setSaved(path, m_session->changeCount());
+    QVERIFY(!m_session->isModified());
+}
+
+void KvDeskSessionTest::everyChangeIsAnnounced()
+{
+    QSignalSpy spy(m_session.get(), SIGNAL(signalChanged()));
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    m_document->addObject(ZtDrawnType::Line, diagonal);
+    QCOMPARE(spy.count(), 2);
+    QCOMPARE(m_session->changeCount(), quint64(2));
+    QVERIFY(m_session->open(DeskFiles::demoSession(), false, &m_fault));
+    QCOMPARE(spy.count(), 2);
+}
+
+void KvDeskSessionTest::restoredSessionIsUnsaved()
+{
+    ZtLoadedSession loaded;
+    QVERIFY(loaded.read(DeskFiles::demoSession(), &m_fault));
+    QSignalSpy replaced(m_session.get(), SIGNAL(signalReplaced()));
+    m_session->restore(&loaded, QStringLiteral("/x/original.json"), KvDeskFileStamp());
+    QCOMPARE(m_session->path(), QStringLiteral("/x/original.json"));
+    QVERIFY(m_session->isModified());
+    QCOMPARE(m_session->objectCount(), 33);
+    QVERIFY(m_document->frameSource());
+    QCOMPARE(replaced.count(), 1);
 }
 
 STATREPORT_TEST_MAIN(KvDeskSessionTest)

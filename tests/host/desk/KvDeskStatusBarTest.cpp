@@ -3,7 +3,10 @@
 
 #include "KvDeskResources.h"
 #include "KvDeskStatus.h"
+#include "measuring/ZtCalibration.h"
 #include "support/StatReportTest.h"
+
+Q_DECLARE_METATYPE(ZtCalibration)
 
 class KvDeskStatusBarTest : public StatReportTest
 {
@@ -18,6 +21,7 @@ private slots:
     void image_data();
     void image();
     void zoomAndPosition();
+    void statistics();
 };
 
 void KvDeskStatusBarTest::init()
@@ -61,21 +65,26 @@ void KvDeskStatusBarTest::categoryIsIconAndText()
 void KvDeskStatusBarTest::image_data()
 {
     QTest::addColumn<QSize>("size");
-    QTest::addColumn<double>("pixelSize");
+    QTest::addColumn<ZtCalibration>("calibration");
     QTest::addColumn<QString>("text");
-    QTest::newRow("none") << QSize() << 0.0 << QString();
-    QTest::newRow("none, calibrated") << QSize() << 2.5 << QString();
-    QTest::newRow("uncalibrated") << QSize(960, 720) << 0.0 << QStringLiteral("960 × 720 px");
-    QTest::newRow("calibrated") << QSize(960, 720) << 12.5 << QStringLiteral("960 × 720 px, 12.5 μm/px");
+    QTest::newRow("none") << QSize() << ZtCalibration() << QString();
+    QTest::newRow("none, calibrated") << QSize() << ZtCalibration(2.5) << QString();
+    QTest::newRow("uncalibrated") << QSize(960, 720) << ZtCalibration() << QStringLiteral("960 × 720 px");
+    QTest::newRow("calibrated") << QSize(960, 720) << ZtCalibration(12.5)
+                                << QStringLiteral("960 × 720 px, 12.5 μm/px");
+    ZtCalibration oblong(0.5, 0.25);
+    oblong.setObjective(QStringLiteral("10x"));
+    QTest::newRow("oblong pixels, objective")
+        << QSize(960, 720) << oblong << QStringLiteral("960 × 720 px, 10x, 0.5 × 0.25 μm/px");
 }
 
 void KvDeskStatusBarTest::image()
 {
     QFETCH(QSize, size);
-    QFETCH(double, pixelSize);
+    QFETCH(ZtCalibration, calibration);
     QFETCH(QString, text);
     KvDeskStatusBar bar;
-    bar.setImage(size, pixelSize);
+    bar.setImage(size, calibration);
     QCOMPARE(bar.imageText(), text);
 }
 
@@ -88,6 +97,24 @@ void KvDeskStatusBarTest::zoomAndPosition()
     QCOMPARE(bar.positionText(), QStringLiteral("x 12, y 3"));
     bar.slotPointerLeft();
     QCOMPARE(bar.positionText(), QString());
+}
+
+void KvDeskStatusBarTest::statistics()
+{
+    KvDeskStatusBar bar;
+    bar.show();
+    bar.slotSetStatistics(QStringLiteral("n = 2"), QStringLiteral("Details"));
+    QCOMPARE(bar.statisticsText(), QStringLiteral("n = 2"));
+    QLabel *shown = nullptr;
+    for (QLabel *const label : bar.findChildren<QLabel *>()) {
+        if (label->accessibleName() == QStringLiteral("Statistics of the selected values"))
+            shown = label;
+    }
+    QVERIFY(shown);
+    QVERIFY(shown->isVisible());
+    QCOMPARE(shown->toolTip(), QStringLiteral("Details"));
+    bar.slotSetStatistics(QString(), QString());
+    QVERIFY(!shown->isVisible());
 }
 
 STATREPORT_TEST_MAIN(KvDeskStatusBarTest)

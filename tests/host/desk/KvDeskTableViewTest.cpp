@@ -3,6 +3,8 @@
 
 #include "support/StatReportTest.h"
 
+#include <QMimeData>
+
 class KvDeskTableViewTest : public StatReportTest
 {
     Q_OBJECT
@@ -12,6 +14,8 @@ private slots:
     void copiesByShortcut();
     void nothingSelectedKeepsTheClipboard();
     void viewWithoutModelHasNoText();
+    void copiesHeadingsAndHtml();
+    void textsDoNotBreakTheTable();
 
 private:
     static void fill(QStandardItemModel *model)
@@ -64,6 +68,35 @@ void KvDeskTableViewTest::nothingSelectedKeepsTheClipboard()
 void KvDeskTableViewTest::viewWithoutModelHasNoText()
 {
     QCOMPARE(KvDeskTableView().selectedText(), QString());
+}
+
+void KvDeskTableViewTest::copiesHeadingsAndHtml()
+{
+    QStandardItemModel model;
+    fill(&model);
+    model.item(1, 0)->setText(QStringLiteral("a<1"));
+    model.setHorizontalHeaderLabels({QStringLiteral("A"), QStringLiteral("B")});
+    KvDeskTableView view;
+    view.setModel(&model);
+    view.selectRow(1);
+    QVERIFY(!view.selectedData()->html().contains(QLatin1String("<th>")));
+    view.setCopiesHeadings(true);
+    view.copyAction()->trigger();
+    const QMimeData *const copied = QGuiApplication::clipboard()->mimeData();
+    QCOMPARE(copied->text(), QStringLiteral("A\tB\na<1\tb1\n"));
+    QCOMPARE(copied->html(), QStringLiteral("<table>\n<tr><th>A</th><th>B</th></tr>\n"
+                                            "<tr><td>a&lt;1</td><td>b1</td></tr>\n</table>\n"));
+}
+
+void KvDeskTableViewTest::textsDoNotBreakTheTable()
+{
+    QStandardItemModel model;
+    model.appendRow(
+        {new QStandardItem(QStringLiteral("two\nlines")), new QStandardItem(QStringLiteral("a\tb"))});
+    KvDeskTableView view;
+    view.setModel(&model);
+    view.selectAll();
+    QCOMPARE(view.selectedText(), QStringLiteral("two lines\ta b\n"));
 }
 
 STATREPORT_TEST_MAIN(KvDeskTableViewTest)

@@ -3,10 +3,39 @@
 
 #include "KvDeskValueTableModel.h"
 #include "host/measuring/Polygon.h"
+#include "kernel/ZtGsManipulator.h"
+#include "kernel/ZtKernelData.h"
 #include "measuring/ZtCalibration.h"
+#include "measuring/ZtDrawnObjectData.h"
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "support/StatReportTest.h"
+
+#include <QAbstractItemModelTester>
+#include <QRandomGenerator>
+
+namespace {
+
+QPolygonF ofLength(double length)
+{
+    return polygon({QPointF(0, 0), QPointF(length, 0)});
+}
+
+void setLength(int line, double length)
+{
+    ZtKernelData *const kernel = ZtKernelData::getInstance();
+    static_cast<ZtDrawnObjectData *>(kernel->object(ZtDrawnType::Line, line))->setPoints(ofLength(length));
+    kernel->notifyObjectChanged(ZtDrawnType::Line, line);
+}
+
+void setName(int line, const QString &name)
+{
+    ZtKernelData *const kernel = ZtKernelData::getInstance();
+    kernel->getGsManipulator(ZtDrawnType::Line)->setObjectName(line, name);
+    kernel->notifyObjectChanged(ZtDrawnType::Line, line);
+}
+
+} // namespace
 
 class KvDeskValueSortModelTest : public StatReportTest
 {
@@ -15,6 +44,15 @@ class KvDeskValueSortModelTest : public StatReportTest
 private slots:
     void sorts_data();
     void sorts();
+    void filters_data();
+    void filters();
+    void unsortedIsTheOrderOfTheSource();
+    void keepsPersistentIndexes();
+    void changedRowMoves();
+    void rowComesAndGoesWithItsName();
+    void headersWithoutRows();
+    void staysInStep_data();
+    void staysInStep();
 
 private:
     static QStringList column(const QAbstractItemModel &model, int column)
@@ -57,6 +95,163 @@ void KvDeskValueSortModelTest::sorts()
     KvDeskValueSortModel model(&source);
     model.sort(column, order);
     QCOMPARE(KvDeskValueSortModelTest::column(model, column), expected);
+}
+
+void KvDeskValueSortModelTest::filters_data()
+{
+    QTest::addColumn<QString>("filter");
+    QTest::addColumn<QStringList>("expected");
+    const QStringList all{QStringLiteral("Width"), QStringLiteral("Height"), QStringLiteral("Area"),
+                          QStringLiteral("Length")};
+    QTest::newRow("nothing") << QString() << all;
+    QTest::newRow("blanks") << QStringLiteral("  ") << all;
+    QTest::newRow("type") << QStringLiteral("rectangle") << QStringList(all.mid(0, 3));
+    QTest::newRow("object") << QStringLiteral("screw") << QStringList(all.mid(3));
+    QTest::newRow("value name") << QStringLiteral("idt") << QStringList(all.mid(0, 1));
+    QTest::newRow("words in any column") << QStringLiteral("AREA rect") << QStringList(all.mid(2, 1));
+    QTest::newRow("all words have to match") << QStringLiteral("area line") << QStringList();
+    QTest::newRow("values do not count") << QStringLiteral("px") << QStringList();
+}
+
+void KvDeskValueSortModelTest::filters()
+{
+    QFETCH(QString, filter);
+    QFETCH(QStringList, expected);
+    ZtMeasuringDocument document;
+    document.addObject(ZtDrawnType::Rectangle, polygon({QPointF(0, 0), QPointF(3, 4)}));
+    document.addObject(ZtDrawnType::Line, ofLength(5), QStringLiteral("Screw"));
+    KvDeskValueTableModel source;
+    KvDeskValueSortModel model(&source);
+    const QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::QtTest);
+    model.setFilter(filter);
+    QCOMPARE(column(model, KvDeskValueTableModel::NameColumn), expected);
+    QCOMPARE(model.isFiltered(), !filter.trimmed().isEmpty());
+    model.setFilter(QString());
+    QCOMPARE(model.rowCount(), 4);
+}
+
+void KvDeskValueSortModelTest::unsortedIsTheOrderOfTheSource()
+{
+    ZtMeasuringDocument document;
+    for (const double length : {3.0, 1.0, 2.0})
+        document.addObject(ZtDrawnType::Line, ofLength(length));
+    KvDeskValueTableModel source;
+    KvDeskValueSortModel model(&source);
+    const QStringList unsorted = column(model, KvDeskValueTableModel::ObjectColumn);
+    model.sort(KvDeskValueTableModel::ValueColumn);
+    QVERIFY(column(model, KvDeskValueTableModel::ObjectColumn) != unsorted);
+    model.sort(-1);
+    QCOMPARE(column(model, KvDeskValueTableModel::ObjectColumn), unsorted);
+}
+
+void KvDeskValueSortModelTest::keepsPersistentIndexes()
+{
+    ZtMeasuringDocument document;
+    for (const double length : {3.0, 1.0, 2.0})
+        document.addObject(ZtDrawnType::Line, ofLength(length));
+    KvDeskValueTableModel source;
+    KvDeskValueSortModel model(&source);
+    const QPersistentModelIndex first = model.index(0, 3);
+    model.sort(KvDeskValueTableModel::ValueColumn);
+    QCOMPARE(first.row(), 2);
+    QCOMPARE(first.data().toString(), QStringLiteral("3.0 px"));
+}
+
+void KvDeskValueSortModelTest::changedRowMoves()
+{
+    ZtMeasuringDocument document;
+    for (const double length : {3.0, 1.0, 2.0})
+        document.addObject(ZtDrawnType::Line, ofLength(length));
+    KvDeskValueTableModel source;
+    KvDeskValueSortModel model(&source);
+    model.sort(KvDeskValueTableModel::ValueColumn, Qt::DescendingOrder);
+    const QSignalSpy resets(&model, SIGNAL(modelReset()));
+    QSignalSpy changes(&model, SIGNAL(dataChanged(QModelIndex,QModelIndex,QVector<int>)));
+    setLength(3, 9.0);
+    source.flush();
+    QCOMPARE(column(model, KvDeskValueTableModel::ObjectColumn),
+             QStringList({QStringLiteral("Line 3"), QStringLiteral("Line 1"), QStringLiteral("Line 2")}));
+    QCOMPARE(resets.count(), 0);
+    QCOMPARE(changes.count(), 1);
+    QCOMPARE(changes.first().first().toModelIndex().row(), 0);
+}
+
+void KvDeskValueSortModelTest::rowComesAndGoesWithItsName()
+{
+    ZtMeasuringDocument document;
+    document.addObject(ZtDrawnType::Line, ofLength(1.0));
+    document.addObject(ZtDrawnType::Line, ofLength(2.0), QStringLiteral("Screw"));
+    KvDeskValueTableModel source;
+    KvDeskValueSortModel model(&source);
+    model.setFilter(QStringLiteral("screw"));
+    setName(1, QStringLiteral("Screw 2"));
+    source.flush();
+    QCOMPARE(model.rowCount(), 2);
+    setName(2, QString());
+    source.flush();
+    QCOMPARE(column(model, KvDeskValueTableModel::ObjectColumn), QStringList(QStringLiteral("Screw 2")));
+}
+
+void KvDeskValueSortModelTest::headersWithoutRows()
+{
+    const ZtMeasuringDocument document;
+    KvDeskValueTableModel source;
+    const KvDeskValueSortModel model(&source);
+    QCOMPARE(model.rowCount(), 0);
+    QCOMPARE(model.headerData(1, Qt::Horizontal).toString(), QStringLiteral("Object"));
+}
+
+void KvDeskValueSortModelTest::staysInStep_data()
+{
+    QTest::addColumn<int>("column");
+    QTest::addColumn<Qt::SortOrder>("order");
+    QTest::addColumn<QString>("filter");
+    for (int column = -1; column < KvDeskValueTableModel::ColumnCount; ++column) {
+        for (const Qt::SortOrder order : {Qt::AscendingOrder, Qt::DescendingOrder}) {
+            for (const QString &filter : {QString(), QStringLiteral("2")})
+                QTest::addRow("column %d, order %d, filter %s", column, order, qPrintable(filter))
+                    << column << order << filter;
+        }
+    }
+}
+
+// Whatever happens, the rows are those that sorting and filtering everything gives.
+void KvDeskValueSortModelTest::staysInStep()
+{
+    QFETCH(int, column);
+    QFETCH(Qt::SortOrder, order);
+    QFETCH(QString, filter);
+    ZtMeasuringDocument document;
+    KvDeskValueTableModel source;
+    KvDeskValueSortModel model(&source);
+    const QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::QtTest);
+    model.sort(column, order);
+    model.setFilter(filter);
+    QRandomGenerator random(7);
+    for (int round = 0; round < 60; ++round) {
+        for (int i = random.bounded(1, 8); i > 0; --i) {
+            const int id = random.bounded(1, 25);
+            const int what = random.bounded(5);
+            if (!ZtKernelData::getInstance()->object(ZtDrawnType::Line, id))
+                document.addObject(ZtDrawnType::Line, ofLength(random.bounded(1, 9)), QString(), QString(),
+                                   id);
+            else if (what == 0)
+                ZtKernelData::getInstance()->removeObject(ZtDrawnType::Line, id);
+            else if (what == 1)
+                setName(id, QString::number(random.bounded(30)));
+            else
+                setLength(id, random.bounded(1, 9));
+        }
+        source.flush();
+        KvDeskValueSortModel expected(&source);
+        expected.sort(column, order);
+        expected.setFilter(filter);
+        QCOMPARE(model.rowCount(), expected.rowCount());
+        for (int row = 0; row < model.rowCount(); ++row) {
+            QCOMPARE(model.sourceRow(row), expected.sourceRow(row));
+            QCOMPARE(model.rowOf(model.sourceRow(row)), row);
+        }
+    }
 }
 
 STATREPORT_TEST_MAIN(KvDeskValueSortModelTest)

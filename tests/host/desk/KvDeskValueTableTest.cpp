@@ -1,17 +1,13 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskValueTable.h"
 
-#include "DeskFiles.h"
+#include "DeskValues.h"
 #include "KvDeskEmptyState.h"
 #include "KvDeskPanelHeader.h"
-#include "KvDeskResources.h"
-#include "KvDeskTableView.h"
-#include "KvDeskValueTableModel.h"
-#include "host/measuring/Polygon.h"
-#include "kernel/ZtKernelData.h"
-#include "measuring/ZtDrawnType.h"
-#include "measuring/ZtFault.h"
-#include "measuring/ZtMeasuringDocument.h"
+
+#include <QHeaderView>
+#include <QLineEdit>
+#include <QScrollBar>
 
 class KvDeskValueTableTest : public StatReportTest
 {
@@ -23,48 +19,34 @@ private slots:
 
     void emptyState();
     void countIsShown();
-    void selectingARowEmits();
-    void selectingAnObjectSelectsItsRows();
-    void selectionSurvivesNewObjects();
-    void selectionOfARemovedObjectIsGone();
     void copiesTheSelection();
+    void filtersWhileTyping();
+    void filterWithoutMatch();
+    void filterByKeys();
+    void filterNeedsValues();
+    void longNumbersBelowAreNotCut();
     void sortsByHeader();
     void numbersAreNeverCut();
     void columnsKeepTheirWidths();
 
 private:
-    void open();
-    QStringList selectedRows() const
-    {
-        return m_table->view()->selectedText().split(QLatin1Char('\n'), Qt::SkipEmptyParts);
-    }
+    void open() { QVERIFY(m_values->openDemo()); }
 
-    std::unique_ptr<ZtMeasuringDocument> m_document;
-    std::unique_ptr<KvDeskValueTable> m_table;
+    std::unique_ptr<DeskValues> m_values;
+    KvDeskValueTable *m_table = nullptr;
 };
 
 void KvDeskValueTableTest::init()
 {
     StatReportTest::init();
-    KvDeskResources::ensure();
-    m_document = std::make_unique<ZtMeasuringDocument>();
-    m_table = std::make_unique<KvDeskValueTable>();
-    m_table->resize(416, 500);
-    m_table->show();
+    m_values = std::make_unique<DeskValues>();
+    m_table = &m_values->table;
 }
 
 void KvDeskValueTableTest::cleanup()
 {
-    m_table.reset();
-    m_document.reset();
+    m_values.reset();
     StatReportTest::cleanup();
-}
-
-void KvDeskValueTableTest::open()
-{
-    ZtFault fault;
-    QVERIFY(m_document->loadSession(DeskFiles::demoSession(), &fault));
-    m_table->model()->flush();
 }
 
 void KvDeskValueTableTest::emptyState()
@@ -75,7 +57,7 @@ void KvDeskValueTableTest::emptyState()
     open();
     QVERIFY(!state->isVisible());
     QVERIFY(m_table->view()->horizontalHeader()->isVisible());
-    m_document->clear();
+    m_values->document.clear();
     m_table->model()->flush();
     QVERIFY(state->isVisible());
 }
@@ -87,67 +69,13 @@ void KvDeskValueTableTest::countIsShown()
     QCOMPARE(m_table->header()->note(), QStringLiteral("65"));
 }
 
-void KvDeskValueTableTest::selectingARowEmits()
-{
-    open();
-    QSignalSpy spy(m_table.get(), SIGNAL(signalObjectSelected(int,int)));
-    m_table->view()->selectRow(19); // the second line
-    QCOMPARE(spy.count(), 1);
-    QCOMPARE(spy.first(), QList<QVariant>({static_cast<int>(ZtDrawnType::Line), 2}));
-    m_table->view()->clearSelection();
-    QCOMPARE(spy.count(), 2);
-    QCOMPARE(spy.last(), QList<QVariant>({0, 0}));
-}
-
-void KvDeskValueTableTest::selectingAnObjectSelectsItsRows()
-{
-    open();
-    QSignalSpy spy(m_table.get(), SIGNAL(signalObjectSelected(int,int)));
-    m_table->slotSelectObject(ZtDrawnType::Circle, 15);
-    QCOMPARE(selectedRows().size(), 2);
-    QVERIFY(selectedRows().first().startsWith(QStringLiteral("Circle\tCircle 15\tDiameter\t")));
-    const QModelIndex current = m_table->view()->currentIndex();
-    QVERIFY(m_table->view()->viewport()->rect().intersects(m_table->view()->visualRect(current)));
-    m_table->slotSelectObject(0, 0);
-    QCOMPARE(selectedRows(), QStringList());
-    QCOMPARE(spy.count(), 0);
-}
-
-void KvDeskValueTableTest::selectionSurvivesNewObjects()
-{
-    open();
-    m_table->slotSelectObject(ZtDrawnType::Line, 2);
-    const int scrolled = m_table->view()->verticalScrollBar()->value();
-    QSignalSpy spy(m_table.get(), SIGNAL(signalObjectSelected(int,int)));
-    m_document->addObject(ZtDrawnType::Rectangle, polygon({QPointF(0, 0), QPointF(5, 5)}));
-    m_table->model()->flush();
-    QCOMPARE(m_table->model()->rowCount(), 68);
-    QCOMPARE(selectedRows().size(), 1);
-    QVERIFY(selectedRows().first().startsWith(QStringLiteral("Line\tLine 2\t")));
-    QCOMPARE(m_table->view()->verticalScrollBar()->value(), scrolled);
-    QCOMPARE(spy.count(), 0);
-}
-
-void KvDeskValueTableTest::selectionOfARemovedObjectIsGone()
-{
-    open();
-    m_table->slotSelectObject(ZtDrawnType::Line, 2);
-    QSignalSpy spy(m_table.get(), SIGNAL(signalObjectSelected(int,int)));
-    ZtKernelData::getInstance()->removeObject(ZtDrawnType::Line, 2);
-    m_table->model()->flush();
-    QCOMPARE(selectedRows(), QStringList());
-    QVERIFY(m_table->selectedObject().isNull());
-    QCOMPARE(spy.count(), 1);
-    QCOMPARE(spy.last(), QList<QVariant>({0, 0}));
-}
-
 void KvDeskValueTableTest::copiesTheSelection()
 {
     open();
     m_table->view()->selectRow(0);
     m_table->view()->slotCopy();
     QCOMPARE(QGuiApplication::clipboard()->text(),
-             QStringLiteral("Rectangle\tRectangle 1\tWidth\t1.072 mm\n"));
+             QStringLiteral("Type\tObject\tValue name\tValue\nRectangle\tRectangle 1\tWidth\t1.072 mm\n"));
 }
 
 void KvDeskValueTableTest::sortsByHeader()
@@ -180,6 +108,93 @@ void KvDeskValueTableTest::columnsKeepTheirWidths()
     QTRY_VERIFY(m_table->view()->columnWidth(0) < 120);
     m_table->resize(700, 500);
     QTRY_COMPARE(m_table->view()->columnWidth(0), 120);
+}
+
+void KvDeskValueTableTest::filtersWhileTyping()
+{
+    open();
+    const QAbstractItemModel *const shown = m_table->view()->model();
+    QSignalSpy resets(shown, SIGNAL(modelReset()));
+    QTest::keyClicks(m_table->filterField(), QStringLiteral("circle"));
+    // Not at every key.
+    QCOMPARE(shown->rowCount(), 65);
+    QVERIFY(resets.wait(5000));
+    QCOMPARE(resets.count(), 1);
+    QCOMPARE(shown->rowCount(), 30);
+    QCOMPARE(m_table->header()->note(), QStringLiteral("30 of 65"));
+    m_table->slotClearFilter();
+    QCOMPARE(shown->rowCount(), 65);
+    QCOMPARE(m_table->header()->note(), QStringLiteral("65"));
+}
+
+void KvDeskValueTableTest::filterWithoutMatch()
+{
+    open();
+    m_table->filterField()->setText(QStringLiteral("no such thing"));
+    QTest::keyClick(m_table->filterField(), Qt::Key_Return);
+    QCOMPARE(m_table->view()->model()->rowCount(), 0);
+    const QList<KvDeskEmptyState *> states = m_table->findChildren<KvDeskEmptyState *>();
+    QCOMPARE(states.size(), 2);
+    QVERIFY(!states.at(0)->isVisible());
+    QVERIFY(states.at(1)->isVisible());
+    QCOMPARE(states.at(1)->findChild<QLabel *>()->text(),
+             QStringLiteral("No measured value matches the filter"));
+    QVERIFY(m_table->view()->horizontalHeader()->isVisible());
+    QTest::mouseClick(states.at(1)->findChild<QPushButton *>(), Qt::LeftButton);
+    QCOMPARE(m_table->filterField()->text(), QString());
+    QCOMPARE(m_table->view()->model()->rowCount(), 65);
+    QVERIFY(!states.at(1)->isVisible());
+}
+
+void KvDeskValueTableTest::filterByKeys()
+{
+    open();
+    m_table->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(m_table));
+    QLineEdit *const field = m_table->filterField();
+    QVERIFY(field->isClearButtonEnabled());
+    m_table->slotFocusFilter();
+    QVERIFY(field->hasFocus());
+    QTest::keyClicks(field, QStringLiteral("arc"));
+    QTest::keyClick(field, Qt::Key_Down);
+    QVERIFY(m_table->view()->hasFocus());
+    QCOMPARE(m_table->view()->model()->rowCount(), 4);
+    m_table->slotFocusFilter();
+    QTest::keyClick(field, Qt::Key_Escape);
+    QVERIFY(field->hasFocus());
+    QCOMPARE(m_table->view()->model()->rowCount(), 65);
+    QTest::keyClick(field, Qt::Key_Escape);
+    QVERIFY(m_table->view()->hasFocus());
+}
+
+void KvDeskValueTableTest::filterNeedsValues()
+{
+    QVERIFY(!m_table->filterField()->isEnabled());
+    open();
+    QVERIFY(m_table->filterField()->isEnabled());
+    m_table->filterField()->setText(QStringLiteral("circle"));
+    QTest::keyClick(m_table->filterField(), Qt::Key_Return);
+    m_values->document.clear();
+    m_table->model()->flush();
+    // The filter that is still there can be taken back.
+    QVERIFY(m_table->filterField()->isEnabled());
+}
+
+// The table measures what it shows; the rest comes when it is scrolled to.
+void KvDeskValueTableTest::longNumbersBelowAreNotCut()
+{
+    QByteArray text("Object,Mass [g]\n");
+    for (int i = 0; i < 3000; ++i)
+        text += "Bolt " + QByteArray::number(i) + (i == 2998 ? ",1.23456789012\n" : ",5\n");
+    ZtFault fault;
+    QVERIFY(m_values->document.importTable(DeskFiles::text(QStringLiteral("long.csv"), text),
+                                           ZtTableImportOptions(), &fault));
+    m_table->model()->flush();
+    const QFontMetrics metrics(m_table->view()->font());
+    const int needed = metrics.horizontalAdvance(QStringLiteral("1.23456789012 g"));
+    m_table->resize(300, 500);
+    m_table->view()->scrollToBottom();
+    QTRY_VERIFY(m_table->view()->columnWidth(KvDeskValueTableModel::ValueColumn) >= needed + 16);
 }
 
 STATREPORT_TEST_MAIN(KvDeskValueTableTest)

@@ -21,6 +21,7 @@ private:
         environment.insert(QStringLiteral("QT_QPA_PLATFORM"), platform);
         environment.insert(QStringLiteral("STATREPORT_SETTINGS"),
                            temporaryPath(QStringLiteral("settings.ini")));
+        environment.insert(QStringLiteral("STATREPORT_RECOVERY_DIR"), temporaryPath(QStringLiteral("recovery")));
         return environment;
     }
 };

@@ -8,6 +8,7 @@
 #include "measuring/ZtCalibration.h"
 #include "measuring/ZtDrawnManipulator.h"
 #include "measuring/ZtDrawnObjectData.h"
+#include "measuring/ZtDrawnObjectPainter.h"
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtUnitSettings.h"
 
@@ -29,7 +30,11 @@ const double half = std::sqrt(0.5);
 struct Measured
 {
     explicit Measured(int type, double micrometresPerPixel = 0.0)
-        : calibration(std::make_shared<ZtCalibration>(micrometresPerPixel))
+        : Measured(type, ZtCalibration(micrometresPerPixel))
+    {}
+
+    Measured(int type, const ZtCalibration &made)
+        : calibration(std::make_shared<ZtCalibration>(made))
         , manipulator(*ZtDrawnType::find(type), calibration)
     {}
 
@@ -85,6 +90,11 @@ private slots:
     void measures_data();
     void measures();
     void followsTheCalibration();
+    void measuresInReality_data();
+    void measuresInReality();
+    void drawsCirclesOfReality();
+    void outlineIsThatOfTheRegisteredManipulator();
+    void labelsScaleBarsInReality();
     void readsInPixelsWithoutCalibration();
     void countsShares();
     void refusesPoints_data();
@@ -94,6 +104,7 @@ private slots:
     void drawsVisibly();
     void drawsNothingItCannotMeasure();
     void keepsLabelsOnThePicture();
+    void pageIsInTheUnitOfThePainter();
     void namesObjects();
 };
 
@@ -227,6 +238,96 @@ void ZtDrawnManipulatorTest::followsTheCalibration()
     QCOMPARE(measured.manipulator.valueText(QStringLiteral("Length"), &object), QStringLiteral("2.500 mm"));
 }
 
+// Pixels of 2 by 4 micrometres: 10 pixels across are as long as 5 down.
+void ZtDrawnManipulatorTest::measuresInReality_data()
+{
+    QTest::addColumn<int>("type");
+    QTest::addColumn<QPolygonF>("points");
+    QTest::addColumn<QString>("value");
+    QTest::addColumn<double>("expected");
+    const QPolygonF corners = polygon({{10, 20}, {40, 5}});
+    QTest::newRow("rectangle, width") << 66651 << corners << "Width" << 60.0;
+    QTest::newRow("rectangle, height") << 66651 << corners << "Height" << 60.0;
+    QTest::newRow("rectangle, area") << 66651 << corners << "Area" << 3600.0;
+    QTest::newRow("line across") << 66653 << polygon({{0, 0}, {10, 0}}) << "Length" << 20.0;
+    QTest::newRow("line down") << 66653 << polygon({{0, 0}, {0, 10}}) << "Length" << 40.0;
+    QTest::newRow("slanting line") << 66653 << polygon({{0, 0}, {6, 4}}) << "Length" << 20.0;
+    const QPolygonF quarter = polygon({{100, 0}, {100 * half, 50 * half}, {0, 50}});
+    QTest::newRow("arc, angle") << 66655 << quarter << "Angle" << 90.0;
+    QTest::newRow("arc, length") << 66655 << quarter << "Arc length" << 100.0 * pi;
+    const QPolygonF triangle = polygon({{0, 0}, {3, 0}, {3, 2}});
+    QTest::newRow("polygon, area") << 66656 << triangle << "Area" << 24.0;
+    QTest::newRow("polygon, perimeter") << 66656 << triangle << "Perimeter" << 24.0;
+    QTest::newRow("polyline") << 66658 << triangle << "Length" << 14.0;
+    QTest::newRow("parallel distance") << 66659 << polygon({{0, 0}, {4, 1.5}, {0, 2.5}}) << "Distance" << 8.0;
+    QTest::newRow("circle, diameter by a point beside")
+        << 66755 << polygon({{5, 5}, {15, 5}}) << "Diameter" << 40.0;
+    QTest::newRow("circle, diameter by a point below")
+        << 66755 << polygon({{5, 5}, {5, 10}}) << "Diameter" << 40.0;
+    QTest::newRow("circle, area") << 66755 << polygon({{5, 5}, {8, 7}}) << "Area" << 100.0 * pi;
+    QTest::newRow("counter") << 66741 << polygon({{0, 0}, {1, 1}, {1, 1}}) << "Count" << 3.0;
+}
+
+void ZtDrawnManipulatorTest::measuresInReality()
+{
+    QFETCH(int, type);
+    QFETCH(QPolygonF, points);
+    QFETCH(QString, value);
+    QFETCH(double, expected);
+    const Measured measured(type, ZtCalibration(2.0, 4.0));
+    const ZtDrawnObjectData object(points);
+    int kind = -1;
+    const double result = measured.manipulator.value(value, &object, kind).toDouble();
+    QVERIFY2(std::abs(result - expected) <= 1e-9 * expected, qPrintable(QString::number(result)));
+}
+
+// A circle in reality is an ellipse on an image of oblong pixels, and an arc is part of one.
+void ZtDrawnManipulatorTest::drawsCirclesOfReality()
+{
+    const Measured circle(ZtDrawnType::Circle, ZtCalibration(2.0, 4.0));
+    const QRectF ellipse = circle.manipulator.outline(polygon({{50, 50}, {60, 50}})).boundingRect();
+    QCOMPARE(ellipse, QRectF(40, 45, 20, 10));
+    const QRectF uncalibrated =
+        Measured(ZtDrawnType::Circle).manipulator.outline(polygon({{50, 50}, {60, 50}})).boundingRect();
+    QCOMPARE(uncalibrated, QRectF(40, 40, 20, 20));
+
+    const Measured arc(ZtDrawnType::Arc, ZtCalibration(2.0, 4.0));
+    const QPainterPath way = arc.manipulator.outline(polygon({{100, 0}, {100 * half, 50 * half}, {0, 50}}));
+    for (const double share : {0.1, 0.3, 0.5, 0.8}) {
+        const QPointF point = way.pointAtPercent(share);
+        QVERIFY(std::abs(std::hypot(point.x(), 2.0 * point.y()) - 100.0) < 0.1);
+    }
+
+    // The perpendicular of a parallel distance is one in reality.
+    const Measured parallel(ZtDrawnType::ParallelDistance, ZtCalibration(1.0, 2.0));
+    const QPainterPath lines = parallel.manipulator.outline(polygon({{0, 0}, {40, 10}, {0, 25}}));
+    const QPointF foot = lines.elementAt(lines.elementCount() - 2);
+    const QPointF along(40, 20);
+    QVERIFY(std::abs(QPointF::dotProduct(QPointF(-foot.x(), 2.0 * (25 - foot.y())), along)) < 1e-6);
+    QVERIFY(Measured(ZtDrawnType::Counter).manipulator.outline(polygon({{1, 1}})).isEmpty());
+}
+
+void ZtDrawnManipulatorTest::outlineIsThatOfTheRegisteredManipulator()
+{
+    ZtKernelData *kernel = ZtKernelData::getInstance();
+    const ZtDrawnType &type = *ZtDrawnType::find(ZtDrawnType::Circle);
+    const QPolygonF points = polygon({{50, 50}, {60, 50}});
+    QCOMPARE(ZtDrawnManipulator::outlineOf(type, points).boundingRect(), QRectF(40, 40, 20, 20));
+    kernel->registerType(
+        type.id, std::make_unique<ZtDrawnManipulator>(type, std::make_shared<ZtCalibration>(1.0, 0.5)),
+        std::make_unique<ZtKernelObjectDataDescr>(type.id, QLatin1String(type.key)));
+    const QRectF bounds = ZtDrawnManipulator::outlineOf(type, points).boundingRect();
+    kernel->unregisterType(type.id);
+    QCOMPARE(bounds, QRectF(40, 30, 20, 40));
+}
+
+void ZtDrawnManipulatorTest::labelsScaleBarsInReality()
+{
+    const Measured bar(ZtDrawnType::ScaleBar, ZtCalibration(2.0, 4.0));
+    const ZtDrawnObjectData object(polygon({{0, 0}, {0, 10}}));
+    QCOMPARE(bar.manipulator.labelText(1, &object), QStringLiteral("40.000 \u03BCm"));
+}
+
 void ZtDrawnManipulatorTest::readsInPixelsWithoutCalibration()
 {
     const ZtDrawnObjectData line(polygon({{0, 0}, {123.44, 0}}));
@@ -350,6 +451,18 @@ void ZtDrawnManipulatorTest::keepsLabelsOnThePicture()
         QVERIFY2(atCorner > inside * 3 / 4, qPrintable(QStringLiteral("%1 of %2").arg(atCorner).arg(inside)));
     }
     QCOMPARE(Drawing(ZtDrawnType::TextNote, polygon({{500, 500}}), Qt::black, 1.0, text).bright, 0);
+}
+
+// A picture of twice the resolution has half as many units as pixels.
+void ZtDrawnManipulatorTest::pageIsInTheUnitOfThePainter()
+{
+    QImage image(240, 120, QImage::Format_RGB32);
+    for (const double ratio : {1.0, 2.0}) {
+        image.setDevicePixelRatio(ratio);
+        QPainter painter(&image);
+        painter.scale(3.0, 3.0);
+        QCOMPARE(ZtDrawnObjectPainter::page(painter), QRectF(0, 0, 240 / ratio, 120 / ratio));
+    }
 }
 
 void ZtDrawnManipulatorTest::namesObjects()

@@ -190,6 +190,15 @@ void ZtMeasuringDocumentTest::changesTheCalibration()
     QCOMPARE(units.size(), 1);
     QCOMPARE(calibrations.size(), 1);
     QCOMPARE(contents(), QStringList(text("Line/Line 1: Length=10.000 μm [10, 1]")));
+    // Who calibrated changes no value.
+    ZtCalibration renamed(2.0);
+    renamed.setAuthor(text("somebody"));
+    document.setCalibration(renamed);
+    QCOMPARE(units.size(), 1);
+    QCOMPARE(calibrations.size(), 2);
+    QCOMPARE(document.calibration().author(), text("somebody"));
+    document.setCalibration(ZtCalibration(2.0, 3.0));
+    QCOMPARE(units.size(), 2);
 }
 
 void ZtMeasuringDocumentTest::loadsImages()

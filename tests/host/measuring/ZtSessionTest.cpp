@@ -70,7 +70,7 @@ QStringList cells(const ZtSession &session)
             for (const ZtImportedCell &cell : type.row(row.row))
                 result.append(QStringLiteral("%1/%2/%3 %4=%5 (%6)")
                                   .arg(type.name(), QString::number(row.id), row.name,
-                                       type.values().at(cell.valueIndex).name, cell.text,
+                                       type.values().at(cell.valueIndex).name, type.text(cell),
                                        QString::number(cell.value, 'g', 17)));
         }
     }
@@ -123,6 +123,8 @@ private slots:
     void readsTheLeast();
     void refuses_data();
     void refuses();
+    void writesTheNewestVersion();
+    void readsTheFirstVersion();
     void refusesDeepNesting_data();
     void refusesDeepNesting();
     void refusesEveryBeginning();
@@ -135,7 +137,9 @@ private slots:
 void ZtSessionTest::keepsDrawnObjects()
 {
     ZtSession session;
-    session.calibration = ZtCalibration(0.1234567890123456);
+    session.calibration = ZtCalibration(0.1234567890123456, 0.5);
+    session.calibration.setObjective(text("10x"));
+    session.calibration.setOrigin(ZtCalibration::Origin::KnownDistance);
     session.objects.append({ZtDrawnType::find(ZtDrawnType::Polygon),
                             7,
                             text("תא \"1\""),
@@ -242,6 +246,28 @@ void ZtSessionTest::readsTheLeast()
     QVERIFY(parsed("\xEF\xBB\xBF" + file("\"future\":{}")).objects.isEmpty());
 }
 
+void ZtSessionTest::writesTheNewestVersion()
+{
+    ZtSession session;
+    QVERIFY(session.toJson(text("a.json")).contains("\"version\":2"));
+    QVERIFY(!session.toJson(text("a.json")).contains("calibration"));
+    session.calibration = ZtCalibration(0.5);
+    const QByteArray bytes = session.toJson(text("a.json"));
+    QVERIFY2(bytes.contains("\"calibration\":{\"micrometresPerPixelX\":0.5,\"micrometresPerPixelY\":0.5,"
+                            "\"origin\":\"typed\"}"),
+             bytes.constData());
+    QVERIFY(!bytes.contains("\"micrometresPerPixel\""));
+}
+
+void ZtSessionTest::readsTheFirstVersion()
+{
+    QVERIFY(parsed(file("\"micrometresPerPixel\":0.25")).calibration == ZtCalibration(0.25));
+    // Each version has its own key.
+    QVERIFY(!parsed(file("\"calibration\":{}")).calibration.isCalibrated());
+    QVERIFY(!parsed("{\"format\":\"statreport-session\",\"version\":2,\"micrometresPerPixel\":1}")
+                 .calibration.isCalibrated());
+}
+
 void ZtSessionTest::refuses_data()
 {
     QTest::addColumn<QByteArray>("bytes");
@@ -252,8 +278,25 @@ void ZtSessionTest::refuses_data()
     QTest::newRow("another file") << QByteArray("{}") << "format: The file is not a session";
     QTest::newRow("no version") << QByteArray("{\"format\":\"statreport-session\"}")
                                 << "version: This must be a number";
-    QTest::newRow("newer") << QByteArray("{\"format\":\"statreport-session\",\"version\":2}")
-                           << "version: Sessions of version 2 are not known; this program reads version 1";
+    const auto version = [](const char *number) {
+        return QByteArray("{\"format\":\"statreport-session\",\"version\":") + number + "}";
+    };
+    QTest::newRow("newer")
+        << version("3")
+        << "version: The session is of the newer version 3; this program reads versions up to 2";
+    QTest::newRow("a little newer")
+        << version("2.5")
+        << "version: The session is of the newer version 2.5; this program reads versions up to 2";
+    QTest::newRow("version 0")
+        << version("0") << "version: Sessions of version 0 are not known; this program reads versions 1 to 2";
+    QTest::newRow("version of a fraction")
+        << version("1.5")
+        << "version: Sessions of version 1.5 are not known; this program reads versions 1 to 2";
+    QTest::newRow("calibration, number")
+        << version("2,\"calibration\":0.5") << "calibration: This must be an object";
+    QTest::newRow("calibration without size")
+        << version("2,\"calibration\":{\"micrometresPerPixelX\":1}")
+        << "calibration.micrometresPerPixelY: This must be a number greater than 0";
     QTest::newRow("image") << file("\"image\":5") << "image: This must be a text";
     QTest::newRow("calibration") << file("\"micrometresPerPixel\":0")
                                  << "micrometresPerPixel: This must be a number greater than 0";

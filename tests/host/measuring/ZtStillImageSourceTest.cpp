@@ -58,6 +58,12 @@ private slots:
     void refuses();
     void refusesUnreadableFiles();
     void refusesHugePicturesBeforeDecoding();
+    void offersDifferentSizesPerDirection();
+    void namesWhoStatesThePixelSize();
+    void showsDeepGreyByItsBits();
+    void refusesHugeFilesAtOnce_data();
+    void refusesHugeFilesAtOnce();
+    void isNotLive();
 };
 
 void ZtStillImageSourceTest::loadsPictures_data()
@@ -106,7 +112,7 @@ void ZtStillImageSourceTest::offersThePixelSize_data()
     QTest::newRow("96 dots per inch") << 3780 << 3780 << 0.0;
     QTest::newRow("96 dots per inch, cut off") << 3779 << 3779 << 0.0;
     QTest::newRow("144 dots per inch") << 5669 << 5669 << 0.0;
-    QTest::newRow("oblong pixels") << 1000000 << 500000 << 0.0;
+    QTest::newRow("oblong pixels") << 1000000 << 500000 << 1.0;
     QTest::newRow("rounded differently") << 100000 << 100001 << 10.0;
 }
 
@@ -173,6 +179,101 @@ void ZtStillImageSourceTest::refusesHugePicturesBeforeDecoding()
     const QString huge = write(QStringLiteral("huge.pgm"), "P5 30000 30000 255\n");
     QVERIFY(!ZtStillImageSource::load(huge, &fault));
     QCOMPARE(fault.message, QStringLiteral("The picture has 30000 x 30000 pixels, which is too many"));
+}
+
+void ZtStillImageSourceTest::offersDifferentSizesPerDirection()
+{
+    ZtFault fault;
+    const auto source =
+        ZtStillImageSource::load(writePicture(QStringLiteral("oblong.png"), 1000000, 500000), &fault);
+    QVERIFY(source);
+    const ZtOfferedPixelSize size = source->offeredPixelSize();
+    QVERIFY(size.isKnown());
+    QCOMPARE(size.x, 1.0);
+    QCOMPARE(size.y, 2.0);
+    const ZtCalibration offered = source->offeredCalibration();
+    QCOMPARE(offered.micrometresPerPixelX(), 1.0);
+    QCOMPARE(offered.micrometresPerPixelY(), 2.0);
+    QVERIFY(offered.origin() == ZtCalibration::Origin::Metadata);
+    QCOMPARE(offered.name(), QStringLiteral("oblong.png"));
+}
+
+void ZtStillImageSourceTest::namesWhoStatesThePixelSize()
+{
+    ZtFault fault;
+    const auto png = ZtStillImageSource::load(writePicture(QStringLiteral("a.png"), 10000, 10000), &fault);
+    QCOMPARE(png->offeredPixelSize().origin, QStringLiteral("PNG"));
+    QCOMPARE(png->offeredPixelSize().x, 100.0);
+    const auto tiff =
+        ZtStillImageSource::load(writePicture(QStringLiteral("a.tif"), 1000000, 1000000, "tiff"), &fault);
+    QCOMPARE(tiff->offeredPixelSize().origin, QStringLiteral("TIFF"));
+    QVERIFY(std::abs(tiff->offeredPixelSize().x - 1.0) < 1e-3);
+    const auto none = ZtStillImageSource::load(writePicture(QStringLiteral("b.png"), 0, 0), &fault);
+    QVERIFY(!none->offeredPixelSize().isKnown());
+    QCOMPARE(none->offeredPixelSize().origin, QString());
+}
+
+void ZtStillImageSourceTest::showsDeepGreyByItsBits()
+{
+    QImage deep(3, 1, QImage::Format_Grayscale16);
+    auto *const line = reinterpret_cast<quint16 *>(deep.bits());
+    line[0] = 0;
+    line[1] = 2048;
+    line[2] = 4095;
+    const QString path = temporaryPath(QStringLiteral("deep.png"));
+    QVERIFY(deep.save(path));
+    ZtFault fault;
+    const auto source = ZtStillImageSource::load(path, &fault);
+    QVERIFY(source);
+    QCOMPARE(source->greyBits(), 12);
+    QCOMPARE(source->frame().pixelColor(1, 0).red(), 128);
+    QCOMPARE(source->frame().pixelColor(2, 0).red(), 255);
+}
+
+void ZtStillImageSourceTest::refusesHugeFilesAtOnce_data()
+{
+    QTest::addColumn<QByteArray>("start");
+    QTest::newRow("zeros") << QByteArray();
+    QTest::newRow("TIFF whose directory is zeros") << QByteArray("II*\0\0\0\0\x40", 8);
+    QTest::newRow("large TIFF whose directory is zeros")
+        << QByteArray("II+\0\x08\0\0\0\0\0\0\x40\0\0\0\0", 16);
+    QTest::newRow("PNG") << QByteArray("\x89PNG\r\n\x1A\n");
+    QTest::newRow("JPEG") << QByteArray("\xFF\xD8\xFF");
+    QTest::newRow("BMP") << QByteArray("BM");
+}
+
+void ZtStillImageSourceTest::refusesHugeFilesAtOnce()
+{
+    QFETCH(QByteArray, start);
+    const QString path = write(QStringLiteral("huge.png"), start);
+    QFile file(path);
+    QVERIFY(file.resize(2300LL * 1000 * 1000)); // mostly a hole
+    QElapsedTimer clock;
+    clock.start();
+    ZtFault fault;
+    if (start.startsWith("\xFF\xD8")) {
+        // What Qt's decoder has to say.
+        expectWarning(QRegularExpression(QStringLiteral("extraneous bytes|no image|end of JPEG")));
+        expectWarning(QRegularExpression(QStringLiteral("extraneous bytes|no image|end of JPEG")));
+    }
+    QVERIFY(!ZtStillImageSource::load(path, &fault));
+    const qint64 elapsed = clock.elapsed();
+    file.remove();
+    QVERIFY2(elapsed < 5000, qPrintable(QString::number(elapsed)));
+    QVERIFY2(fault.message.startsWith(QLatin1String("The picture ")), qPrintable(fault.text()));
+}
+
+void ZtStillImageSourceTest::isNotLive()
+{
+    ZtFault fault;
+    const auto source = ZtStillImageSource::load(writePicture(QStringLiteral("still.png"), 0, 0), &fault);
+    QVERIFY(!source->isLive());
+    source->start();
+    QCOMPARE(source->state(), ZtFrameSource::Stopped);
+    QCOMPARE(source->frameRate(), 0.0);
+    QCOMPARE(source->droppedFrames(), 0ULL);
+    QVERIFY(!source->exposureRange());
+    QCOMPARE(source->exposure(), 0.0);
 }
 
 STATREPORT_TEST_MAIN(ZtStillImageSourceTest)

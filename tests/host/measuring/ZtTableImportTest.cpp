@@ -52,7 +52,8 @@ QStringList describe(const ZtImportedTable &table)
                 line += QStringLiteral(" \"%1\"").arg(type->rowName(row));
             line += QLatin1Char(':');
             for (const ZtImportedCell &cell : type->row(row))
-                line += QStringLiteral(" %1=%2;").arg(type->values().at(cell.valueIndex).name, cell.text);
+                line +=
+                    QStringLiteral(" %1=%2;").arg(type->values().at(cell.valueIndex).name, type->text(cell));
             lines.append(line);
         }
     }
@@ -294,6 +295,12 @@ void ZtTableImportTest::namesObjects_data()
     QTest::newRow("tidy, in the order of first sight")
         << QByteArray("id,variable,value\n9,a,1\n3,a,2\n9,b,3\n")
         << list("Object 1 \"Object 9\": a=1; b=3;|Object 2 \"Object 3\": a=2;");
+    QTest::newRow("tidy, named and numbered")
+        << QByteArray("type,object_index,object_name,variable,value\nX,9,p,a,1\nX,3,p,a,2\nX,9,p,b,3\n"
+                      "Y,9,Y 1,a,4\nY,10,,a,5\n")
+        << list("X 1 \"p\": a=1; b=3;|X 2 \"p\": a=2;|Y 1: a=4;|Y 2 \"Y 10\": a=5;");
+    QTest::newRow("wide, named and numbered") << QByteArray("object_index,object_name,size\n4,p,1\n5,q,2\n")
+                                              << list("Object 1 \"p\": size=1;|Object 2 \"q\": size=2;");
     QTest::newRow("wide blank only") << QByteArray("name,size\n\u3000,1\n") << list("Object 1: size=1;");
     QTest::newRow("type of wide blanks") << QByteArray("type,size\n\u3000,1\n") << list("Object 1: size=1;");
 }
@@ -414,7 +421,7 @@ void ZtTableImportTest::readsLongCells()
     QCOMPARE(table.objectCount(), 1);
     QCOMPARE(table.types.first()->rowName(0).size(), 10000);
     QCOMPARE(table.types.first()->values().first().name.size(), 10000);
-    QCOMPARE(table.types.first()->cell(0, 0)->text, QString::fromLatin1(digits));
+    QCOMPARE(table.types.first()->text(*table.types.first()->cell(0, 0)), QString::fromLatin1(digits));
 }
 
 void ZtTableImportTest::isFast()

@@ -1,0 +1,102 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskCalibrator.h"
+
+#include "KvDeskCalibrationText.h"
+#include "KvDeskObjectEditor.h"
+#include "KvDeskSession.h"
+#include "measuring/ZtMeasuringDocument.h"
+
+KvDeskCalibrator::KvDeskCalibrator(KvDeskSession *session, KvDeskObjectEditor *editor, QObject *parent)
+    : QObject(parent)
+    , m_session(session)
+    , m_editor(editor)
+{
+    connectSignals();
+}
+
+void KvDeskCalibrator::connectSignals()
+{
+    connect(m_session, SIGNAL(signalImageOpened()), this, SLOT(slotImageOpened()));
+    connect(m_session->document(), SIGNAL(signalImageChanged()), this, SLOT(slotImageChanged()));
+    connect(m_session->document(), SIGNAL(signalCalibrationChanged()), this, SLOT(slotCalibrationChanged()));
+    connect(&m_store, SIGNAL(signalChanged()), this, SIGNAL(signalChanged()));
+}
+
+KvDeskSelection *KvDeskCalibrator::selection() const
+{
+    return m_editor->selection();
+}
+
+ZtCalibration KvDeskCalibrator::current() const
+{
+    return m_session->document()->calibration();
+}
+
+ZtCalibration KvDeskCalibrator::offered() const
+{
+    return m_session->document()->offeredCalibration();
+}
+
+void KvDeskCalibrator::measureWith(const ZtCalibration &calibration)
+{
+    m_store.setLastObjective(calibration.objective());
+    m_editor->setCalibration(calibration);
+}
+
+void KvDeskCalibrator::calibrate(ZtCalibration calibration)
+{
+    calibration.setDate(QDateTime::currentDateTimeUtc());
+    if (!m_store.append(calibration))
+        return;
+    m_store.setAuthor(calibration.author());
+    measureWith(calibration);
+}
+
+void KvDeskCalibrator::useAgain(ZtCalibration calibration, const QString &author)
+{
+    if (calibration == m_store.current(calibration.objective())) {
+        measureWith(calibration);
+        return;
+    }
+    calibration.setAuthor(author);
+    calibrate(calibration);
+}
+
+void KvDeskCalibrator::slotUseOffered()
+{
+    ZtCalibration calibration = offered();
+    calibration.setObjective(current().objective());
+    calibration.setAuthor(m_store.author());
+    calibrate(calibration);
+}
+
+bool KvDeskCalibrator::isOtherOffered() const
+{
+    return offered().isCalibrated() && !offered().hasNearlySamePixelSize(current());
+}
+
+void KvDeskCalibrator::slotImageOpened()
+{
+    if (!isOtherOffered())
+        return;
+    const QString size = KvDeskCalibrationText::pixelSize(offered());
+    const QString name = offered().name();
+    const QString text = current().isCalibrated()
+                             ? tr("%1 states pixels of %2; the session measures with %3")
+                                   .arg(name, size, KvDeskCalibrationText::pixelSize(current()))
+                             : tr("%1 states pixels of %2; the session measures in pixels").arg(name, size);
+    emit signalOfferMade(text);
+}
+
+void KvDeskCalibrator::slotImageChanged()
+{
+    emit signalOfferWithdrawn();
+    emit signalChanged();
+}
+
+void KvDeskCalibrator::slotCalibrationChanged()
+{
+    if (!isOtherOffered())
+        emit signalOfferWithdrawn();
+    emit signalChanged();
+}

@@ -1,0 +1,134 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskCounterBar.h"
+
+#include "KvDeskCounterTool.h"
+#include "KvDeskImageView.h"
+#include "KvDeskSelection.h"
+#include "KvDeskToolBox.h"
+#include "gui/acss.h"
+#include "kernel/ZtGsManipulator.h"
+#include "kernel/ZtKernelData.h"
+
+#include <QComboBox>
+#include <QEvent>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QToolButton>
+#include <QVariant>
+
+namespace {
+
+constexpr int margin = 8;
+constexpr int classesWidth = 240;
+constexpr QSize iconSize(24, 24);
+constexpr QSize buttonSize(32, 28);
+
+} // namespace
+
+KvDeskCounterBar::KvDeskCounterBar(KvDeskToolBox *toolBox, KvDeskImageView *view)
+    : QFrame(view->viewport())
+    , m_toolBox(toolBox)
+    , m_view(view)
+{
+    setProperty("panel", true);
+    setAutoFillBackground(true);
+    setLayoutDirection(QGuiApplication::layoutDirection());
+    createWidgets();
+    connect(toolBox, SIGNAL(signalToolChanged()), this, SLOT(slotToolChanged()));
+    connect(&m_changes, SIGNAL(signalChanged()), this, SLOT(slotUpdate()));
+    connect(m_classes, SIGNAL(activated(int)), this, SLOT(slotChosen(int)));
+    connect(m_newClass, SIGNAL(clicked()), this, SLOT(slotNewClass()));
+    view->viewport()->installEventFilter(this);
+    slotToolChanged();
+}
+
+void KvDeskCounterBar::createWidgets()
+{
+    auto *const label = new QLabel(tr("Clicks count for"), this);
+    m_classes = new QComboBox(this);
+    m_classes->setFixedWidth(classesWidth);
+    m_classes->setAccessibleName(label->text());
+    m_classes->setToolTip(tr("The counter that gets the clicks (1 to 9)"));
+    m_newClass = new QToolButton(this);
+    m_newClass->setIcon(acss::createIcon(6, QStringLiteral("Icons/counter-new"), iconSize));
+    m_newClass->setIconSize(iconSize);
+    m_newClass->setFixedSize(buttonSize);
+    m_newClass->setAutoRaise(true);
+    m_newClass->setToolTip(tr("Count another class"));
+    m_newClass->setAccessibleName(m_newClass->toolTip());
+    auto *const hint = new QLabel(tr("A right click takes a place away"), this);
+    hint->setProperty("caption", true);
+    auto *const layout = new QHBoxLayout(this);
+    layout->setContentsMargins(margin, margin, margin, margin);
+    layout->setSpacing(margin);
+    layout->addWidget(label);
+    layout->addWidget(m_classes);
+    layout->addWidget(m_newClass);
+    layout->addWidget(hint);
+}
+
+void KvDeskCounterBar::slotToolChanged()
+{
+    const bool isCounting = m_view->tool() == m_toolBox->counterTool();
+    if (isCounting)
+        connect(m_view->selection(), SIGNAL(signalSelectionChanged()), this,
+                                            SLOT(slotUpdate()), Qt::UniqueConnection);
+    setVisible(isCounting);
+    slotUpdate();
+}
+
+QString KvDeskCounterBar::classText(const KvDeskObjectId &counter) const
+{
+    const ZtGsManipulator *const manipulator = ZtKernelData::getInstance()->getGsManipulator(counter.type);
+    const ZtKernelObjectData *const object = ZtKernelData::getInstance()->object(counter.type, counter.id);
+    QStringList parts{manipulator->getObjectName(counter.id)};
+    for (const QString &name : manipulator->getValueNames())
+        parts.append(manipulator->valueText(name, object));
+    return parts.join(QStringLiteral("  "));
+}
+
+void KvDeskCounterBar::slotUpdate()
+{
+    if (isHidden())
+        return;
+    m_counters = KvDeskCounterTool::counters();
+    QStringList texts;
+    for (const KvDeskObjectId &counter : qAsConst(m_counters))
+        texts.append(classText(counter));
+    if (texts.isEmpty())
+        texts.append(tr("A new counter"));
+    for (int i = 0; i < texts.size() && i < m_classes->count(); ++i)
+        m_classes->setItemText(i, texts.at(i));
+    while (m_classes->count() > texts.size())
+        m_classes->removeItem(m_classes->count() - 1);
+    while (m_classes->count() < texts.size())
+        m_classes->addItem(texts.at(m_classes->count()));
+    m_classes->setCurrentIndex(qMax(0, m_counters.indexOf(m_toolBox->counterTool()->counter())));
+    place();
+}
+
+void KvDeskCounterBar::slotChosen(int aIndex)
+{
+    if (aIndex < m_counters.size())
+        m_toolBox->counterTool()->choose(m_counters.at(aIndex));
+    m_view->setFocus();
+}
+
+void KvDeskCounterBar::slotNewClass()
+{
+    m_toolBox->counterTool()->addClass();
+    m_view->setFocus();
+}
+
+void KvDeskCounterBar::place()
+{
+    adjustSize();
+    move(qMax(0, (parentWidget()->width() - width()) / 2), margin);
+}
+
+bool KvDeskCounterBar::eventFilter(QObject *watched, QEvent *event)
+{
+    if (event->type() == QEvent::Resize && isVisible())
+        place();
+    return QFrame::eventFilter(watched, event);
+}

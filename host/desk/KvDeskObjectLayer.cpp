@@ -1,0 +1,117 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskObjectLayer.h"
+
+#include "KvDeskObjectIndex.h"
+#include "measuring/ZtObjectsPainter.h"
+
+#include <QPainter>
+
+#include <cmath>
+
+namespace {
+
+constexpr int lineRoom = 9;        ///< pixels by which lines and markers reach beyond an object's bounds
+constexpr int mostRectangles = 48; ///< beyond that it is quicker to draw everything between them, too
+
+bool isWhole(double number)
+{
+    return std::abs(number - std::round(number)) < 1e-6;
+}
+
+} // namespace
+
+void KvDeskObjectLayer::invalidate()
+{
+    m_isStale = true;
+    m_dirty = QRegion();
+}
+
+void KvDeskObjectLayer::invalidate(const QRectF &sceneRect)
+{
+    if (m_isStale || sceneRect.isNull())
+        return;
+    // Computed in floating point first: far outside of the view there are no pixels.
+    const QRectF onView = m_toView.mapRect(sceneRect).adjusted(-lineRoom, -lineRoom, lineRoom, lineRoom);
+    const QRectF view(QPointF(), QSizeF(m_image.size()) / m_image.devicePixelRatio());
+    m_dirty += (onView & view).toAlignedRect();
+    if (m_dirty.rectCount() > mostRectangles)
+        m_dirty = m_dirty.boundingRect();
+}
+
+void KvDeskObjectLayer::settle(const KvDeskObjectId &object, const QRectF &sceneRect)
+{
+    if (m_lifted.remove(object))
+        invalidate(sceneRect);
+}
+
+void KvDeskObjectLayer::prepare(const QTransform &toView, const QSize &size, double pixelRatio)
+{
+    const QSize deviceSize(qCeil(size.width() * pixelRatio), qCeil(size.height() * pixelRatio));
+    const bool isSameImage = m_image.size() == deviceSize && m_image.devicePixelRatio() == pixelRatio;
+    if (!isSameImage) {
+        m_image = QImage(deviceSize, QImage::Format_ARGB32_Premultiplied);
+        m_image.setDevicePixelRatio(pixelRatio);
+        m_isStale = true;
+    }
+    const bool isSamePlace = toView == m_toView;
+    if (!m_isStale && !isSamePlace && !scroll(toView))
+        m_isStale = true;
+    m_toView = toView;
+    if (m_isStale)
+        m_dirty = QRect(QPoint(), size);
+    m_isStale = false;
+}
+
+bool KvDeskObjectLayer::scroll(const QTransform &toView)
+{
+    const double ratio = m_image.devicePixelRatio();
+    const double x = (toView.dx() - m_toView.dx()) * ratio;
+    const double y = (toView.dy() - m_toView.dy()) * ratio;
+    const bool isShift = toView.m11() == m_toView.m11() && toView.m22() == m_toView.m22();
+    if (!isShift || !isWhole(x) || !isWhole(y) || !isWhole(x / ratio) || !isWhole(y / ratio) ||
+        std::abs(x) >= m_image.width() || std::abs(y) >= m_image.height())
+        return false;
+    const QPoint shift(qRound(x / ratio), qRound(y / ratio));
+    QImage moved(m_image.size(), m_image.format());
+    moved.setDevicePixelRatio(ratio);
+    QPainter painter(&moved);
+    painter.setCompositionMode(QPainter::CompositionMode_Source);
+    painter.drawImage(shift, m_image);
+    painter.end();
+    m_image = moved;
+    const QRect view(QPoint(), QSizeF(QSizeF(m_image.size()) / ratio).toSize());
+    m_dirty = m_dirty.translated(shift) & view;
+    m_dirty += QRegion(view).subtracted(view.translated(shift));
+    return true;
+}
+
+void KvDeskObjectLayer::draw(QPainter *painter, const KvDeskObjectIndex &index, const QTransform &toView,
+                             const QSize &size, double pixelRatio)
+{
+    prepare(toView, size, pixelRatio);
+    for (const QRect &rect : m_dirty)
+        redraw(index, rect);
+    m_dirty = QRegion();
+    painter->save();
+    painter->setWorldTransform(QTransform());
+    painter->drawImage(QPointF(), m_image);
+    painter->restore();
+}
+
+void KvDeskObjectLayer::redraw(const KvDeskObjectIndex &index, const QRect &rect)
+{
+    QPainter painter(&m_image);
+    painter.setClipRect(rect);
+    painter.setCompositionMode(QPainter::CompositionMode_Source);
+    painter.fillRect(rect, Qt::transparent);
+    painter.setCompositionMode(QPainter::CompositionMode_SourceOver);
+    painter.setWorldTransform(m_toView);
+    const QRectF area =
+        m_toView.inverted().mapRect(QRectF(rect).adjusted(-lineRoom, -lineRoom, lineRoom, lineRoom));
+    for (const KvDeskObjectId &object : index.objectsIn(area)) {
+        if (m_lifted.contains(object))
+            continue;
+        ZtObjectsPainter::drawShape(&painter, {object.type, object.id});
+        ++m_drawnObjects;
+    }
+}

@@ -1,0 +1,52 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QImage>
+#include <QRegion>
+#include <QSet>
+#include <QTransform>
+
+#include "KvDeskObjectId.h"
+
+class KvDeskObjectIndex;
+class QPainter;
+
+/**
+ * The picture of all objects as they lie in the view, kept from one frame to the next: only what changed is
+ * drawn again, and when the view moves only what comes into sight.
+ */
+class KvDeskObjectLayer
+{
+public:
+    void invalidate();
+    /** What is drawn in a rectangle of the scene is out of date. */
+    void invalidate(const QRectF &sceneRect);
+    /** An object that changes all the time is left out, until it is settled. */
+    void lift(const KvDeskObjectId &object) { m_lifted.insert(object); }
+    bool isLifted(const KvDeskObjectId &object) const { return m_lifted.contains(object); }
+    const QSet<KvDeskObjectId> &lifted() const { return m_lifted; }
+    void settle(const KvDeskObjectId &object, const QRectF &sceneRect);
+
+    /**
+     * Brings the picture up to date and draws it.
+     * \param toView from the scene to the view, without turning
+     * \param size   of the view in device-independent pixels
+     */
+    void draw(QPainter *painter, const KvDeskObjectIndex &index, const QTransform &toView, const QSize &size,
+              double pixelRatio);
+
+    /** Objects drawn since the layer was made, to count the work. */
+    qint64 drawnObjects() const { return m_drawnObjects; }
+
+private:
+    void prepare(const QTransform &toView, const QSize &size, double pixelRatio);
+    bool scroll(const QTransform &toView);
+    void redraw(const KvDeskObjectIndex &index, const QRect &rect);
+
+    QImage m_image;
+    QTransform m_toView;
+    QRegion m_dirty; ///< in device-independent pixels of the view
+    QSet<KvDeskObjectId> m_lifted;
+    qint64 m_drawnObjects = 0;
+    bool m_isStale = true; ///< all of it is out of date
+};

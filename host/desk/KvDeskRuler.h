@@ -1,0 +1,58 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QVector>
+#include <QWidget>
+
+#include <optional>
+
+/** A ruler along an edge of the image: in pixels, or in a unit of length once the image is calibrated. */
+class KvDeskRuler : public QWidget
+{
+    Q_OBJECT
+public:
+    struct Tick
+    {
+        double position; ///< in pixels of the ruler
+        double value;    ///< in the ruler's unit
+        bool isLabelled;
+    };
+
+    static constexpr int thickness = 24;
+
+    explicit KvDeskRuler(Qt::Orientation orientation, QWidget *parent = nullptr);
+
+    /**
+     * \param origin    where the image begins, in pixels of the ruler
+     * \param scale     pixels of the ruler per pixel of the image
+     * \param pixelSize micrometres per pixel of the image; 0 for none
+     */
+    void setScale(double origin, double scale, double pixelSize);
+    /** The place of the pointer in pixels of the ruler, or none. */
+    void setPointer(std::optional<double> position);
+
+    QString unitText() const { return m_unitText; }
+
+    /**
+     * Marks at round numbers (1, 2 or 5 times a power of ten), the labelled ones far enough apart for their
+     * texts.
+     * \param origin       position of 0
+     * \param pixelsPerUnit from value to position
+     * \param length       of the ruler in pixels
+     */
+    static QVector<Tick> ticks(double origin, double pixelsPerUnit, double length);
+
+protected:
+    void paintEvent(QPaintEvent *event) override;
+
+private:
+    double length() const;
+    void drawTick(QPainter *painter, const Tick &tick) const;
+    void drawPointer(QPainter *painter) const;
+
+    Qt::Orientation m_orientation;
+    double m_origin = 0.0;
+    double m_pixelsPerUnit = 1.0;
+    QString m_unitText;
+    std::optional<double> m_pointer;
+};

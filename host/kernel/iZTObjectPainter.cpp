@@ -1,0 +1,4 @@
+// SPDX-License-Identifier: MIT
+#include "kernel/iZTObjectPainter.h"
+
+iZTObjectPainter::~iZTObjectPainter() = default;

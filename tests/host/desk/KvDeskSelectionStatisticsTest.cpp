@@ -1,0 +1,147 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskSelectionStatistics.h"
+
+#include "kernel/ZtAppSettings.h"
+#include "kernel/ZtGsManipulator.h"
+#include "support/StatReportTest.h"
+
+#include <limits>
+
+namespace {
+
+using Group = KvDeskSelectionStatistics::Group;
+
+Group group(const QString &name, int kind, const QVector<double> &numbers, const QString &unit = QString())
+{
+    Group result;
+    result.valueName = name;
+    result.kind = kind;
+    result.unit = unit;
+    for (const double number : numbers)
+        result.numbers.add(number);
+    return result;
+}
+
+Group lengths(const QVector<double> &numbers)
+{
+    return group(QStringLiteral("Length"), ZtGsManipulator::Length, numbers);
+}
+
+void setSetting(const QString &key, const QVariant &value)
+{
+    ZtAppSettings::beginGroup(QStringLiteral("Measurement"));
+    ZtAppSettings::setValue(key, value);
+    ZtAppSettings::endGroup();
+}
+
+} // namespace
+
+Q_DECLARE_METATYPE(Group)
+
+class KvDeskSelectionStatisticsTest : public StatReportTest
+{
+    Q_OBJECT
+
+private slots:
+    void cleanup();
+
+    void texts_data();
+    void texts();
+    void followsTheSettings();
+    void details();
+    void detailsOfAMixture();
+};
+
+void KvDeskSelectionStatisticsTest::cleanup()
+{
+    ZtAppSettings::getInstance()->setStoragePath(QString());
+    StatReportTest::cleanup();
+}
+
+void KvDeskSelectionStatisticsTest::texts_data()
+{
+    QTest::addColumn<QVector<Group>>("groups");
+    QTest::addColumn<QString>("text");
+    const auto row = [](const char *name, const QVector<Group> &groups, const char *text) {
+        QTest::newRow(name) << groups << QString::fromUtf8(text);
+    };
+    using M = ZtGsManipulator;
+    const double nan = std::numeric_limits<double>::quiet_NaN();
+    row("nothing", {}, "");
+    row("group of nothing", {lengths({})}, "");
+    row("one value", {lengths({1500.0})}, "1.500 mm");
+    row("values of one name", {lengths({10, 20, 30})},
+        "n = 3, mean 20.000 μm, SD 10.000 μm, min 10.000 μm, max 30.000 μm");
+    row("values of one kind", {lengths({10}), group(QStringLiteral("Width"), M::Length, {30})},
+        "n = 2, mean 20.000 μm, SD 14.142 μm, min 10.000 μm, max 30.000 μm");
+    row("mixed kinds", {lengths({10, 30}), group(QStringLiteral("Area"), M::Area, {5, 7})},
+        "Length: n = 2, mean 20.000 μm, SD 14.142 μm, min 10.000 μm, max 30.000 μm");
+    row("mixed kinds, first of two names",
+        {group(QStringLiteral("Width"), M::Length, {10}), lengths({20}),
+         group(QStringLiteral("Area"), M::Area, {5})},
+        "Width: 10.000 μm");
+    row("mean of counts", {group(QStringLiteral("Count"), M::Count, {2, 3})},
+        "n = 2, mean 2.500 pcs, SD 0.707 pcs, min 2.000 pcs, max 3.000 pcs");
+    row("shares", {group(QStringLiteral("Share"), M::Percentage, {25, 75})},
+        "n = 2, mean 50.000 %, SD 35.355 %, min 25.000 %, max 75.000 %");
+    row("angles", {group(QStringLiteral("Angle"), M::Angle, {90, 90})},
+        "n = 2, mean 90.000 °, SD 0.000 °, min 90.000 °, max 90.000 °");
+    row("unit without a kind", {group(QStringLiteral("Mass"), M::NoKind, {1, 2}, QStringLiteral("g"))},
+        "n = 2, mean 1.500 g, SD 0.707 g, min 1.000 g, max 2.000 g");
+    row("mixed units without a kind",
+        {group(QStringLiteral("Mass"), M::NoKind, {1}, QStringLiteral("g")),
+         group(QStringLiteral("Time"), M::NoKind, {2}, QStringLiteral("s"))},
+        "Mass: 1.000 g");
+    row("same name in two units",
+        {group(QStringLiteral("Length"), M::NoKind, {1}, QStringLiteral("px")), lengths({2})},
+        "Length: 1.000 px");
+    row("no number", {lengths({nan, nan})}, "");
+    row("some numbers", {lengths({nan, 10, 20})},
+        "n = 2, mean 15.000 μm, SD 7.071 μm, min 10.000 μm, max 20.000 μm");
+}
+
+void KvDeskSelectionStatisticsTest::texts()
+{
+    QFETCH(QVector<Group>, groups);
+    QFETCH(QString, text);
+    KvDeskSelectionStatistics statistics;
+    for (const Group &group : qAsConst(groups))
+        statistics.add(group);
+    QCOMPARE(statistics.text(), text);
+    QCOMPARE(statistics.details().isEmpty(), text.isEmpty());
+}
+
+void KvDeskSelectionStatisticsTest::followsTheSettings()
+{
+    setSetting(QStringLiteral("LengthUnit"), QStringLiteral("mm"));
+    setSetting(QStringLiteral("MeasurementLabelsSignDigits"), 3U);
+    KvDeskSelectionStatistics statistics;
+    statistics.add(lengths({1000, 3000}));
+    QCOMPARE(statistics.text(), QStringLiteral("n = 2, mean 2.00 mm, SD 1.41 mm, min 1.00 mm, max 3.00 mm"));
+}
+
+void KvDeskSelectionStatisticsTest::details()
+{
+    KvDeskSelectionStatistics statistics;
+    statistics.add(lengths({1, 2}));
+    QCOMPARE(statistics.details(),
+             QString::fromUtf8("Selected values: 2\nMean: 1.50000000 μm\nStandard deviation: 707.106781 nm\n"
+                               "Smallest: 1.00000000 μm\nLargest: 2.00000000 μm"));
+    QVERIFY(!statistics.isMixed());
+}
+
+void KvDeskSelectionStatisticsTest::detailsOfAMixture()
+{
+    KvDeskSelectionStatistics statistics;
+    statistics.add(lengths({1}));
+    statistics.add(group(QStringLiteral("Area"), ZtGsManipulator::Area, {5, 7}));
+    QVERIFY(statistics.isMixed());
+    QCOMPARE(statistics.count(), 3);
+    QCOMPARE(statistics.numbers().count(), 1);
+    QCOMPARE(statistics.details(),
+             QString::fromUtf8("Selected values: 3\n\"Length\" among them: 1\nMean: 1.00000000 μm\n"
+                               "Smallest: 1.00000000 μm\nLargest: 1.00000000 μm"));
+}
+
+STATREPORT_TEST_MAIN(KvDeskSelectionStatisticsTest)
+#include "KvDeskSelectionStatisticsTest.moc"
