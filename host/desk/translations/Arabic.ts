@@ -5,516 +5,516 @@
     <name>KvDeskActions</name>
     <message>
         <source>&amp;New session</source>
-        <translation type="unfinished"></translation>
+        <translation>جلسة &amp;جديدة</translation>
     </message>
     <message>
         <source>Start an empty session</source>
-        <translation type="unfinished"></translation>
+        <translation>بدء جلسة فارغة</translation>
     </message>
     <message>
         <source>Open &amp;image...</source>
-        <translation type="unfinished"></translation>
+        <translation>فتح &amp;صورة...</translation>
     </message>
     <message>
         <source>Open image</source>
-        <translation type="unfinished"></translation>
+        <translation>فتح صورة</translation>
     </message>
     <message>
         <source>&amp;Open session...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;فتح جلسة...</translation>
     </message>
     <message>
         <source>Open session</source>
-        <translation type="unfinished"></translation>
+        <translation>فتح جلسة</translation>
     </message>
     <message>
         <source>Import &amp;table...</source>
-        <translation type="unfinished"></translation>
+        <translation>ا&amp;ستيراد جدول...</translation>
     </message>
     <message>
         <source>Import table of measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>استيراد جدول قيم مقيسة</translation>
     </message>
     <message>
         <source>&amp;Save session</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;حفظ الجلسة</translation>
     </message>
     <message>
         <source>Save session</source>
-        <translation type="unfinished"></translation>
+        <translation>حفظ الجلسة</translation>
     </message>
     <message>
         <source>Save session &amp;as...</source>
-        <translation type="unfinished"></translation>
+        <translation>حفظ الجلسة &amp;باسم...</translation>
     </message>
     <message>
         <source>Save session to another file</source>
-        <translation type="unfinished"></translation>
+        <translation>حفظ الجلسة في ملف آخر</translation>
     </message>
     <message>
         <source>&amp;Quit</source>
-        <translation type="unfinished"></translation>
+        <translation>خ&amp;روج</translation>
     </message>
     <message>
         <source>Quit the program</source>
-        <translation type="unfinished"></translation>
+        <translation>الخروج من البرنامج</translation>
     </message>
     <message>
         <source>Zoom &amp;in</source>
-        <translation type="unfinished"></translation>
+        <translation>ت&amp;كبير</translation>
     </message>
     <message>
         <source>Zoom in</source>
-        <translation type="unfinished"></translation>
+        <translation>تكبير</translation>
     </message>
     <message>
         <source>Zoom &amp;out</source>
-        <translation type="unfinished"></translation>
+        <translation>ت&amp;صغير</translation>
     </message>
     <message>
         <source>Zoom out</source>
-        <translation type="unfinished"></translation>
+        <translation>تصغير</translation>
     </message>
     <message>
         <source>&amp;Fit to window</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;ملاءمة النافذة</translation>
     </message>
     <message>
         <source>Show the whole image</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار الصورة كاملة</translation>
     </message>
     <message>
         <source>&amp;Actual size</source>
-        <translation type="unfinished"></translation>
+        <translation>ال&amp;حجم الفعلي</translation>
     </message>
     <message>
         <source>Show the image at 100 %</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار الصورة بنسبة 100 %</translation>
     </message>
     <message>
         <source>&amp;Measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>ال&amp;قيم المقيسة</translation>
     </message>
     <message>
         <source>Show or hide the measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار القيم المقيسة أو إخفاؤها</translation>
     </message>
     <message>
         <source>Status &amp;log</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;سجل الحالة</translation>
     </message>
     <message>
         <source>Show or hide the status log</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار سجل الحالة أو إخفاؤه</translation>
     </message>
     <message>
         <source>&amp;Dark or light theme</source>
-        <translation type="unfinished"></translation>
+        <translation>سمة &amp;داكنة أو فاتحة</translation>
     </message>
     <message>
         <source>Change between the dark and the light theme</source>
-        <translation type="unfinished"></translation>
+        <translation>التبديل بين السمة الداكنة والفاتحة</translation>
     </message>
     <message>
         <source>S&amp;ettings...</source>
-        <translation type="unfinished"></translation>
+        <translation>الإ&amp;عدادات...</translation>
     </message>
     <message>
         <source>Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>الإعدادات</translation>
     </message>
     <message>
         <source>&amp;About Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;حول Measuring Desk</translation>
     </message>
     <message>
         <source>About Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>حول Measuring Desk</translation>
     </message>
     <message>
         <source>%1 (%2)</source>
         <comment>command (shortcut)</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 (%2)</translation>
     </message>
     <message>
         <source>&amp;Export measured values...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;تصدير القيم المقيسة...</translation>
     </message>
     <message>
         <source>Export measured values as a table</source>
-        <translation type="unfinished"></translation>
+        <translation>تصدير القيم المقيسة كجدول</translation>
     </message>
     <message>
         <source>&amp;Undo</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;تراجع</translation>
     </message>
     <message>
         <source>Undo the last step</source>
-        <translation type="unfinished"></translation>
+        <translation>التراجع عن الخطوة الأخيرة</translation>
     </message>
     <message>
         <source>&amp;Redo</source>
-        <translation type="unfinished"></translation>
+        <translation>إ&amp;عادة</translation>
     </message>
     <message>
         <source>Redo what was undone</source>
-        <translation type="unfinished"></translation>
+        <translation>إعادة ما تم التراجع عنه</translation>
     </message>
     <message>
         <source>Cu&amp;t</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;قص</translation>
     </message>
     <message>
         <source>Cut the selected objects</source>
-        <translation type="unfinished"></translation>
+        <translation>قص الكائنات المحددة</translation>
     </message>
     <message>
         <source>&amp;Copy</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;نسخ</translation>
     </message>
     <message>
         <source>Copy the selected objects</source>
-        <translation type="unfinished"></translation>
+        <translation>نسخ الكائنات المحددة</translation>
     </message>
     <message>
         <source>&amp;Paste</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;لصق</translation>
     </message>
     <message>
         <source>Paste copied objects</source>
-        <translation type="unfinished"></translation>
+        <translation>لصق الكائنات المنسوخة</translation>
     </message>
     <message>
         <source>&amp;Delete</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;حذف</translation>
     </message>
     <message>
         <source>Delete the selected objects</source>
-        <translation type="unfinished"></translation>
+        <translation>حذف الكائنات المحددة</translation>
     </message>
     <message>
         <source>Select &amp;all</source>
-        <translation type="unfinished"></translation>
+        <translation>تحديد ال&amp;كل</translation>
     </message>
     <message>
         <source>Select all objects on the image</source>
-        <translation type="unfinished"></translation>
+        <translation>تحديد كل الكائنات على الصورة</translation>
     </message>
     <message>
         <source>Re&amp;name</source>
-        <translation type="unfinished"></translation>
+        <translation>إعادة ت&amp;سمية</translation>
     </message>
     <message>
         <source>Give the selected object a name</source>
-        <translation type="unfinished"></translation>
+        <translation>إعطاء الكائن المحدد اسمًا</translation>
     </message>
     <message>
         <source>&amp;Find measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;بحث في القيم المقيسة</translation>
     </message>
     <message>
         <source>Filter the measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>تصفية القيم المقيسة</translation>
     </message>
     <message>
         <source>&amp;Select</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;تحديد</translation>
     </message>
     <message>
         <source>Select and change objects</source>
-        <translation type="unfinished"></translation>
+        <translation>تحديد الكائنات وتعديلها</translation>
     </message>
     <message>
         <source>&amp;Line</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;خط</translation>
     </message>
     <message>
         <source>Measure a length</source>
-        <translation type="unfinished"></translation>
+        <translation>قياس طول</translation>
     </message>
     <message>
         <source>&amp;Polyline</source>
-        <translation type="unfinished"></translation>
+        <translation>خط من&amp;كسر</translation>
     </message>
     <message>
         <source>Measure the length of a way</source>
-        <translation type="unfinished"></translation>
+        <translation>قياس طول مسار</translation>
     </message>
     <message>
         <source>Parallel &amp;distance</source>
-        <translation type="unfinished"></translation>
+        <translation>مسافة &amp;متوازية</translation>
     </message>
     <message>
         <source>Measure the distance of a point from a line</source>
-        <translation type="unfinished"></translation>
+        <translation>قياس بُعد نقطة عن خط</translation>
     </message>
     <message>
         <source>&amp;Arc</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;قوس</translation>
     </message>
     <message>
         <source>Measure an arc through three points</source>
-        <translation type="unfinished"></translation>
+        <translation>قياس قوس عبر ثلاث نقاط</translation>
     </message>
     <message>
         <source>&amp;Circle</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;دائرة</translation>
     </message>
     <message>
         <source>Measure a circle</source>
-        <translation type="unfinished"></translation>
+        <translation>قياس دائرة</translation>
     </message>
     <message>
         <source>&amp;Rectangle</source>
-        <translation type="unfinished"></translation>
+        <translation>مست&amp;طيل</translation>
     </message>
     <message>
         <source>Measure a rectangle</source>
-        <translation type="unfinished"></translation>
+        <translation>قياس مستطيل</translation>
     </message>
     <message>
         <source>Poly&amp;gon</source>
-        <translation type="unfinished"></translation>
+        <translation>م&amp;ضلع</translation>
     </message>
     <message>
         <source>Measure the area of a polygon</source>
-        <translation type="unfinished"></translation>
+        <translation>قياس مساحة مضلع</translation>
     </message>
     <message>
         <source>Cou&amp;nter</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;عداد</translation>
     </message>
     <message>
         <source>Count by clicks</source>
-        <translation type="unfinished"></translation>
+        <translation>العدّ بالنقر</translation>
     </message>
     <message>
         <source>&amp;Text note</source>
-        <translation type="unfinished"></translation>
+        <translation>ملاحظة &amp;نصية</translation>
     </message>
     <message>
         <source>Write on the image</source>
-        <translation type="unfinished"></translation>
+        <translation>الكتابة على الصورة</translation>
     </message>
     <message>
         <source>Scale &amp;bar</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;شريط مقياس</translation>
     </message>
     <message>
         <source>Draw a scale bar</source>
-        <translation type="unfinished"></translation>
+        <translation>رسم شريط مقياس</translation>
     </message>
     <message>
         <source>Cali&amp;bration...</source>
-        <translation type="unfinished"></translation>
+        <translation>المعا&amp;يرة...</translation>
     </message>
     <message>
         <source>Say how large a pixel of the image is</source>
-        <translation type="unfinished"></translation>
+        <translation>تحديد الحجم الحقيقي لبكسل الصورة</translation>
     </message>
     <message>
         <source>Use the file&apos;s pixel size</source>
-        <translation type="unfinished"></translation>
+        <translation>استخدام حجم البكسل من الملف</translation>
     </message>
     <message>
         <source>Measure with the pixel size that the image&apos;s file states</source>
-        <translation type="unfinished"></translation>
+        <translation>القياس بحجم البكسل المذكور في ملف الصورة</translation>
     </message>
     <message>
         <source>&amp;Take snapshot</source>
-        <translation type="unfinished"></translation>
+        <translation>التقاط &amp;لقطة</translation>
     </message>
     <message>
         <source>Save the image to the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>حفظ الصورة في المعرض</translation>
     </message>
     <message>
         <source>Snapshots with &amp;measurements</source>
-        <translation type="unfinished"></translation>
+        <translation>لقطات مع ال&amp;قياسات</translation>
     </message>
     <message>
         <source>Draw the measured objects on snapshots</source>
-        <translation type="unfinished"></translation>
+        <translation>رسم الكائنات المقيسة على اللقطات</translation>
     </message>
     <message>
         <source>&amp;Freeze</source>
-        <translation type="unfinished"></translation>
+        <translation>ت&amp;جميد</translation>
     </message>
     <message>
         <source>Freeze the live image</source>
-        <translation type="unfinished"></translation>
+        <translation>تجميد الصورة المباشرة</translation>
     </message>
     <message>
         <source>&amp;Labels on the image</source>
-        <translation type="unfinished"></translation>
+        <translation>ال&amp;تسميات على الصورة</translation>
     </message>
     <message>
         <source>Show or hide the labels of objects</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار تسميات الكائنات أو إخفاؤها</translation>
     </message>
     <message>
         <source>Pixel &amp;rulers</source>
-        <translation type="unfinished"></translation>
+        <translation>مساطر ال&amp;بكسل</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار المساطر أو إخفاؤها</translation>
     </message>
     <message>
         <source>&amp;Scale bar on the image</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;شريط المقياس على الصورة</translation>
     </message>
     <message>
         <source>Show or hide the scale bar, on reports, too</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار شريط المقياس أو إخفاؤه، في التقارير أيضًا</translation>
     </message>
     <message>
         <source>&amp;Gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>الم&amp;عرض</translation>
     </message>
     <message>
         <source>Show or hide the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار المعرض أو إخفاؤه</translation>
     </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
     <message>
         <source>the folder &quot;%1&quot; cannot be written</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذرت الكتابة في المجلد «%1»</translation>
     </message>
     <message>
         <source>Unsaved changes are not being copied: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>لا تُنسخ التغييرات غير المحفوظة احتياطيًا: %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCalibrationCommands</name>
     <message>
         <source>The session measures with it already</source>
-        <translation type="unfinished"></translation>
+        <translation>الجلسة تقيس به بالفعل</translation>
     </message>
     <message>
         <source>The image&apos;s file does not state one</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يذكر ملف الصورة حجم البكسل</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCalibrationDialog</name>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>المعايرة</translation>
     </message>
     <message>
         <source>Objective</source>
-        <translation type="unfinished"></translation>
+        <translation>الشيئية</translation>
     </message>
     <message>
         <source>Choose an objective, or type the name of a new one</source>
-        <translation type="unfinished"></translation>
+        <translation>اختر شيئية، أو اكتب اسم شيئية جديدة</translation>
     </message>
     <message>
         <source>Such as 10x</source>
-        <translation type="unfinished"></translation>
+        <translation>مثل 10x</translation>
     </message>
     <message>
         <source>In use</source>
-        <translation type="unfinished"></translation>
+        <translation>المستخدمة</translation>
     </message>
     <message>
         <source>New calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>معايرة جديدة</translation>
     </message>
     <message>
         <source>Known distance</source>
-        <translation type="unfinished"></translation>
+        <translation>مسافة معلومة</translation>
     </message>
     <message>
         <source>Image file</source>
-        <translation type="unfinished"></translation>
+        <translation>ملف الصورة</translation>
     </message>
     <message>
         <source>Typed</source>
-        <translation type="unfinished"></translation>
+        <translation>إدخال يدوي</translation>
     </message>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>الاسم</translation>
     </message>
     <message>
         <source>Who</source>
-        <translation type="unfinished"></translation>
+        <translation>بواسطة</translation>
     </message>
     <message>
         <source>Note</source>
-        <translation type="unfinished"></translation>
+        <translation>ملاحظة</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished"></translation>
+        <translation>معايرة</translation>
     </message>
     <message>
         <source>History of the objective</source>
-        <translation type="unfinished"></translation>
+        <translation>سجل معايرات الشيئية</translation>
     </message>
     <message>
         <source>Calibrations of this objective appear here</source>
-        <translation type="unfinished"></translation>
+        <translation>تظهر هنا معايرات هذه الشيئية</translation>
     </message>
     <message>
         <source>Use again</source>
-        <translation type="unfinished"></translation>
+        <translation>استخدام مجددًا</translation>
     </message>
     <message>
         <source>Close</source>
-        <translation type="unfinished"></translation>
+        <translation>إغلاق</translation>
     </message>
     <message>
         <source>New pixel size: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>حجم البكسل الجديد: %1</translation>
     </message>
     <message>
         <source>No pixel size yet</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يوجد حجم بكسل بعد</translation>
     </message>
     <message>
         <source>Measure with this pixel size and remember it</source>
-        <translation type="unfinished"></translation>
+        <translation>القياس بحجم البكسل هذا وتذكّره</translation>
     </message>
     <message>
         <source>Complete the fields above first</source>
-        <translation type="unfinished"></translation>
+        <translation>أكمل الحقول أعلاه أولًا</translation>
     </message>
     <message>
         <source>Measure with the selected calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>القياس بالمعايرة المحددة</translation>
     </message>
     <message>
         <source>Select a calibration in the table first</source>
-        <translation type="unfinished"></translation>
+        <translation>حدد معايرة في الجدول أولًا</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCalibrationHistory</name>
     <message>
         <source>Date</source>
-        <translation type="unfinished"></translation>
+        <translation>التاريخ</translation>
     </message>
     <message>
         <source>Who</source>
-        <translation type="unfinished"></translation>
+        <translation>بواسطة</translation>
     </message>
     <message>
         <source>Pixel size</source>
-        <translation type="unfinished"></translation>
+        <translation>حجم البكسل</translation>
     </message>
     <message>
         <source>Origin</source>
-        <translation type="unfinished"></translation>
+        <translation>المصدر</translation>
     </message>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>الاسم</translation>
     </message>
 </context>
 <context>
@@ -522,50 +522,50 @@
     <message>
         <source>%1 μm</source>
         <comment>size of a pixel</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 μm</translation>
     </message>
     <message>
         <source>%1 × %2 μm</source>
         <comment>width and height of a pixel</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 × %2 μm</translation>
     </message>
     <message>
         <source>Known distance</source>
-        <translation type="unfinished"></translation>
+        <translation>مسافة معلومة</translation>
     </message>
     <message>
         <source>Image file</source>
-        <translation type="unfinished"></translation>
+        <translation>ملف الصورة</translation>
     </message>
     <message>
         <source>Typed</source>
-        <translation type="unfinished"></translation>
+        <translation>إدخال يدوي</translation>
     </message>
     <message>
         <source>Not calibrated</source>
-        <translation type="unfinished"></translation>
+        <translation>غير معايَر</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
-        <translation type="unfinished"></translation>
+        <translation>يذكر %1 أن حجم البكسل %2؛ وتقيس الجلسة بالحجم %3</translation>
     </message>
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
-        <translation type="unfinished"></translation>
+        <translation>يذكر %1 أن حجم البكسل %2؛ وتقيس الجلسة بالبكسل</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCommandLine</name>
     <message>
         <source>There is no theme &quot;%1&quot;: use %2</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد سمة باسم «%1»: استخدم %2</translation>
     </message>
     <message>
         <source> or </source>
-        <translation type="unfinished"></translation>
+        <translation> أو </translation>
     </message>
     <message>
         <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
@@ -581,30 +581,42 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation type="unfinished"></translation>
+        <translation>الاستخدام: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+يقيس الكائنات على الصور ويعرض قيمها.
+
+  --session FILE      فتح جلسة
+  --image FILE        فتح صورة
+  --table FILE        استيراد جدول قيم مقيسة
+  --theme Dark|Light  سمة هذا التشغيل
+  --plugins DIR       البحث عن الإضافات هنا أيضًا؛ يمكن تكراره
+  --help              إظهار هذا النص
+  --version           إظهار الإصدار
+
+يحدد متغير البيئة STATREPORT_PLUGINS مجلدات أخرى فيها إضافات.
+</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCounterBar</name>
     <message>
         <source>Clicks count for</source>
-        <translation type="unfinished"></translation>
+        <translation>احتساب النقرات في</translation>
     </message>
     <message>
         <source>The counter that gets the clicks (1 to 9)</source>
-        <translation type="unfinished"></translation>
+        <translation>العداد الذي يتلقى النقرات (1 إلى 9)</translation>
     </message>
     <message>
         <source>Count another class</source>
-        <translation type="unfinished"></translation>
+        <translation>عدّ فئة أخرى</translation>
     </message>
     <message>
         <source>A right click takes a place away</source>
-        <translation type="unfinished"></translation>
+        <translation>النقر بالزر الأيمن يزيل نقطة</translation>
     </message>
     <message>
         <source>A new counter</source>
-        <translation type="unfinished"></translation>
+        <translation>عداد جديد</translation>
     </message>
 </context>
 <context>
@@ -612,330 +624,330 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>&amp;Undo %1</source>
         <extracomment>%1 is what is undone or redone, such as &quot;move of Line 3&quot;</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>&amp;تراجع عن %1</translation>
     </message>
     <message>
         <source>&amp;Undo</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;تراجع</translation>
     </message>
     <message>
         <source>&amp;Redo %1</source>
-        <translation type="unfinished"></translation>
+        <translation>إ&amp;عادة تنفيذ %1</translation>
     </message>
     <message>
         <source>&amp;Redo</source>
-        <translation type="unfinished"></translation>
+        <translation>إ&amp;عادة</translation>
     </message>
     <message>
         <source>Nothing was done yet</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يُنفَّذ أي شيء بعد</translation>
     </message>
     <message>
         <source>Nothing was undone</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يُتراجع عن أي شيء</translation>
     </message>
     <message>
         <source>Select an object first</source>
-        <translation type="unfinished"></translation>
+        <translation>حدد كائنًا أولًا</translation>
     </message>
     <message>
         <source>Select one object first</source>
-        <translation type="unfinished"></translation>
+        <translation>حدد كائنًا واحدًا أولًا</translation>
     </message>
     <message>
         <source>No measured objects were copied</source>
-        <translation type="unfinished"></translation>
+        <translation>لم تُنسخ أي كائنات مقيسة</translation>
     </message>
 </context>
 <context>
     <name>KvDeskExportCommand</name>
     <message>
         <source>Nothing was measured yet</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يُقَس أي شيء بعد</translation>
     </message>
     <message>
         <source>Measured values</source>
         <comment>file name</comment>
-        <translation type="unfinished"></translation>
+        <translation>القيم المقيسة</translation>
     </message>
     <message>
         <source>JSON files</source>
-        <translation type="unfinished"></translation>
+        <translation>ملفات JSON</translation>
     </message>
     <message>
         <source>CSV tables</source>
-        <translation type="unfinished"></translation>
+        <translation>جداول CSV</translation>
     </message>
     <message>
         <source>Export measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>تصدير القيم المقيسة</translation>
     </message>
     <message>
         <source>Export cancelled: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>أُلغي التصدير: %1</translation>
     </message>
     <message>
         <source>The table &quot;%1&quot; was not written.</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يُكتب الجدول «%1».</translation>
     </message>
     <message>
         <source>Measured values exported: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>صُدِّرت القيم المقيسة: %1</translation>
     </message>
     <message>
         <source>Exporting measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>جارٍ تصدير القيم المقيسة</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished"></translation>
+        <translation>إلغاء</translation>
     </message>
 </context>
 <context>
     <name>KvDeskExportDialog</name>
     <message>
         <source>Export measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>تصدير القيم المقيسة</translation>
     </message>
     <message>
         <source>Table</source>
-        <translation type="unfinished"></translation>
+        <translation>الجدول</translation>
     </message>
     <message>
         <source>Numbers</source>
-        <translation type="unfinished"></translation>
+        <translation>الأرقام</translation>
     </message>
     <message>
         <source>Only the selected objects (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>الكائنات المحددة فقط (%1)</translation>
     </message>
     <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
-        <translation type="unfinished"></translation>
+        <translation>علامة ترتيب البايتات (BOM)، لبرامج الجداول التي لا تتوقع UTF-8</translation>
     </message>
     <message>
         <source>Apostrophe before names that spreadsheets take for formulas</source>
-        <translation type="unfinished"></translation>
+        <translation>فاصلة علوية قبل الأسماء التي تعدها برامج الجداول صيغًا</translation>
     </message>
     <message>
         <source>Changes names that begin with =, +, - or @: they are others when the table is imported again</source>
-        <translation type="unfinished"></translation>
+        <translation>يغير الأسماء التي تبدأ بأحد الرموز = أو + أو - أو @: ستختلف عن الأصل عند استيراد الجدول مجددًا</translation>
     </message>
     <message>
         <source>Export...</source>
-        <translation type="unfinished"></translation>
+        <translation>تصدير...</translation>
     </message>
     <message>
         <source>CSV, one row per value</source>
-        <translation type="unfinished"></translation>
+        <translation>CSV، صف لكل قيمة</translation>
     </message>
     <message>
         <source>CSV, one row per object</source>
-        <translation type="unfinished"></translation>
+        <translation>CSV، صف لكل كائن</translation>
     </message>
     <message>
         <source>JSON</source>
-        <translation type="unfinished"></translation>
+        <translation>JSON</translation>
     </message>
     <message>
         <source>1.5, commas between the fields</source>
-        <translation type="unfinished"></translation>
+        <translation>1.5، والفاصل بين الحقول فاصلة</translation>
     </message>
     <message>
         <source>1,5, semicolons between the fields (spreadsheets, %1)</source>
         <extracomment>%1 is the name of a language</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>1,5، والفاصل بين الحقول فاصلة منقوطة (برامج الجداول، %1)</translation>
     </message>
     <message>
         <source>1.5, commas between the fields (spreadsheets, %1)</source>
-        <translation type="unfinished"></translation>
+        <translation>1.5، والفاصل بين الحقول فاصلة (برامج الجداول، %1)</translation>
     </message>
     <message>
         <source>For statistics programs. Can be imported here again.</source>
-        <translation type="unfinished"></translation>
+        <translation>لبرامج الإحصاء. يمكن استيراده هنا مجددًا.</translation>
     </message>
     <message>
         <source>For spreadsheets. Headings name the units.</source>
-        <translation type="unfinished"></translation>
+        <translation>لبرامج الجداول. تذكر العناوين الوحدات.</translation>
     </message>
     <message>
         <source>For programs. Numbers always have a decimal point.</source>
-        <translation type="unfinished"></translation>
+        <translation>للبرامج. الفاصلة العشرية في الأرقام نقطة دائمًا.</translation>
     </message>
     <message>
         <source>No measured object is selected</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يُحدَّد أي كائن مقيس</translation>
     </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
     <message>
         <source>&amp;Exposure</source>
-        <translation type="unfinished"></translation>
+        <translation>التع&amp;ريض</translation>
     </message>
     <message>
         <source>Exposure time of the camera</source>
-        <translation type="unfinished"></translation>
+        <translation>زمن التعريض في الكاميرا</translation>
     </message>
     <message>
         <source> ms</source>
         <comment>milliseconds</comment>
-        <translation type="unfinished"></translation>
+        <translation> ملي ث</translation>
     </message>
 </context>
 <context>
     <name>KvDeskFileCommands</name>
     <message>
         <source>Sessions</source>
-        <translation type="unfinished"></translation>
+        <translation>الجلسات</translation>
     </message>
     <message>
         <source>All files</source>
-        <translation type="unfinished"></translation>
+        <translation>كل الملفات</translation>
     </message>
     <message>
         <source>Unsaved changes</source>
-        <translation type="unfinished"></translation>
+        <translation>تغييرات غير محفوظة</translation>
     </message>
     <message>
         <source>Save the changes to &quot;%1&quot;?</source>
-        <translation type="unfinished"></translation>
+        <translation>هل تريد حفظ التغييرات في «%1»؟</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not opened.</source>
-        <translation type="unfinished"></translation>
+        <translation>لم تُفتح الجلسة «%1».</translation>
     </message>
     <message>
         <source>Session opened: %1 (objects: %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>فُتحت الجلسة: %1 (الكائنات: %2)</translation>
     </message>
     <message>
         <source>Image missing</source>
-        <translation type="unfinished"></translation>
+        <translation>الصورة مفقودة</translation>
     </message>
     <message>
         <source>Open the session without its image?</source>
-        <translation type="unfinished"></translation>
+        <translation>هل تريد فتح الجلسة دون صورتها؟</translation>
     </message>
     <message>
         <source>The image &quot;%1&quot; was not opened.</source>
-        <translation type="unfinished"></translation>
+        <translation>لم تُفتح الصورة «%1».</translation>
     </message>
     <message>
         <source>Image opened: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>فُتحت الصورة: %1</translation>
     </message>
     <message>
         <source>The table &quot;%1&quot; was not imported.</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يُستورد الجدول «%1».</translation>
     </message>
     <message>
         <source>%1: %2</source>
         <comment>file, remark</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1: %2</translation>
     </message>
     <message>
         <source>Table imported: %1 (objects: %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>استُورد الجدول: %1 (الكائنات: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
-        <translation type="unfinished"></translation>
+        <translation>لم تُحفظ الجلسة «%1».</translation>
     </message>
     <message>
         <source>Session saved: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>حُفظت الجلسة: %1</translation>
     </message>
     <message>
         <source>Open session</source>
-        <translation type="unfinished"></translation>
+        <translation>فتح جلسة</translation>
     </message>
     <message>
         <source>Open image</source>
-        <translation type="unfinished"></translation>
+        <translation>فتح صورة</translation>
     </message>
     <message>
         <source>Images</source>
-        <translation type="unfinished"></translation>
+        <translation>الصور</translation>
     </message>
     <message>
         <source>Import table</source>
-        <translation type="unfinished"></translation>
+        <translation>استيراد جدول</translation>
     </message>
     <message>
         <source>Tables</source>
-        <translation type="unfinished"></translation>
+        <translation>الجداول</translation>
     </message>
     <message>
         <source>Save session</source>
-        <translation type="unfinished"></translation>
+        <translation>حفظ الجلسة</translation>
     </message>
     <message>
         <source>Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>Measuring Desk</translation>
     </message>
     <message>
         <source>Only one session can be open; not opened: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يمكن فتح أكثر من جلسة واحدة؛ لم تُفتح: %1</translation>
     </message>
     <message>
         <source>Neither a session, an image nor a table: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>ليس جلسة ولا صورة ولا جدولًا: %1</translation>
     </message>
     <message>
         <source>There is not enough memory</source>
-        <translation type="unfinished"></translation>
+        <translation>الذاكرة غير كافية</translation>
     </message>
     <message>
         <source>Opening &quot;%1&quot;</source>
-        <translation type="unfinished"></translation>
+        <translation>جارٍ فتح «%1»</translation>
     </message>
     <message>
         <source>The measurements were not restored.</source>
-        <translation type="unfinished"></translation>
+        <translation>لم تُستعد القياسات.</translation>
     </message>
     <message>
         <source>Restoring measurements</source>
-        <translation type="unfinished"></translation>
+        <translation>جارٍ استعادة القياسات</translation>
     </message>
     <message>
         <source>Measurements restored: %1 (objects: %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>استُعيدت القياسات: %1 (الكائنات: %2)</translation>
     </message>
     <message>
         <source>Importing &quot;%1&quot;</source>
-        <translation type="unfinished"></translation>
+        <translation>جارٍ استيراد «%1»</translation>
     </message>
     <message>
         <source>Saving &quot;%1&quot;</source>
-        <translation type="unfinished"></translation>
+        <translation>جارٍ حفظ «%1»</translation>
     </message>
     <message>
         <source>Session changed by another program</source>
-        <translation type="unfinished"></translation>
+        <translation>غيَّر برنامج آخر الجلسة</translation>
     </message>
     <message>
         <source>&quot;%1&quot; was changed by another program. Overwrite its changes?</source>
-        <translation type="unfinished"></translation>
+        <translation>غيَّر برنامج آخر «%1». هل تريد الكتابة فوق تغييراته؟</translation>
     </message>
     <message>
         <source>Overwrite</source>
-        <translation type="unfinished"></translation>
+        <translation>كتابة فوقه</translation>
     </message>
     <message>
         <source>Save as...</source>
-        <translation type="unfinished"></translation>
+        <translation>حفظ باسم...</translation>
     </message>
     <message numerus="yes">
         <source>%n files were not opened.</source>
         <extracomment>%n is 2 at least</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>لم يُفتح %n ملف.</numerusform>
+            <numerusform>لم يُفتح ملف واحد.</numerusform>
+            <numerusform>لم يُفتح ملفان.</numerusform>
+            <numerusform>لم تُفتح %n ملفات.</numerusform>
+            <numerusform>لم يُفتح %n ملفًا.</numerusform>
+            <numerusform>لم يُفتح %n ملف.</numerusform>
         </translation>
     </message>
 </context>
@@ -944,118 +956,118 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>%1 states pixels of %2.</source>
         <comment>file, size</comment>
-        <translation type="unfinished"></translation>
+        <translation>يذكر %1 أن حجم البكسل %2.</translation>
     </message>
     <message>
         <source>The image&apos;s file does not state how large its pixels are.</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يذكر ملف الصورة حجم البكسل فيها.</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGallery</name>
     <message>
         <source>Gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>المعرض</translation>
     </message>
     <message>
         <source>Hide the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>إخفاء المعرض</translation>
     </message>
     <message>
         <source>&amp;Open image</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;فتح الصورة</translation>
     </message>
     <message>
         <source>&amp;Show in folder</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار في ال&amp;مجلد</translation>
     </message>
     <message>
         <source>&amp;Copy path</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;نسخ المسار</translation>
     </message>
     <message>
         <source>&amp;Move to trash...</source>
-        <translation type="unfinished"></translation>
+        <translation>نقل إلى &amp;سلة المهملات...</translation>
     </message>
     <message>
         <source>Choose &amp;folder...</source>
-        <translation type="unfinished"></translation>
+        <translation>ا&amp;ختيار مجلد...</translation>
     </message>
     <message>
         <source>Show the images of a folder</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار صور مجلد</translation>
     </message>
     <message>
         <source>Save s&amp;napshots in this folder</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;حفظ اللقطات في هذا المجلد</translation>
     </message>
     <message>
         <source>Folder of the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>مجلد المعرض</translation>
     </message>
     <message>
         <source>More commands of the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>أوامر أخرى للمعرض</translation>
     </message>
     <message>
         <source>Snapshots</source>
-        <translation type="unfinished"></translation>
+        <translation>اللقطات</translation>
     </message>
     <message>
         <source>Choose folder</source>
-        <translation type="unfinished"></translation>
+        <translation>اختيار مجلد</translation>
     </message>
     <message>
         <source>Snapshots are saved in %1</source>
-        <translation type="unfinished"></translation>
+        <translation>تُحفظ اللقطات في %1</translation>
     </message>
     <message>
         <source>Snapshots (%1) and the images of a folder appear here; drag them onto report pages</source>
-        <translation type="unfinished"></translation>
+        <translation>تظهر هنا اللقطات (%1) وصور المجلد؛ اسحبها إلى صفحات التقرير</translation>
     </message>
     <message>
         <source>There are no images in %1</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد صور في %1</translation>
     </message>
     <message>
         <source>The folder %1 does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>المجلد %1 غير موجود</translation>
     </message>
     <message>
         <source>Select an image first</source>
-        <translation type="unfinished"></translation>
+        <translation>حدد صورة أولًا</translation>
     </message>
     <message>
         <source>Snapshots are saved in this folder already</source>
-        <translation type="unfinished"></translation>
+        <translation>اللقطات تُحفظ في هذا المجلد بالفعل</translation>
     </message>
     <message>
         <source>Move &quot;%1&quot; to the trash?</source>
-        <translation type="unfinished"></translation>
+        <translation>هل تريد نقل «%1» إلى سلة المهملات؟</translation>
     </message>
     <message>
         <source>Move the selected images (%1) to the trash?</source>
-        <translation type="unfinished"></translation>
+        <translation>هل تريد نقل الصور المحددة (%1) إلى سلة المهملات؟</translation>
     </message>
     <message>
         <source>Move to trash</source>
-        <translation type="unfinished"></translation>
+        <translation>نقل إلى سلة المهملات</translation>
     </message>
     <message>
         <source>Moved to the trash: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>نُقل إلى سلة المهملات: %1</translation>
     </message>
     <message>
         <source>Not moved to the trash: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يُنقل إلى سلة المهملات: %1</translation>
     </message>
     <message>
         <source>Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>Measuring Desk</translation>
     </message>
     <message>
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
-        <translation type="unfinished"></translation>
+        <translation>ما زالت الملفات موجودة. إما أنها محمية من الكتابة أو لا توجد سلة مهملات لها.</translation>
     </message>
 </context>
 <context>
@@ -1063,223 +1075,224 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>%1 × %2 px</source>
         <comment>width, height</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 × %2 px</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGalleryView</name>
     <message>
         <source>Gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>المعرض</translation>
     </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
     <message>
         <source>Image</source>
-        <translation type="unfinished"></translation>
+        <translation>الصورة</translation>
     </message>
     <message>
         <source>Open an image or a session to start</source>
-        <translation type="unfinished"></translation>
+        <translation>افتح صورة أو جلسة للبدء</translation>
     </message>
 </context>
 <context>
     <name>KvDeskInlineEditor</name>
     <message>
         <source>Text</source>
-        <translation type="unfinished"></translation>
+        <translation>النص</translation>
     </message>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>الاسم</translation>
     </message>
 </context>
 <context>
     <name>KvDeskKnownDistance</name>
     <message>
         <source>inch</source>
-        <translation type="unfinished"></translation>
+        <translation>بوصة</translation>
     </message>
     <message>
         <source>Use selected line</source>
-        <translation type="unfinished"></translation>
+        <translation>استخدام الخط المحدد</translation>
     </message>
     <message>
         <source>Length of the line</source>
-        <translation type="unfinished"></translation>
+        <translation>طول الخط</translation>
     </message>
     <message>
         <source>Unit of the length</source>
-        <translation type="unfinished"></translation>
+        <translation>وحدة الطول</translation>
     </message>
     <message>
         <source>Its length</source>
-        <translation type="unfinished"></translation>
+        <translation>طوله</translation>
     </message>
     <message>
         <source>Draw a line over a distance that you know, such as on a stage micrometer, and select it.</source>
-        <translation type="unfinished"></translation>
+        <translation>ارسم خطًا فوق مسافة تعرفها، مثل تدريج ميكرومتر المنصة، ثم حدده.</translation>
     </message>
     <message>
         <source>No line yet</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يوجد خط بعد</translation>
     </message>
     <message>
         <source>%1: %2</source>
         <comment>name and length of a line</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1: %2</translation>
     </message>
     <message>
         <source>Take the selected line as the known distance</source>
-        <translation type="unfinished"></translation>
+        <translation>اعتماد الخط المحدد مسافةً معلومة</translation>
     </message>
     <message>
         <source>Select one line on the image first</source>
-        <translation type="unfinished"></translation>
+        <translation>حدد خطًا واحدًا على الصورة أولًا</translation>
     </message>
 </context>
 <context>
     <name>KvDeskLiveBar</name>
     <message>
         <source>Live image</source>
-        <translation type="unfinished"></translation>
+        <translation>الصورة المباشرة</translation>
     </message>
     <message>
         <source>Freeze</source>
-        <translation type="unfinished"></translation>
+        <translation>تجميد</translation>
     </message>
     <message>
         <source>%1 fps</source>
         <extracomment>frames per second</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1 إطار/ث</translation>
     </message>
     <message>
         <source>%1 delivers no pictures any more; this is the last one</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يعد %1 يرسل صورًا؛ هذه هي الأخيرة</translation>
     </message>
     <message>
         <source>%1 delivers no pictures</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 لا يرسل صورًا</translation>
     </message>
     <message>
         <source>%1 is stopped</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 متوقف</translation>
     </message>
     <message>
         <source>Waiting for the first picture of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>في انتظار أول صورة من %1</translation>
     </message>
     <message>
         <source>Frozen: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>مجمَّد: %1</translation>
     </message>
     <message>
         <source>Live: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>مباشر: %1</translation>
     </message>
     <message>
         <source>This image is not live</source>
-        <translation type="unfinished"></translation>
+        <translation>هذه الصورة ليست مباشرة</translation>
     </message>
     <message>
         <source>&amp;Reconnect</source>
-        <translation type="unfinished"></translation>
+        <translation>إعادة ا&amp;لاتصال</translation>
     </message>
     <message>
         <source>&amp;Start</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;بدء</translation>
     </message>
     <message>
         <source>Frames per second
 Dropped, because newer ones came first: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>الإطارات في الثانية
+أُسقطت لأن إطارات أحدث سبقتها: %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
     <message>
         <source>&amp;File</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;ملف</translation>
     </message>
     <message>
         <source>&amp;Recent sessions</source>
-        <translation type="unfinished"></translation>
+        <translation>الجلسات الأ&amp;خيرة</translation>
     </message>
     <message>
         <source>&amp;View</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;عرض</translation>
     </message>
     <message>
         <source>&amp;Help</source>
-        <translation type="unfinished"></translation>
+        <translation>م&amp;ساعدة</translation>
     </message>
     <message>
         <source>Main tool bar</source>
-        <translation type="unfinished"></translation>
+        <translation>شريط الأدوات الرئيسي</translation>
     </message>
     <message>
         <source>%1[*] - Measuring Desk</source>
         <extracomment>%1 is the name of a session; [*] is replaced by a star when it has unsaved changes</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1[*] - Measuring Desk</translation>
     </message>
     <message>
         <source>None yet</source>
-        <translation type="unfinished"></translation>
+        <translation>لا شيء بعد</translation>
     </message>
     <message>
         <source>About Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>حول Measuring Desk</translation>
     </message>
     <message>
         <source>&lt;b&gt;Measuring Desk %1&lt;/b&gt;&lt;p&gt;Measures objects on images, and hosts plug-ins such as the statistics reports.&lt;/p&gt;&lt;p&gt;%2, MIT licence&lt;/p&gt;</source>
-        <translation type="unfinished"></translation>
+        <translation>&lt;b&gt;Measuring Desk %1&lt;/b&gt;&lt;p&gt;يقيس الكائنات على الصور، ويستضيف إضافات مثل التقارير الإحصائية.&lt;/p&gt;&lt;p&gt;%2، رخصة MIT&lt;/p&gt;</translation>
     </message>
     <message>
         <source>Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>Measuring Desk</translation>
     </message>
     <message>
         <source>&amp;Edit</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;تحرير</translation>
     </message>
     <message>
         <source>&amp;Image</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;صورة</translation>
     </message>
     <message>
         <source>&amp;Measure</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;قياس</translation>
     </message>
     <message>
         <source>Choose the image source</source>
-        <translation type="unfinished"></translation>
+        <translation>اختيار مصدر الصورة</translation>
     </message>
 </context>
 <context>
     <name>KvDeskNotice</name>
     <message>
         <source>Close this message</source>
-        <translation type="unfinished"></translation>
+        <translation>إغلاق هذه الرسالة</translation>
     </message>
 </context>
 <context>
     <name>KvDeskObjectClipboard</name>
     <message>
         <source>Type</source>
-        <translation type="unfinished"></translation>
+        <translation>النوع</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>الكائن</translation>
     </message>
     <message>
         <source>Value name</source>
-        <translation type="unfinished"></translation>
+        <translation>اسم القيمة</translation>
     </message>
     <message>
         <source>Value</source>
-        <translation type="unfinished"></translation>
+        <translation>القيمة</translation>
     </message>
 </context>
 <context>
@@ -1288,176 +1301,176 @@ Dropped, because newer ones came first: %1</source>
         <source>%n objects</source>
         <comment>several measured objects</comment>
         <extracomment>%n is 2 at least</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%n كائن</numerusform>
+            <numerusform>كائن واحد</numerusform>
+            <numerusform>كائنين</numerusform>
+            <numerusform>%n كائنات</numerusform>
+            <numerusform>%n كائنًا</numerusform>
+            <numerusform>%n كائن</numerusform>
         </translation>
     </message>
     <message>
         <source>drawing of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>رسم %1</translation>
     </message>
     <message>
         <source>change of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>تعديل %1</translation>
     </message>
     <message>
         <source>move of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>نقل %1</translation>
     </message>
     <message>
         <source>renaming of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>إعادة تسمية %1</translation>
     </message>
     <message>
         <source>text of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>تغيير نص %1</translation>
     </message>
     <message>
         <source>showing of %1 of %2</source>
         <extracomment>%1 is a value, %2 an object</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>إظهار %1 في %2</translation>
     </message>
     <message>
         <source>hiding of %1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>إخفاء %1 في %2</translation>
     </message>
     <message>
         <source>deletion of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>حذف %1</translation>
     </message>
     <message>
         <source>change of the calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>تغيير المعايرة</translation>
     </message>
     <message>
         <source>place of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>إضافة نقطة إلى %1</translation>
     </message>
     <message>
         <source>deletion of a place of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>حذف نقطة من %1</translation>
     </message>
     <message>
         <source>pasting of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>لصق %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
     <message>
         <source>No plug-ins were found</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يُعثر على إضافات</translation>
     </message>
     <message>
         <source>It is no plug-in for this program</source>
-        <translation type="unfinished"></translation>
+        <translation>ليس إضافة لهذا البرنامج</translation>
     </message>
     <message>
         <source>Its tools &quot;%1&quot; could not be started</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذر بدء أدواتها «%1»</translation>
     </message>
     <message>
         <source>Plug-in loaded: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>حُمِّلت الإضافة: %1</translation>
     </message>
     <message>
         <source>Plug-in not loaded: %1: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>لم تُحمَّل الإضافة: %1: %2</translation>
     </message>
     <message>
         <source>It failed: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>فشلت: %1</translation>
     </message>
     <message>
         <source>It failed for a reason of its own</source>
-        <translation type="unfinished"></translation>
+        <translation>فشلت لسبب داخلي فيها</translation>
     </message>
 </context>
 <context>
     <name>KvDeskProgress</name>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished"></translation>
+        <translation>إلغاء</translation>
     </message>
     <message>
         <source>Leave everything as it was (Esc)</source>
-        <translation type="unfinished"></translation>
+        <translation>ترك كل شيء كما كان (Esc)</translation>
     </message>
 </context>
 <context>
     <name>KvDeskRecovery</name>
     <message>
         <source>Untitled session</source>
-        <translation type="unfinished"></translation>
+        <translation>جلسة بلا عنوان</translation>
     </message>
     <message>
         <source>%1 (objects: %2)</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1 (الكائنات: %2)</translation>
     </message>
 </context>
 <context>
     <name>KvDeskRecoveryBar</name>
     <message>
         <source>Show other measurements that were not saved</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار قياسات أخرى لم تُحفظ</translation>
     </message>
     <message>
         <source>Restore</source>
-        <translation type="unfinished"></translation>
+        <translation>استعادة</translation>
     </message>
     <message>
         <source>Open these measurements as a session with unsaved changes</source>
-        <translation type="unfinished"></translation>
+        <translation>فتح هذه القياسات كجلسة بتغييرات غير محفوظة</translation>
     </message>
     <message>
         <source>Discard</source>
-        <translation type="unfinished"></translation>
+        <translation>تجاهل</translation>
     </message>
     <message>
         <source>Delete these measurements for good</source>
-        <translation type="unfinished"></translation>
+        <translation>حذف هذه القياسات نهائيًا</translation>
     </message>
     <message>
         <source>%1: %2</source>
         <extracomment>%1 is a time, %2 a session</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1: %2</translation>
     </message>
     <message numerus="yes">
         <source>%n more</source>
         <comment>measurements that were not saved</comment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%n أخرى</numerusform>
+            <numerusform>واحدة أخرى</numerusform>
+            <numerusform>اثنتان أخريان</numerusform>
+            <numerusform>%n أخرى</numerusform>
+            <numerusform>%n أخرى</numerusform>
+            <numerusform>%n أخرى</numerusform>
         </translation>
     </message>
     <message>
         <source>Measurements from %1 were not saved.</source>
-        <translation type="unfinished"></translation>
+        <translation>القياسات من %1 لم تُحفظ.</translation>
     </message>
 </context>
 <context>
     <name>KvDeskRuler</name>
     <message>
         <source>Horizontal ruler</source>
-        <translation type="unfinished"></translation>
+        <translation>المسطرة الأفقية</translation>
     </message>
     <message>
         <source>Vertical ruler</source>
-        <translation type="unfinished"></translation>
+        <translation>المسطرة الرأسية</translation>
     </message>
     <message>
         <source>Ruler in %1</source>
-        <translation type="unfinished"></translation>
+        <translation>المسطرة بوحدة %1</translation>
     </message>
 </context>
 <context>
@@ -1465,254 +1478,254 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>n = %1, mean %2, SD %3, min %4, max %5</source>
         <extracomment>number of values, their mean, standard deviation, smallest and largest one</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>العدد %1، المتوسط %2، الانحراف المعياري %3، الأدنى %4، الأقصى %5</translation>
     </message>
     <message>
         <source>Selected values: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>القيم المحددة: %1</translation>
     </message>
     <message>
         <source>&quot;%1&quot; among them: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>منها «%1»: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>المتوسط: %1</translation>
     </message>
     <message>
         <source>Standard deviation: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>الانحراف المعياري: %1</translation>
     </message>
     <message>
         <source>Smallest: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>الأصغر: %1</translation>
     </message>
     <message>
         <source>Largest: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>الأكبر: %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSession</name>
     <message>
         <source>Untitled session</source>
-        <translation type="unfinished"></translation>
+        <translation>جلسة بلا عنوان</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSettingsDialog</name>
     <message>
         <source>Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>الإعدادات</translation>
     </message>
     <message>
         <source>Appearance</source>
-        <translation type="unfinished"></translation>
+        <translation>المظهر</translation>
     </message>
     <message>
         <source>Theme</source>
-        <translation type="unfinished"></translation>
+        <translation>السمة</translation>
     </message>
     <message>
         <source>Dark</source>
-        <translation type="unfinished"></translation>
+        <translation>داكنة</translation>
     </message>
     <message>
         <source>Light</source>
-        <translation type="unfinished"></translation>
+        <translation>فاتحة</translation>
     </message>
     <message>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>اللغة</translation>
     </message>
     <message>
         <source>Another language takes effect when the program is started again.</source>
-        <translation type="unfinished"></translation>
+        <translation>تُطبَّق اللغة الجديدة عند بدء البرنامج مجددًا.</translation>
     </message>
     <message>
         <source>Measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>القيم المقيسة</translation>
     </message>
     <message>
         <source>Automatic</source>
-        <translation type="unfinished"></translation>
+        <translation>تلقائي</translation>
     </message>
     <message>
         <source>Significant digits</source>
-        <translation type="unfinished"></translation>
+        <translation>الأرقام المعنوية</translation>
     </message>
     <message>
         <source>Length unit</source>
-        <translation type="unfinished"></translation>
+        <translation>وحدة الطول</translation>
     </message>
     <message>
         <source>Angle unit</source>
-        <translation type="unfinished"></translation>
+        <translation>وحدة الزاوية</translation>
     </message>
     <message>
         <source>Degrees (°)</source>
-        <translation type="unfinished"></translation>
+        <translation>درجات (°)</translation>
     </message>
     <message>
         <source>Radians (rad)</source>
-        <translation type="unfinished"></translation>
+        <translation>راديان (rad)</translation>
     </message>
     <message>
         <source>System default</source>
-        <translation type="unfinished"></translation>
+        <translation>افتراضي النظام</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
     <message>
         <source>The folder cannot be created</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذر إنشاء المجلد</translation>
     </message>
     <message>
         <source>The picture cannot be encoded</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذر ترميز الصورة</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSnapshots</name>
     <message>
         <source>Open an image first</source>
-        <translation type="unfinished"></translation>
+        <translation>افتح صورة أولًا</translation>
     </message>
     <message>
         <source>No snapshot was taken: earlier ones are still being saved</source>
-        <translation type="unfinished"></translation>
+        <translation>لم تُلتقط لقطة: ما زال حفظ لقطات سابقة جاريًا</translation>
     </message>
     <message>
         <source>Snapshot saved: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>حُفظت اللقطة: %1</translation>
     </message>
     <message>
         <source>The snapshot was not saved. %1</source>
-        <translation type="unfinished"></translation>
+        <translation>لم تُحفظ اللقطة. %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSourceCommands</name>
     <message>
         <source>The image source &quot;%1&quot; was not opened.</source>
-        <translation type="unfinished"></translation>
+        <translation>لم يُفتح مصدر الصورة «%1».</translation>
     </message>
     <message>
         <source>Image source: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>مصدر الصورة: %1</translation>
     </message>
     <message>
         <source>Open image folder</source>
-        <translation type="unfinished"></translation>
+        <translation>فتح مجلد صور</translation>
     </message>
     <message>
         <source>Open video</source>
-        <translation type="unfinished"></translation>
+        <translation>فتح فيديو</translation>
     </message>
     <message>
         <source>Videos</source>
-        <translation type="unfinished"></translation>
+        <translation>مقاطع الفيديو</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSourceMenu</name>
     <message>
         <source>Image &amp;source</source>
-        <translation type="unfinished"></translation>
+        <translation>مصدر ال&amp;صورة</translation>
     </message>
     <message>
         <source>Still &amp;image...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;صورة ثابتة...</translation>
     </message>
     <message>
         <source>Image &amp;folder...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;مجلد صور...</translation>
     </message>
     <message>
         <source>Play the images of a folder like a camera</source>
-        <translation type="unfinished"></translation>
+        <translation>تشغيل صور مجلد كأنها من كاميرا</translation>
     </message>
     <message>
         <source>&amp;Video...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;فيديو...</translation>
     </message>
     <message>
         <source>Play a video like a camera</source>
-        <translation type="unfinished"></translation>
+        <translation>تشغيل فيديو كأنه من كاميرا</translation>
     </message>
     <message>
         <source>Looking for cameras...</source>
-        <translation type="unfinished"></translation>
+        <translation>جارٍ البحث عن كاميرات...</translation>
     </message>
     <message>
         <source>No camera is connected</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد كاميرا متصلة</translation>
     </message>
 </context>
 <context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
-        <translation type="unfinished"></translation>
+        <translation>تحذير</translation>
     </message>
     <message>
         <source>Error</source>
-        <translation type="unfinished"></translation>
+        <translation>خطأ</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation>معلومات</translation>
     </message>
 </context>
 <context>
     <name>KvDeskStatusBar</name>
     <message>
         <source>%1 × %2 px</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 × %2 px</translation>
     </message>
     <message>
         <source>%1 %</source>
         <comment>zoom</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 %</translation>
     </message>
     <message>
         <source>x %1, y %2</source>
         <comment>pixel below the pointer</comment>
-        <translation type="unfinished"></translation>
+        <translation>x %1، y %2</translation>
     </message>
     <message>
         <source>Statistics of the selected values</source>
-        <translation type="unfinished"></translation>
+        <translation>إحصاءات القيم المحددة</translation>
     </message>
     <message>
         <source>, %1</source>
         <comment>objective</comment>
-        <translation type="unfinished"></translation>
+        <translation>، %1</translation>
     </message>
     <message>
         <source>, %1/px</source>
         <comment>size of a pixel</comment>
-        <translation type="unfinished"></translation>
+        <translation>، %1/px</translation>
     </message>
 </context>
 <context>
     <name>KvDeskStatusLog</name>
     <message>
         <source>Status log</source>
-        <translation type="unfinished"></translation>
+        <translation>سجل الحالة</translation>
     </message>
     <message>
         <source>Hide the status log</source>
-        <translation type="unfinished"></translation>
+        <translation>إخفاء سجل الحالة</translation>
     </message>
     <message>
         <source>Clear the status log</source>
-        <translation type="unfinished"></translation>
+        <translation>مسح سجل الحالة</translation>
     </message>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
-        <translation type="unfinished"></translation>
+        <translation>تظهر هنا رسائل البرنامج وإضافاته</translation>
     </message>
 </context>
 <context>
@@ -1721,756 +1734,757 @@ Dropped, because newer ones came first: %1</source>
         <source>%1
 Reported by %2</source>
         <comment>message, source</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1
+أبلغ عنه %2</translation>
     </message>
     <message>
         <source>Category</source>
-        <translation type="unfinished"></translation>
+        <translation>النوع</translation>
     </message>
     <message>
         <source>Time</source>
-        <translation type="unfinished"></translation>
+        <translation>الوقت</translation>
     </message>
     <message>
         <source>Message</source>
-        <translation type="unfinished"></translation>
+        <translation>الرسالة</translation>
     </message>
 </context>
 <context>
     <name>KvDeskTableView</name>
     <message>
         <source>Copy</source>
-        <translation type="unfinished"></translation>
+        <translation>نسخ</translation>
     </message>
 </context>
 <context>
     <name>KvDeskToolStrip</name>
     <message>
         <source>Measuring tools</source>
-        <translation type="unfinished"></translation>
+        <translation>أدوات القياس</translation>
     </message>
 </context>
 <context>
     <name>KvDeskTypedPixelSize</name>
     <message>
         <source>Width of a pixel in micrometres</source>
-        <translation type="unfinished"></translation>
+        <translation>عرض البكسل بالميكرومتر</translation>
     </message>
     <message>
         <source>Height of a pixel in micrometres</source>
-        <translation type="unfinished"></translation>
+        <translation>ارتفاع البكسل بالميكرومتر</translation>
     </message>
     <message>
         <source>Same size in both directions</source>
-        <translation type="unfinished"></translation>
+        <translation>الحجم نفسه في الاتجاهين</translation>
     </message>
     <message>
         <source>Width</source>
-        <translation type="unfinished"></translation>
+        <translation>العرض</translation>
     </message>
     <message>
         <source>Height</source>
-        <translation type="unfinished"></translation>
+        <translation>الارتفاع</translation>
     </message>
     <message>
         <source>Type how large a pixel of the image is in reality.</source>
-        <translation type="unfinished"></translation>
+        <translation>أدخل الحجم الحقيقي لبكسل الصورة.</translation>
     </message>
 </context>
 <context>
     <name>KvDeskValueCommands</name>
     <message>
         <source>Rename</source>
-        <translation type="unfinished"></translation>
+        <translation>إعادة تسمية</translation>
     </message>
     <message>
         <source>Delete object</source>
-        <translation type="unfinished"></translation>
+        <translation>حذف الكائن</translation>
     </message>
     <message>
         <source>Hide value</source>
-        <translation type="unfinished"></translation>
+        <translation>إخفاء القيمة</translation>
     </message>
     <message>
         <source>Show all values of the object</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار كل قيم الكائن</translation>
     </message>
     <message>
         <source>Select one object first</source>
-        <translation type="unfinished"></translation>
+        <translation>حدد كائنًا واحدًا أولًا</translation>
     </message>
     <message>
         <source>Select an object first</source>
-        <translation type="unfinished"></translation>
+        <translation>حدد كائنًا أولًا</translation>
     </message>
     <message>
         <source>Select a value first</source>
-        <translation type="unfinished"></translation>
+        <translation>حدد قيمة أولًا</translation>
     </message>
     <message>
         <source>No value of the selected object is hidden</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد قيمة مخفية للكائن المحدد</translation>
     </message>
     <message>
         <source>showing of values</source>
-        <translation type="unfinished"></translation>
+        <translation>إظهار القيم</translation>
     </message>
     <message>
         <source>hiding of values</source>
-        <translation type="unfinished"></translation>
+        <translation>إخفاء القيم</translation>
     </message>
 </context>
 <context>
     <name>KvDeskValueTable</name>
     <message>
         <source>Measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>القيم المقيسة</translation>
     </message>
     <message>
         <source>Hide the measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>إخفاء القيم المقيسة</translation>
     </message>
     <message>
         <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation type="unfinished"></translation>
+        <translation>تظهر القيم المقيسة هنا بعد فتح جلسة أو استيراد جدول</translation>
     </message>
     <message>
         <source>Filter by type, object or value name</source>
-        <translation type="unfinished"></translation>
+        <translation>تصفية حسب النوع أو الكائن أو اسم القيمة</translation>
     </message>
     <message>
         <source>Filter of the measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>تصفية القيم المقيسة</translation>
     </message>
     <message>
         <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يُظهر إلا الصفوف التي تحوي كل هذه الكلمات (Ctrl+F)</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد قيمة مقيسة تطابق عامل التصفية</translation>
     </message>
     <message>
         <source>Clear the filter</source>
-        <translation type="unfinished"></translation>
+        <translation>مسح عامل التصفية</translation>
     </message>
     <message>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1 من %2</translation>
     </message>
 </context>
 <context>
     <name>KvDeskValueTableModel</name>
     <message>
         <source>Type</source>
-        <translation type="unfinished"></translation>
+        <translation>النوع</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>الكائن</translation>
     </message>
     <message>
         <source>Value name</source>
-        <translation type="unfinished"></translation>
+        <translation>اسم القيمة</translation>
     </message>
     <message>
         <source>Value</source>
-        <translation type="unfinished"></translation>
+        <translation>القيمة</translation>
     </message>
 </context>
 <context>
     <name>KvToolBase</name>
     <message>
         <source>Reset</source>
-        <translation type="unfinished"></translation>
+        <translation>إعادة تعيين</translation>
     </message>
     <message>
         <source>Reset to the default values</source>
-        <translation type="unfinished"></translation>
+        <translation>إعادة التعيين إلى القيم الافتراضية</translation>
     </message>
 </context>
 <context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذر حفظ الإعدادات في %1. تحقق من أن الكتابة في المجلد ممكنة.</translation>
     </message>
     <message>
         <source>The settings file %1 cannot be read. Changes to the settings will not be kept.</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذرت قراءة ملف الإعدادات %1. لن يُحتفظ بالتغييرات في الإعدادات.</translation>
     </message>
     <message>
         <source>The settings file %1 is damaged. It was renamed to %2; all settings are back at their defaults.</source>
-        <translation type="unfinished"></translation>
+        <translation>ملف الإعدادات %1 تالف. أُعيدت تسميته إلى %2؛ وعادت كل الإعدادات إلى قيمها الافتراضية.</translation>
     </message>
     <message>
         <source>The settings file %1 is damaged and could not be renamed to %2. Changes to the settings will not be kept.</source>
-        <translation type="unfinished"></translation>
+        <translation>ملف الإعدادات %1 تالف وتعذرت إعادة تسميته إلى %2. لن يُحتفظ بالتغييرات في الإعدادات.</translation>
     </message>
 </context>
 <context>
     <name>ZtAravisSource</name>
     <message>
         <source>%1 is disconnected; its last picture stays</source>
-        <translation type="unfinished"></translation>
+        <translation>انقطع اتصال %1؛ وتبقى صورته الأخيرة</translation>
     </message>
     <message>
         <source>%1 delivers pictures of a kind that cannot be shown</source>
-        <translation type="unfinished"></translation>
+        <translation>يرسل %1 صورًا من نوع لا يمكن عرضه</translation>
     </message>
     <message>
         <source>The camera does not take the setting (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>لا تقبل الكاميرا هذا الإعداد (%1)</translation>
     </message>
     <message>
         <source>%1 cannot be opened (%2)</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذر فتح %1 (%2)</translation>
     </message>
 </context>
 <context>
     <name>ZtCalibrationStore</name>
     <message>
         <source>This is not a calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>هذه ليست معايرة</translation>
     </message>
     <message>
         <source>A calibration in the settings is damaged and was left out (%1: %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>توجد في الإعدادات معايرة تالفة وقد تُركت (%1: %2)</translation>
     </message>
 </context>
 <context>
     <name>ZtCsvReader</name>
     <message>
         <source>A quoted text does not end</source>
-        <translation type="unfinished"></translation>
+        <translation>نص بين علامتي اقتباس لا نهاية له</translation>
     </message>
     <message>
         <source>There is text after a closing quote</source>
-        <translation type="unfinished"></translation>
+        <translation>يوجد نص بعد علامة اقتباس الإغلاق</translation>
     </message>
     <message>
         <source>Reading was cancelled</source>
-        <translation type="unfinished"></translation>
+        <translation>أُلغيت القراءة</translation>
     </message>
 </context>
 <context>
     <name>ZtDrawnType</name>
     <message>
         <source>Rectangle</source>
-        <translation type="unfinished"></translation>
+        <translation>مستطيل</translation>
     </message>
     <message>
         <source>Width</source>
-        <translation type="unfinished"></translation>
+        <translation>العرض</translation>
     </message>
     <message>
         <source>Height</source>
-        <translation type="unfinished"></translation>
+        <translation>الارتفاع</translation>
     </message>
     <message>
         <source>Area</source>
-        <translation type="unfinished"></translation>
+        <translation>المساحة</translation>
     </message>
     <message>
         <source>Line</source>
-        <translation type="unfinished"></translation>
+        <translation>خط</translation>
     </message>
     <message>
         <source>Length</source>
-        <translation type="unfinished"></translation>
+        <translation>الطول</translation>
     </message>
     <message>
         <source>Arc</source>
-        <translation type="unfinished"></translation>
+        <translation>قوس</translation>
     </message>
     <message>
         <source>Angle</source>
-        <translation type="unfinished"></translation>
+        <translation>الزاوية</translation>
     </message>
     <message>
         <source>Arc length</source>
-        <translation type="unfinished"></translation>
+        <translation>طول القوس</translation>
     </message>
     <message>
         <source>Polygon</source>
-        <translation type="unfinished"></translation>
+        <translation>مضلع</translation>
     </message>
     <message>
         <source>Perimeter</source>
-        <translation type="unfinished"></translation>
+        <translation>المحيط</translation>
     </message>
     <message>
         <source>Polyline</source>
-        <translation type="unfinished"></translation>
+        <translation>خط منكسر</translation>
     </message>
     <message>
         <source>Parallel distance</source>
-        <translation type="unfinished"></translation>
+        <translation>مسافة متوازية</translation>
     </message>
     <message>
         <source>Distance</source>
-        <translation type="unfinished"></translation>
+        <translation>المسافة</translation>
     </message>
     <message>
         <source>Text note</source>
-        <translation type="unfinished"></translation>
+        <translation>ملاحظة نصية</translation>
     </message>
     <message>
         <source>Scale bar</source>
-        <translation type="unfinished"></translation>
+        <translation>شريط مقياس</translation>
     </message>
     <message>
         <source>Counter</source>
-        <translation type="unfinished"></translation>
+        <translation>عداد</translation>
     </message>
     <message>
         <source>Count</source>
-        <translation type="unfinished"></translation>
+        <translation>العدد</translation>
     </message>
     <message>
         <source>Share</source>
-        <translation type="unfinished"></translation>
+        <translation>النسبة</translation>
     </message>
     <message>
         <source>Circle</source>
-        <translation type="unfinished"></translation>
+        <translation>دائرة</translation>
     </message>
     <message>
         <source>Diameter</source>
-        <translation type="unfinished"></translation>
+        <translation>القطر</translation>
     </message>
 </context>
 <context>
     <name>ZtFrameSourceCatalogue</name>
     <message>
         <source>This program cannot play videos</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يستطيع هذا البرنامج تشغيل الفيديو</translation>
     </message>
     <message>
         <source>This program knows no cameras of this kind</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يعرف هذا البرنامج كاميرات من هذا النوع</translation>
     </message>
 </context>
 <context>
     <name>ZtImageFolderSource</name>
     <message>
         <source>%1: no picture of the folder can be shown</source>
-        <translation type="unfinished"></translation>
+        <translation>%1: لا توجد في المجلد صورة يمكن عرضها</translation>
     </message>
     <message>
         <source>The folder does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>المجلد غير موجود</translation>
     </message>
     <message>
         <source>The folder cannot be read</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذرت قراءة المجلد</translation>
     </message>
     <message>
         <source>The folder holds no pictures</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يحوي المجلد أي صور</translation>
     </message>
 </context>
 <context>
     <name>ZtKernelImage</name>
     <message>
         <source>%1 delivers pictures again</source>
-        <translation type="unfinished"></translation>
+        <translation>عاد %1 إلى إرسال الصور</translation>
     </message>
 </context>
 <context>
     <name>ZtLiveFrameSource</name>
     <message>
         <source>%1 has stopped delivering pictures; the last one stays</source>
-        <translation type="unfinished"></translation>
+        <translation>توقف %1 عن إرسال الصور؛ وتبقى الأخيرة</translation>
     </message>
 </context>
 <context>
     <name>ZtMeasureFormat</name>
     <message>
         <source>pcs</source>
-        <translation type="unfinished"></translation>
+        <translation>قطعة</translation>
     </message>
 </context>
 <context>
     <name>ZtSession</name>
     <message>
         <source>The file is empty</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف فارغ</translation>
     </message>
     <message>
         <source>The file is not a session</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف ليس جلسة</translation>
     </message>
     <message>
         <source>The file cannot be written (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذرت كتابة الملف (%1)</translation>
     </message>
     <message>
         <source>This must be a list</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا قائمة</translation>
     </message>
     <message>
         <source>This must be a text</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا نصًا</translation>
     </message>
     <message>
         <source>This must be a whole number from 1</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا عددًا صحيحًا لا يقل عن 1</translation>
     </message>
     <message>
         <source>This must be a number</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا عددًا</translation>
     </message>
     <message>
         <source>This must be a number greater than 0</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا عددًا أكبر من 0</translation>
     </message>
     <message>
         <source>Another object of this type has the same number</source>
-        <translation type="unfinished"></translation>
+        <translation>يوجد كائن آخر من هذا النوع بالرقم نفسه</translation>
     </message>
     <message>
         <source>This must be an object</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا كائن JSON</translation>
     </message>
     <message>
         <source>&quot;%1&quot; is not a type of objects</source>
-        <translation type="unfinished"></translation>
+        <translation>«%1» ليس نوعًا من الكائنات</translation>
     </message>
     <message>
         <source>An object of type &quot;%1&quot; cannot have this number of points (%2)</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يمكن أن يكون لكائن من النوع «%1» هذا العدد من النقاط (%2)</translation>
     </message>
     <message>
         <source>A point must be a list of two numbers between -1e9 and 1e9</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن تكون النقطة قائمة من عددين بين -1e9 و1e9</translation>
     </message>
     <message>
         <source>This must be the name of a value</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا اسم قيمة</translation>
     </message>
     <message>
         <source>The type has no name</source>
-        <translation type="unfinished"></translation>
+        <translation>النوع بلا اسم</translation>
     </message>
     <message>
         <source>A value must have a name of its own</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون لكل قيمة اسم خاص بها</translation>
     </message>
     <message>
         <source>The numbers of the rows must rise</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن تكون أرقام الصفوف تصاعدية</translation>
     </message>
     <message>
         <source>A row must be a list of number, name and values</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون الصف قائمة من رقم واسم وقيم</translation>
     </message>
     <message>
         <source>This must be a text or null</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا نصًا أو null</translation>
     </message>
     <message>
         <source>This must be a list or an object</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا قائمة أو كائن JSON</translation>
     </message>
     <message>
         <source>The table has no such value</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد في الجدول قيمة كهذه</translation>
     </message>
     <message>
         <source>This must be the text of a number</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا نصًا يمثل عددًا</translation>
     </message>
     <message>
         <source>The unit does not fit that of the value</source>
-        <translation type="unfinished"></translation>
+        <translation>الوحدة لا تناسب وحدة القيمة</translation>
     </message>
     <message>
         <source>The file is nested too deeply</source>
-        <translation type="unfinished"></translation>
+        <translation>تداخل العناصر في الملف أعمق مما يجب</translation>
     </message>
     <message>
         <source>The file is not valid JSON (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف ليس JSON صالحًا (%1)</translation>
     </message>
     <message>
         <source>The file does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف غير موجود</translation>
     </message>
     <message>
         <source>This is a folder, not a file</source>
-        <translation type="unfinished"></translation>
+        <translation>هذا مجلد وليس ملفًا</translation>
     </message>
     <message>
         <source>The file cannot be read (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذرت قراءة الملف (%1)</translation>
     </message>
     <message>
         <source>The file is too large for a session</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف أكبر من أن يكون جلسة</translation>
     </message>
     <message>
         <source>This must be a date such as 2026-01-31T12:00:00Z</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا تاريخًا مثل 2026-01-31T12:00:00Z</translation>
     </message>
     <message>
         <source>This must be &quot;knownDistance&quot;, &quot;metadata&quot; or &quot;typed&quot;</source>
-        <translation type="unfinished"></translation>
+        <translation>يجب أن يكون هذا &quot;knownDistance&quot; أو &quot;metadata&quot; أو &quot;typed&quot;</translation>
     </message>
     <message>
         <source>The file is write-protected</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف محمي من الكتابة</translation>
     </message>
     <message>
         <source>Writing was cancelled</source>
-        <translation type="unfinished"></translation>
+        <translation>أُلغيت الكتابة</translation>
     </message>
     <message>
         <source>Reading was cancelled</source>
-        <translation type="unfinished"></translation>
+        <translation>أُلغيت القراءة</translation>
     </message>
     <message>
         <source>The session is of the newer version %1; this program reads versions up to %2</source>
-        <translation type="unfinished"></translation>
+        <translation>الجلسة من الإصدار الأحدث %1؛ ويقرأ هذا البرنامج الإصدارات حتى %2</translation>
     </message>
     <message>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
-        <translation type="unfinished"></translation>
+        <translation>جلسات الإصدار %1 غير معروفة؛ ويقرأ هذا البرنامج الإصدارات من %2 إلى %3</translation>
     </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
     <message>
         <source>The picture does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>الصورة غير موجودة</translation>
     </message>
     <message>
         <source>This is a folder, not a picture</source>
-        <translation type="unfinished"></translation>
+        <translation>هذا مجلد وليس صورة</translation>
     </message>
     <message>
         <source>The picture cannot be read</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذرت قراءة الصورة</translation>
     </message>
     <message>
         <source>The picture has %1 x %2 pixels, which is too many</source>
-        <translation type="unfinished"></translation>
+        <translation>أبعاد الصورة %1 x %2 بكسل، وهي أكبر مما يمكن فتحه</translation>
     </message>
     <message>
         <source>The picture cannot be decoded (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذر فك ترميز الصورة (%1)</translation>
     </message>
     <message>
         <source>the file is empty</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف فارغ</translation>
     </message>
     <message>
         <source>it has no size</source>
-        <translation type="unfinished"></translation>
+        <translation>لا أبعاد لها</translation>
     </message>
     <message>
         <source>the file is damaged</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف تالف</translation>
     </message>
     <message>
         <source>the file is too short for its picture</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف أقصر من صورته</translation>
     </message>
     <message>
         <source>there is not enough memory</source>
-        <translation type="unfinished"></translation>
+        <translation>الذاكرة غير كافية</translation>
     </message>
 </context>
 <context>
     <name>ZtTableImport</name>
     <message>
         <source>&quot;%1&quot; already has a value &quot;%2&quot; in line %3</source>
-        <translation type="unfinished"></translation>
+        <translation>للكائن «%1» قيمة «%2» بالفعل في السطر %3</translation>
     </message>
     <message>
         <source>The file does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف غير موجود</translation>
     </message>
     <message>
         <source>This is a folder, not a file</source>
-        <translation type="unfinished"></translation>
+        <translation>هذا مجلد وليس ملفًا</translation>
     </message>
     <message>
         <source>The file cannot be read (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذرت قراءة الملف (%1)</translation>
     </message>
     <message>
         <source>The table is not open for reading</source>
-        <translation type="unfinished"></translation>
+        <translation>الجدول غير مفتوح للقراءة</translation>
     </message>
     <message>
         <source>The table has no rows</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد صفوف في الجدول</translation>
     </message>
     <message>
         <source>The row and the header differ in their number of fields (%1 and %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>يختلف عدد الحقول بين الصف وسطر العناوين (%1 و%2)</translation>
     </message>
     <message>
         <source>%1 is not a finite number</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 ليس عددًا منتهيًا</translation>
     </message>
     <message>
         <source>%1 is not a number</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 ليس عددًا</translation>
     </message>
     <message>
         <source>&quot;%1&quot; of &quot;%2&quot; is given in &quot;%3&quot; here, but in &quot;%4&quot; before</source>
-        <translation type="unfinished"></translation>
+        <translation>القيمة «%1» للنوع «%2» معطاة هنا بوحدة «%3»، لكنها كانت قبل ذلك بوحدة «%4»</translation>
     </message>
     <message>
         <source>There is no column %1; the columns are %2</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يوجد عمود %1؛ الأعمدة هي %2</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>كائن</translation>
     </message>
     <message>
         <source>There is no value %1 to give a unit; the values are %2</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد قيمة %1 لإعطائها وحدة؛ القيم هي %2</translation>
     </message>
     <message>
         <source>The first line announces %1 rows, but there are %2</source>
-        <translation type="unfinished"></translation>
+        <translation>يعلن السطر الأول عن %1 من الصفوف، لكن عددها %2</translation>
     </message>
     <message>
         <source>The first line announces rows without values</source>
-        <translation type="unfinished"></translation>
+        <translation>يعلن السطر الأول عن صفوف بلا قيم</translation>
     </message>
     <message>
         <source>There is no column %1; the columns of this table have no names</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يوجد عمود %1؛ أعمدة هذا الجدول بلا أسماء</translation>
     </message>
     <message>
         <source>%1 is not the index of a class; they go from 0 to %2</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 ليس رقم فئة؛ فالأرقام من 0 إلى %2</translation>
     </message>
     <message>
         <source>Value %1</source>
-        <translation type="unfinished"></translation>
+        <translation>القيمة %1</translation>
     </message>
     <message>
         <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation type="unfinished"></translation>
+        <translation>عدد حقول الصف %1، لكن السطر الأول يعلن عن %2 من القيم وفئة</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
-        <translation type="unfinished"></translation>
+        <translation>حجم الملف أكبر من %1 ميغابايت</translation>
     </message>
     <message>
         <source>The file is empty</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف فارغ</translation>
     </message>
     <message>
         <source>The first line does not name the columns</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يسمي السطر الأول الأعمدة</translation>
     </message>
     <message>
         <source>Column %1 is not part of a list of values and was left out</source>
-        <translation type="unfinished"></translation>
+        <translation>العمود %1 ليس جزءًا من قائمة قيم وقد تُرك</translation>
     </message>
     <message>
         <source>Columns %1 are not part of a list of values and were left out</source>
-        <translation type="unfinished"></translation>
+        <translation>الأعمدة %1 ليست جزءًا من قائمة قيم وقد تُركت</translation>
     </message>
     <message>
         <source>The value has no name</source>
-        <translation type="unfinished"></translation>
+        <translation>القيمة بلا اسم</translation>
     </message>
     <message>
         <source>The row does not say which object it belongs to</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يذكر الصف الكائن الذي ينتمي إليه</translation>
     </message>
     <message>
         <source>%1 is not a unit</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 ليس وحدة</translation>
     </message>
     <message>
         <source>There is no column of numbers</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يوجد عمود أعداد</translation>
     </message>
     <message>
         <source>Column %1</source>
-        <translation type="unfinished"></translation>
+        <translation>العمود %1</translation>
     </message>
     <message>
         <source>Column %1 holds text and was left out</source>
-        <translation type="unfinished"></translation>
+        <translation>العمود %1 يحوي نصًا وقد تُرك</translation>
     </message>
     <message>
         <source>Columns %1 hold text and were left out</source>
-        <translation type="unfinished"></translation>
+        <translation>الأعمدة %1 تحوي نصوصًا وقد تُركت</translation>
     </message>
     <message>
         <source>Reading was cancelled</source>
-        <translation type="unfinished"></translation>
+        <translation>أُلغيت القراءة</translation>
     </message>
 </context>
 <context>
     <name>ZtTextDecoder</name>
     <message>
         <source>The file is not a text file: it holds a NUL character</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف ليس ملفًا نصيًا: فيه محرف NUL</translation>
     </message>
     <message>
         <source>The file is not valid UTF-16 text</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف ليس نص UTF-16 صالحًا</translation>
     </message>
     <message>
         <source>The text is not valid UTF-8</source>
-        <translation type="unfinished"></translation>
+        <translation>النص ليس UTF-8 صالحًا</translation>
     </message>
 </context>
 <context>
     <name>ZtUvcCameraSource</name>
     <message>
         <source>%1 is not connected</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 غير متصل</translation>
     </message>
     <message>
         <source>%1 is disconnected or in use (%2)</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 غير متصل أو قيد الاستخدام (%2)</translation>
     </message>
 </context>
 <context>
     <name>ZtVideoFileSource</name>
     <message>
         <source>The video does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>الفيديو غير موجود</translation>
     </message>
     <message>
         <source>The video cannot be read</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذرت قراءة الفيديو</translation>
     </message>
     <message>
         <source>The video is empty</source>
-        <translation type="unfinished"></translation>
+        <translation>الفيديو فارغ</translation>
     </message>
     <message>
         <source>there is only sound in it</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يحوي إلا صوتًا</translation>
     </message>
     <message>
         <source>The video %1 cannot be played (%2)</source>
-        <translation type="unfinished"></translation>
+        <translation>تعذر تشغيل الفيديو %1 (%2)</translation>
     </message>
     <message>
         <source>the file is damaged</source>
-        <translation type="unfinished"></translation>
+        <translation>الملف تالف</translation>
     </message>
 </context>
 <context>
     <name>acss</name>
     <message>
         <source>The icon %1 is missing.</source>
-        <translation type="unfinished"></translation>
+        <translation>الرمز %1 مفقود.</translation>
     </message>
 </context>
 </TS>

@@ -5,516 +5,516 @@
     <name>KvDeskActions</name>
     <message>
         <source>&amp;New session</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Nouvelle session</translation>
     </message>
     <message>
         <source>Start an empty session</source>
-        <translation type="unfinished"></translation>
+        <translation>Commencer une session vide</translation>
     </message>
     <message>
         <source>Open &amp;image...</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrir une &amp;image...</translation>
     </message>
     <message>
         <source>Open image</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrir une image</translation>
     </message>
     <message>
         <source>&amp;Open session...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Ouvrir une session...</translation>
     </message>
     <message>
         <source>Open session</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrir une session</translation>
     </message>
     <message>
         <source>Import &amp;table...</source>
-        <translation type="unfinished"></translation>
+        <translation>Importer un &amp;tableau...</translation>
     </message>
     <message>
         <source>Import table of measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Importer un tableau de valeurs mesurées</translation>
     </message>
     <message>
         <source>&amp;Save session</source>
-        <translation type="unfinished"></translation>
+        <translation>Enre&amp;gistrer la session</translation>
     </message>
     <message>
         <source>Save session</source>
-        <translation type="unfinished"></translation>
+        <translation>Enregistrer la session</translation>
     </message>
     <message>
         <source>Save session &amp;as...</source>
-        <translation type="unfinished"></translation>
+        <translation>Enregistrer la session &amp;sous...</translation>
     </message>
     <message>
         <source>Save session to another file</source>
-        <translation type="unfinished"></translation>
+        <translation>Enregistrer la session dans un autre fichier</translation>
     </message>
     <message>
         <source>&amp;Quit</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Quitter</translation>
     </message>
     <message>
         <source>Quit the program</source>
-        <translation type="unfinished"></translation>
+        <translation>Quitter le programme</translation>
     </message>
     <message>
         <source>Zoom &amp;in</source>
-        <translation type="unfinished"></translation>
+        <translation>Zoom a&amp;vant</translation>
     </message>
     <message>
         <source>Zoom in</source>
-        <translation type="unfinished"></translation>
+        <translation>Zoom avant</translation>
     </message>
     <message>
         <source>Zoom &amp;out</source>
-        <translation type="unfinished"></translation>
+        <translation>Zoom a&amp;rrière</translation>
     </message>
     <message>
         <source>Zoom out</source>
-        <translation type="unfinished"></translation>
+        <translation>Zoom arrière</translation>
     </message>
     <message>
         <source>&amp;Fit to window</source>
-        <translation type="unfinished"></translation>
+        <translation>Ajuster à la &amp;fenêtre</translation>
     </message>
     <message>
         <source>Show the whole image</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher l’image entière</translation>
     </message>
     <message>
         <source>&amp;Actual size</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Taille réelle</translation>
     </message>
     <message>
         <source>Show the image at 100 %</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher l’image à 100 %</translation>
     </message>
     <message>
         <source>&amp;Measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Valeurs &amp;mesurées</translation>
     </message>
     <message>
         <source>Show or hide the measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher ou masquer les valeurs mesurées</translation>
     </message>
     <message>
         <source>Status &amp;log</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Journal d’état</translation>
     </message>
     <message>
         <source>Show or hide the status log</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher ou masquer le journal d’état</translation>
     </message>
     <message>
         <source>&amp;Dark or light theme</source>
-        <translation type="unfinished"></translation>
+        <translation>Thème &amp;sombre ou clair</translation>
     </message>
     <message>
         <source>Change between the dark and the light theme</source>
-        <translation type="unfinished"></translation>
+        <translation>Passer du thème sombre au thème clair et inversement</translation>
     </message>
     <message>
         <source>S&amp;ettings...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Paramètres...</translation>
     </message>
     <message>
         <source>Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Paramètres</translation>
     </message>
     <message>
         <source>&amp;About Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>À &amp;propos de Measuring Desk</translation>
     </message>
     <message>
         <source>About Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>À propos de Measuring Desk</translation>
     </message>
     <message>
         <source>%1 (%2)</source>
         <comment>command (shortcut)</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 (%2)</translation>
     </message>
     <message>
         <source>&amp;Export measured values...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Exporter les valeurs mesurées...</translation>
     </message>
     <message>
         <source>Export measured values as a table</source>
-        <translation type="unfinished"></translation>
+        <translation>Exporter les valeurs mesurées sous forme de tableau</translation>
     </message>
     <message>
         <source>&amp;Undo</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Annuler</translation>
     </message>
     <message>
         <source>Undo the last step</source>
-        <translation type="unfinished"></translation>
+        <translation>Annuler la dernière action</translation>
     </message>
     <message>
         <source>&amp;Redo</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Rétablir</translation>
     </message>
     <message>
         <source>Redo what was undone</source>
-        <translation type="unfinished"></translation>
+        <translation>Rétablir l’action annulée</translation>
     </message>
     <message>
         <source>Cu&amp;t</source>
-        <translation type="unfinished"></translation>
+        <translation>Co&amp;uper</translation>
     </message>
     <message>
         <source>Cut the selected objects</source>
-        <translation type="unfinished"></translation>
+        <translation>Couper les objets sélectionnés</translation>
     </message>
     <message>
         <source>&amp;Copy</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Copier</translation>
     </message>
     <message>
         <source>Copy the selected objects</source>
-        <translation type="unfinished"></translation>
+        <translation>Copier les objets sélectionnés</translation>
     </message>
     <message>
         <source>&amp;Paste</source>
-        <translation type="unfinished"></translation>
+        <translation>C&amp;oller</translation>
     </message>
     <message>
         <source>Paste copied objects</source>
-        <translation type="unfinished"></translation>
+        <translation>Coller les objets copiés</translation>
     </message>
     <message>
         <source>&amp;Delete</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Supprimer</translation>
     </message>
     <message>
         <source>Delete the selected objects</source>
-        <translation type="unfinished"></translation>
+        <translation>Supprimer les objets sélectionnés</translation>
     </message>
     <message>
         <source>Select &amp;all</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Tout sélectionner</translation>
     </message>
     <message>
         <source>Select all objects on the image</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionner tous les objets de l’image</translation>
     </message>
     <message>
         <source>Re&amp;name</source>
-        <translation type="unfinished"></translation>
+        <translation>Re&amp;nommer</translation>
     </message>
     <message>
         <source>Give the selected object a name</source>
-        <translation type="unfinished"></translation>
+        <translation>Donner un nom à l’objet sélectionné</translation>
     </message>
     <message>
         <source>&amp;Find measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Rechercher des &amp;valeurs mesurées</translation>
     </message>
     <message>
         <source>Filter the measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Filtrer les valeurs mesurées</translation>
     </message>
     <message>
         <source>&amp;Select</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Sélectionner</translation>
     </message>
     <message>
         <source>Select and change objects</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionner et modifier des objets</translation>
     </message>
     <message>
         <source>&amp;Line</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Ligne</translation>
     </message>
     <message>
         <source>Measure a length</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer une longueur</translation>
     </message>
     <message>
         <source>&amp;Polyline</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Polyligne</translation>
     </message>
     <message>
         <source>Measure the length of a way</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer la longueur d’un tracé</translation>
     </message>
     <message>
         <source>Parallel &amp;distance</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Distance parallèle</translation>
     </message>
     <message>
         <source>Measure the distance of a point from a line</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer la distance d’un point à une ligne</translation>
     </message>
     <message>
         <source>&amp;Arc</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Arc</translation>
     </message>
     <message>
         <source>Measure an arc through three points</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer un arc passant par trois points</translation>
     </message>
     <message>
         <source>&amp;Circle</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Cercle</translation>
     </message>
     <message>
         <source>Measure a circle</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer un cercle</translation>
     </message>
     <message>
         <source>&amp;Rectangle</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Rectangle</translation>
     </message>
     <message>
         <source>Measure a rectangle</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer un rectangle</translation>
     </message>
     <message>
         <source>Poly&amp;gon</source>
-        <translation type="unfinished"></translation>
+        <translation>Poly&amp;gone</translation>
     </message>
     <message>
         <source>Measure the area of a polygon</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer l’aire d’un polygone</translation>
     </message>
     <message>
         <source>Cou&amp;nter</source>
-        <translation type="unfinished"></translation>
+        <translation>Comp&amp;teur</translation>
     </message>
     <message>
         <source>Count by clicks</source>
-        <translation type="unfinished"></translation>
+        <translation>Compter par clics</translation>
     </message>
     <message>
         <source>&amp;Text note</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Note de texte</translation>
     </message>
     <message>
         <source>Write on the image</source>
-        <translation type="unfinished"></translation>
+        <translation>Écrire sur l’image</translation>
     </message>
     <message>
         <source>Scale &amp;bar</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Barre d’échelle</translation>
     </message>
     <message>
         <source>Draw a scale bar</source>
-        <translation type="unfinished"></translation>
+        <translation>Tracer une barre d’échelle</translation>
     </message>
     <message>
         <source>Cali&amp;bration...</source>
-        <translation type="unfinished"></translation>
+        <translation>Étal&amp;onnage...</translation>
     </message>
     <message>
         <source>Say how large a pixel of the image is</source>
-        <translation type="unfinished"></translation>
+        <translation>Indiquer la taille d’un pixel de l’image</translation>
     </message>
     <message>
         <source>Use the file&apos;s pixel size</source>
-        <translation type="unfinished"></translation>
+        <translation>Utiliser la taille de pixel du fichier</translation>
     </message>
     <message>
         <source>Measure with the pixel size that the image&apos;s file states</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer avec la taille de pixel indiquée par le fichier image</translation>
     </message>
     <message>
         <source>&amp;Take snapshot</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Prendre un instantané</translation>
     </message>
     <message>
         <source>Save the image to the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>Enregistrer l’image dans la galerie</translation>
     </message>
     <message>
         <source>Snapshots with &amp;measurements</source>
-        <translation type="unfinished"></translation>
+        <translation>Instantanés avec &amp;mesures</translation>
     </message>
     <message>
         <source>Draw the measured objects on snapshots</source>
-        <translation type="unfinished"></translation>
+        <translation>Tracer les objets mesurés sur les instantanés</translation>
     </message>
     <message>
         <source>&amp;Freeze</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Figer</translation>
     </message>
     <message>
         <source>Freeze the live image</source>
-        <translation type="unfinished"></translation>
+        <translation>Figer l’image en direct</translation>
     </message>
     <message>
         <source>&amp;Labels on the image</source>
-        <translation type="unfinished"></translation>
+        <translation>Éti&amp;quettes sur l’image</translation>
     </message>
     <message>
         <source>Show or hide the labels of objects</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher ou masquer les étiquettes des objets</translation>
     </message>
     <message>
         <source>Pixel &amp;rulers</source>
-        <translation type="unfinished"></translation>
+        <translation>Règ&amp;les en pixels</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher ou masquer les règles</translation>
     </message>
     <message>
         <source>&amp;Scale bar on the image</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Barre d’échelle sur l’image</translation>
     </message>
     <message>
         <source>Show or hide the scale bar, on reports, too</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher ou masquer la barre d’échelle, y compris dans les rapports</translation>
     </message>
     <message>
         <source>&amp;Gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Galerie</translation>
     </message>
     <message>
         <source>Show or hide the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher ou masquer la galerie</translation>
     </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
     <message>
         <source>the folder &quot;%1&quot; cannot be written</source>
-        <translation type="unfinished"></translation>
+        <translation>impossible d’écrire dans le dossier « %1 »</translation>
     </message>
     <message>
         <source>Unsaved changes are not being copied: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Les modifications non enregistrées ne sont pas sauvegardées : %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCalibrationCommands</name>
     <message>
         <source>The session measures with it already</source>
-        <translation type="unfinished"></translation>
+        <translation>La session mesure déjà avec celle-ci</translation>
     </message>
     <message>
         <source>The image&apos;s file does not state one</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier image n’en indique pas</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCalibrationDialog</name>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>Étalonnage</translation>
     </message>
     <message>
         <source>Objective</source>
-        <translation type="unfinished"></translation>
+        <translation>Objectif</translation>
     </message>
     <message>
         <source>Choose an objective, or type the name of a new one</source>
-        <translation type="unfinished"></translation>
+        <translation>Choisissez un objectif ou saisissez le nom d’un nouveau</translation>
     </message>
     <message>
         <source>Such as 10x</source>
-        <translation type="unfinished"></translation>
+        <translation>P. ex. 10x</translation>
     </message>
     <message>
         <source>In use</source>
-        <translation type="unfinished"></translation>
+        <translation>Actuel</translation>
     </message>
     <message>
         <source>New calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>Nouvel étalonnage</translation>
     </message>
     <message>
         <source>Known distance</source>
-        <translation type="unfinished"></translation>
+        <translation>Distance connue</translation>
     </message>
     <message>
         <source>Image file</source>
-        <translation type="unfinished"></translation>
+        <translation>Fichier image</translation>
     </message>
     <message>
         <source>Typed</source>
-        <translation type="unfinished"></translation>
+        <translation>Saisie</translation>
     </message>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>Nom</translation>
     </message>
     <message>
         <source>Who</source>
-        <translation type="unfinished"></translation>
+        <translation>Opérateur</translation>
     </message>
     <message>
         <source>Note</source>
-        <translation type="unfinished"></translation>
+        <translation>Note</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished"></translation>
+        <translation>Étalonner</translation>
     </message>
     <message>
         <source>History of the objective</source>
-        <translation type="unfinished"></translation>
+        <translation>Historique de l’objectif</translation>
     </message>
     <message>
         <source>Calibrations of this objective appear here</source>
-        <translation type="unfinished"></translation>
+        <translation>Les étalonnages de cet objectif s’affichent ici</translation>
     </message>
     <message>
         <source>Use again</source>
-        <translation type="unfinished"></translation>
+        <translation>Réutiliser</translation>
     </message>
     <message>
         <source>Close</source>
-        <translation type="unfinished"></translation>
+        <translation>Fermer</translation>
     </message>
     <message>
         <source>New pixel size: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Nouvelle taille de pixel : %1</translation>
     </message>
     <message>
         <source>No pixel size yet</source>
-        <translation type="unfinished"></translation>
+        <translation>Pas encore de taille de pixel</translation>
     </message>
     <message>
         <source>Measure with this pixel size and remember it</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer avec cette taille de pixel et la mémoriser</translation>
     </message>
     <message>
         <source>Complete the fields above first</source>
-        <translation type="unfinished"></translation>
+        <translation>Remplissez d’abord les champs ci-dessus</translation>
     </message>
     <message>
         <source>Measure with the selected calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesurer avec l’étalonnage sélectionné</translation>
     </message>
     <message>
         <source>Select a calibration in the table first</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionnez d’abord un étalonnage dans le tableau</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCalibrationHistory</name>
     <message>
         <source>Date</source>
-        <translation type="unfinished"></translation>
+        <translation>Date</translation>
     </message>
     <message>
         <source>Who</source>
-        <translation type="unfinished"></translation>
+        <translation>Opérateur</translation>
     </message>
     <message>
         <source>Pixel size</source>
-        <translation type="unfinished"></translation>
+        <translation>Taille de pixel</translation>
     </message>
     <message>
         <source>Origin</source>
-        <translation type="unfinished"></translation>
+        <translation>Origine</translation>
     </message>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>Nom</translation>
     </message>
 </context>
 <context>
@@ -522,50 +522,50 @@
     <message>
         <source>%1 μm</source>
         <comment>size of a pixel</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 μm</translation>
     </message>
     <message>
         <source>%1 × %2 μm</source>
         <comment>width and height of a pixel</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 × %2 μm</translation>
     </message>
     <message>
         <source>Known distance</source>
-        <translation type="unfinished"></translation>
+        <translation>Distance connue</translation>
     </message>
     <message>
         <source>Image file</source>
-        <translation type="unfinished"></translation>
+        <translation>Fichier image</translation>
     </message>
     <message>
         <source>Typed</source>
-        <translation type="unfinished"></translation>
+        <translation>Saisie</translation>
     </message>
     <message>
         <source>Not calibrated</source>
-        <translation type="unfinished"></translation>
+        <translation>Non étalonné</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 indique une taille de pixel de %2 ; la session mesure avec %3</translation>
     </message>
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 indique une taille de pixel de %2 ; la session mesure en pixels</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCommandLine</name>
     <message>
         <source>There is no theme &quot;%1&quot;: use %2</source>
-        <translation type="unfinished"></translation>
+        <translation>Il n’existe pas de thème « %1 » : utilisez %2</translation>
     </message>
     <message>
         <source> or </source>
-        <translation type="unfinished"></translation>
+        <translation> ou </translation>
     </message>
     <message>
         <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
@@ -581,30 +581,42 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation type="unfinished"></translation>
+        <translation>Utilisation : measuringdesk [OPTION...] [SESSION|IMAGE|TABLEAU...]
+Mesure des objets sur des images et affiche leurs valeurs.
+
+  --session FICHIER   ouvrir une session
+  --image FICHIER     ouvrir une image
+  --table FICHIER     importer un tableau de valeurs mesurées
+  --theme Dark|Light  thème pour cette exécution
+  --plugins DOSSIER   chercher aussi des plug-ins ici ; répétable
+  --help              afficher ce texte
+  --version           afficher la version
+
+STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
+</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCounterBar</name>
     <message>
         <source>Clicks count for</source>
-        <translation type="unfinished"></translation>
+        <translation>Clics comptés pour</translation>
     </message>
     <message>
         <source>The counter that gets the clicks (1 to 9)</source>
-        <translation type="unfinished"></translation>
+        <translation>Le compteur auquel les clics s’ajoutent (1 à 9)</translation>
     </message>
     <message>
         <source>Count another class</source>
-        <translation type="unfinished"></translation>
+        <translation>Compter une autre classe</translation>
     </message>
     <message>
         <source>A right click takes a place away</source>
-        <translation type="unfinished"></translation>
+        <translation>Un clic droit retire une marque</translation>
     </message>
     <message>
         <source>A new counter</source>
-        <translation type="unfinished"></translation>
+        <translation>Nouveau compteur</translation>
     </message>
 </context>
 <context>
@@ -612,326 +624,326 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>&amp;Undo %1</source>
         <extracomment>%1 is what is undone or redone, such as &quot;move of Line 3&quot;</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Annuler : %1</translation>
     </message>
     <message>
         <source>&amp;Undo</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Annuler</translation>
     </message>
     <message>
         <source>&amp;Redo %1</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Rétablir : %1</translation>
     </message>
     <message>
         <source>&amp;Redo</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Rétablir</translation>
     </message>
     <message>
         <source>Nothing was done yet</source>
-        <translation type="unfinished"></translation>
+        <translation>Il n’y a encore rien à annuler</translation>
     </message>
     <message>
         <source>Nothing was undone</source>
-        <translation type="unfinished"></translation>
+        <translation>Il n’y a rien à rétablir</translation>
     </message>
     <message>
         <source>Select an object first</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionnez d’abord un objet</translation>
     </message>
     <message>
         <source>Select one object first</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionnez d’abord un seul objet</translation>
     </message>
     <message>
         <source>No measured objects were copied</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucun objet mesuré n’a été copié</translation>
     </message>
 </context>
 <context>
     <name>KvDeskExportCommand</name>
     <message>
         <source>Nothing was measured yet</source>
-        <translation type="unfinished"></translation>
+        <translation>Rien n’a encore été mesuré</translation>
     </message>
     <message>
         <source>Measured values</source>
         <comment>file name</comment>
-        <translation type="unfinished"></translation>
+        <translation>Valeurs mesurées</translation>
     </message>
     <message>
         <source>JSON files</source>
-        <translation type="unfinished"></translation>
+        <translation>Fichiers JSON</translation>
     </message>
     <message>
         <source>CSV tables</source>
-        <translation type="unfinished"></translation>
+        <translation>Tableaux CSV</translation>
     </message>
     <message>
         <source>Export measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Exporter les valeurs mesurées</translation>
     </message>
     <message>
         <source>Export cancelled: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Exportation annulée : %1</translation>
     </message>
     <message>
         <source>The table &quot;%1&quot; was not written.</source>
-        <translation type="unfinished"></translation>
+        <translation>Le tableau « %1 » n’a pas été écrit.</translation>
     </message>
     <message>
         <source>Measured values exported: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Valeurs mesurées exportées : %1</translation>
     </message>
     <message>
         <source>Exporting measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Exportation des valeurs mesurées</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished"></translation>
+        <translation>Annuler</translation>
     </message>
 </context>
 <context>
     <name>KvDeskExportDialog</name>
     <message>
         <source>Export measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Exporter les valeurs mesurées</translation>
     </message>
     <message>
         <source>Table</source>
-        <translation type="unfinished"></translation>
+        <translation>Tableau</translation>
     </message>
     <message>
         <source>Numbers</source>
-        <translation type="unfinished"></translation>
+        <translation>Nombres</translation>
     </message>
     <message>
         <source>Only the selected objects (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>Uniquement les objets sélectionnés (%1)</translation>
     </message>
     <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
-        <translation type="unfinished"></translation>
+        <translation>Indicateur d’ordre des octets (BOM), pour les tableurs qui n’attendent pas l’UTF-8</translation>
     </message>
     <message>
         <source>Apostrophe before names that spreadsheets take for formulas</source>
-        <translation type="unfinished"></translation>
+        <translation>Apostrophe devant les noms que les tableurs prennent pour des formules</translation>
     </message>
     <message>
         <source>Changes names that begin with =, +, - or @: they are others when the table is imported again</source>
-        <translation type="unfinished"></translation>
+        <translation>Modifie les noms commençant par =, +, - ou @ : ils seront différents si le tableau est réimporté</translation>
     </message>
     <message>
         <source>Export...</source>
-        <translation type="unfinished"></translation>
+        <translation>Exporter...</translation>
     </message>
     <message>
         <source>CSV, one row per value</source>
-        <translation type="unfinished"></translation>
+        <translation>CSV, une ligne par valeur</translation>
     </message>
     <message>
         <source>CSV, one row per object</source>
-        <translation type="unfinished"></translation>
+        <translation>CSV, une ligne par objet</translation>
     </message>
     <message>
         <source>JSON</source>
-        <translation type="unfinished"></translation>
+        <translation>JSON</translation>
     </message>
     <message>
         <source>1.5, commas between the fields</source>
-        <translation type="unfinished"></translation>
+        <translation>1.5, virgules entre les champs</translation>
     </message>
     <message>
         <source>1,5, semicolons between the fields (spreadsheets, %1)</source>
         <extracomment>%1 is the name of a language</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>1,5, points-virgules entre les champs (tableurs, %1)</translation>
     </message>
     <message>
         <source>1.5, commas between the fields (spreadsheets, %1)</source>
-        <translation type="unfinished"></translation>
+        <translation>1.5, virgules entre les champs (tableurs, %1)</translation>
     </message>
     <message>
         <source>For statistics programs. Can be imported here again.</source>
-        <translation type="unfinished"></translation>
+        <translation>Pour les logiciels de statistiques. Peut être réimporté ici.</translation>
     </message>
     <message>
         <source>For spreadsheets. Headings name the units.</source>
-        <translation type="unfinished"></translation>
+        <translation>Pour les tableurs. Les en-têtes indiquent les unités.</translation>
     </message>
     <message>
         <source>For programs. Numbers always have a decimal point.</source>
-        <translation type="unfinished"></translation>
+        <translation>Pour les programmes. Les nombres ont toujours un point décimal.</translation>
     </message>
     <message>
         <source>No measured object is selected</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucun objet mesuré n’est sélectionné</translation>
     </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
     <message>
         <source>&amp;Exposure</source>
-        <translation type="unfinished"></translation>
+        <translation>E&amp;xposition</translation>
     </message>
     <message>
         <source>Exposure time of the camera</source>
-        <translation type="unfinished"></translation>
+        <translation>Temps d’exposition de la caméra</translation>
     </message>
     <message>
         <source> ms</source>
         <comment>milliseconds</comment>
-        <translation type="unfinished"></translation>
+        <translation> ms</translation>
     </message>
 </context>
 <context>
     <name>KvDeskFileCommands</name>
     <message>
         <source>Sessions</source>
-        <translation type="unfinished"></translation>
+        <translation>Sessions</translation>
     </message>
     <message>
         <source>All files</source>
-        <translation type="unfinished"></translation>
+        <translation>Tous les fichiers</translation>
     </message>
     <message>
         <source>Unsaved changes</source>
-        <translation type="unfinished"></translation>
+        <translation>Modifications non enregistrées</translation>
     </message>
     <message>
         <source>Save the changes to &quot;%1&quot;?</source>
-        <translation type="unfinished"></translation>
+        <translation>Enregistrer les modifications de « %1 » ?</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not opened.</source>
-        <translation type="unfinished"></translation>
+        <translation>La session « %1 » n’a pas été ouverte.</translation>
     </message>
     <message>
         <source>Session opened: %1 (objects: %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>Session ouverte : %1 (objets : %2)</translation>
     </message>
     <message>
         <source>Image missing</source>
-        <translation type="unfinished"></translation>
+        <translation>Image manquante</translation>
     </message>
     <message>
         <source>Open the session without its image?</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrir la session sans son image ?</translation>
     </message>
     <message>
         <source>The image &quot;%1&quot; was not opened.</source>
-        <translation type="unfinished"></translation>
+        <translation>L’image « %1 » n’a pas été ouverte.</translation>
     </message>
     <message>
         <source>Image opened: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Image ouverte : %1</translation>
     </message>
     <message>
         <source>The table &quot;%1&quot; was not imported.</source>
-        <translation type="unfinished"></translation>
+        <translation>Le tableau « %1 » n’a pas été importé.</translation>
     </message>
     <message>
         <source>%1: %2</source>
         <comment>file, remark</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 : %2</translation>
     </message>
     <message>
         <source>Table imported: %1 (objects: %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>Tableau importé : %1 (objets : %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
-        <translation type="unfinished"></translation>
+        <translation>La session « %1 » n’a pas été enregistrée.</translation>
     </message>
     <message>
         <source>Session saved: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Session enregistrée : %1</translation>
     </message>
     <message>
         <source>Open session</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrir une session</translation>
     </message>
     <message>
         <source>Open image</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrir une image</translation>
     </message>
     <message>
         <source>Images</source>
-        <translation type="unfinished"></translation>
+        <translation>Images</translation>
     </message>
     <message>
         <source>Import table</source>
-        <translation type="unfinished"></translation>
+        <translation>Importer un tableau</translation>
     </message>
     <message>
         <source>Tables</source>
-        <translation type="unfinished"></translation>
+        <translation>Tableaux</translation>
     </message>
     <message>
         <source>Save session</source>
-        <translation type="unfinished"></translation>
+        <translation>Enregistrer la session</translation>
     </message>
     <message>
         <source>Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>Measuring Desk</translation>
     </message>
     <message>
         <source>Only one session can be open; not opened: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Une seule session peut être ouverte ; non ouverte : %1</translation>
     </message>
     <message>
         <source>Neither a session, an image nor a table: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Ni session, ni image, ni tableau : %1</translation>
     </message>
     <message>
         <source>There is not enough memory</source>
-        <translation type="unfinished"></translation>
+        <translation>Mémoire insuffisante</translation>
     </message>
     <message>
         <source>Opening &quot;%1&quot;</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouverture de « %1 »</translation>
     </message>
     <message>
         <source>The measurements were not restored.</source>
-        <translation type="unfinished"></translation>
+        <translation>Les mesures n’ont pas été restaurées.</translation>
     </message>
     <message>
         <source>Restoring measurements</source>
-        <translation type="unfinished"></translation>
+        <translation>Restauration des mesures</translation>
     </message>
     <message>
         <source>Measurements restored: %1 (objects: %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesures restaurées : %1 (objets : %2)</translation>
     </message>
     <message>
         <source>Importing &quot;%1&quot;</source>
-        <translation type="unfinished"></translation>
+        <translation>Importation de « %1 »</translation>
     </message>
     <message>
         <source>Saving &quot;%1&quot;</source>
-        <translation type="unfinished"></translation>
+        <translation>Enregistrement de « %1 »</translation>
     </message>
     <message>
         <source>Session changed by another program</source>
-        <translation type="unfinished"></translation>
+        <translation>Session modifiée par un autre programme</translation>
     </message>
     <message>
         <source>&quot;%1&quot; was changed by another program. Overwrite its changes?</source>
-        <translation type="unfinished"></translation>
+        <translation>« %1 » a été modifiée par un autre programme. Écraser ces modifications ?</translation>
     </message>
     <message>
         <source>Overwrite</source>
-        <translation type="unfinished"></translation>
+        <translation>Écraser</translation>
     </message>
     <message>
         <source>Save as...</source>
-        <translation type="unfinished"></translation>
+        <translation>Enregistrer sous...</translation>
     </message>
     <message numerus="yes">
         <source>%n files were not opened.</source>
         <extracomment>%n is 2 at least</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%n fichier n’a pas été ouvert.</numerusform>
+            <numerusform>%n fichiers n’ont pas été ouverts.</numerusform>
         </translation>
     </message>
 </context>
@@ -940,118 +952,118 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>%1 states pixels of %2.</source>
         <comment>file, size</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 indique une taille de pixel de %2.</translation>
     </message>
     <message>
         <source>The image&apos;s file does not state how large its pixels are.</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier image n’indique pas la taille de ses pixels.</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGallery</name>
     <message>
         <source>Gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>Galerie</translation>
     </message>
     <message>
         <source>Hide the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>Masquer la galerie</translation>
     </message>
     <message>
         <source>&amp;Open image</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Ouvrir l’image</translation>
     </message>
     <message>
         <source>&amp;Show in folder</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher dans le &amp;dossier</translation>
     </message>
     <message>
         <source>&amp;Copy path</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Copier le chemin</translation>
     </message>
     <message>
         <source>&amp;Move to trash...</source>
-        <translation type="unfinished"></translation>
+        <translation>Mettre à la cor&amp;beille...</translation>
     </message>
     <message>
         <source>Choose &amp;folder...</source>
-        <translation type="unfinished"></translation>
+        <translation>C&amp;hoisir un dossier...</translation>
     </message>
     <message>
         <source>Show the images of a folder</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher les images d’un dossier</translation>
     </message>
     <message>
         <source>Save s&amp;napshots in this folder</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Enregistrer les instantanés dans ce dossier</translation>
     </message>
     <message>
         <source>Folder of the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>Dossier de la galerie</translation>
     </message>
     <message>
         <source>More commands of the gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>Autres commandes de la galerie</translation>
     </message>
     <message>
         <source>Snapshots</source>
-        <translation type="unfinished"></translation>
+        <translation>Instantanés</translation>
     </message>
     <message>
         <source>Choose folder</source>
-        <translation type="unfinished"></translation>
+        <translation>Choisir un dossier</translation>
     </message>
     <message>
         <source>Snapshots are saved in %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Les instantanés sont enregistrés dans %1</translation>
     </message>
     <message>
         <source>Snapshots (%1) and the images of a folder appear here; drag them onto report pages</source>
-        <translation type="unfinished"></translation>
+        <translation>Les instantanés (%1) et les images d’un dossier s’affichent ici ; faites-les glisser sur les pages du rapport</translation>
     </message>
     <message>
         <source>There are no images in %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Il n’y a pas d’image dans %1</translation>
     </message>
     <message>
         <source>The folder %1 does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>Le dossier %1 n’existe pas</translation>
     </message>
     <message>
         <source>Select an image first</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionnez d’abord une image</translation>
     </message>
     <message>
         <source>Snapshots are saved in this folder already</source>
-        <translation type="unfinished"></translation>
+        <translation>Les instantanés sont déjà enregistrés dans ce dossier</translation>
     </message>
     <message>
         <source>Move &quot;%1&quot; to the trash?</source>
-        <translation type="unfinished"></translation>
+        <translation>Mettre « %1 » à la corbeille ?</translation>
     </message>
     <message>
         <source>Move the selected images (%1) to the trash?</source>
-        <translation type="unfinished"></translation>
+        <translation>Mettre les images sélectionnées (%1) à la corbeille ?</translation>
     </message>
     <message>
         <source>Move to trash</source>
-        <translation type="unfinished"></translation>
+        <translation>Mettre à la corbeille</translation>
     </message>
     <message>
         <source>Moved to the trash: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Mis à la corbeille : %1</translation>
     </message>
     <message>
         <source>Not moved to the trash: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Non mis à la corbeille : %1</translation>
     </message>
     <message>
         <source>Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>Measuring Desk</translation>
     </message>
     <message>
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
-        <translation type="unfinished"></translation>
+        <translation>Les fichiers sont toujours là. Ils sont protégés en écriture, ou il n’y a pas de corbeille pour eux.</translation>
     </message>
 </context>
 <context>
@@ -1059,223 +1071,224 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>%1 × %2 px</source>
         <comment>width, height</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 × %2 px</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGalleryView</name>
     <message>
         <source>Gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>Galerie</translation>
     </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
     <message>
         <source>Image</source>
-        <translation type="unfinished"></translation>
+        <translation>Image</translation>
     </message>
     <message>
         <source>Open an image or a session to start</source>
-        <translation type="unfinished"></translation>
+        <translation>Pour commencer, ouvrez une image ou une session</translation>
     </message>
 </context>
 <context>
     <name>KvDeskInlineEditor</name>
     <message>
         <source>Text</source>
-        <translation type="unfinished"></translation>
+        <translation>Texte</translation>
     </message>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>Nom</translation>
     </message>
 </context>
 <context>
     <name>KvDeskKnownDistance</name>
     <message>
         <source>inch</source>
-        <translation type="unfinished"></translation>
+        <translation>pouce</translation>
     </message>
     <message>
         <source>Use selected line</source>
-        <translation type="unfinished"></translation>
+        <translation>Utiliser la sélection</translation>
     </message>
     <message>
         <source>Length of the line</source>
-        <translation type="unfinished"></translation>
+        <translation>Longueur de la ligne</translation>
     </message>
     <message>
         <source>Unit of the length</source>
-        <translation type="unfinished"></translation>
+        <translation>Unité de la longueur</translation>
     </message>
     <message>
         <source>Its length</source>
-        <translation type="unfinished"></translation>
+        <translation>Longueur réelle</translation>
     </message>
     <message>
         <source>Draw a line over a distance that you know, such as on a stage micrometer, and select it.</source>
-        <translation type="unfinished"></translation>
+        <translation>Tracez une ligne sur une distance que vous connaissez, par exemple sur un micromètre objet, et sélectionnez-la.</translation>
     </message>
     <message>
         <source>No line yet</source>
-        <translation type="unfinished"></translation>
+        <translation>Pas encore de ligne</translation>
     </message>
     <message>
         <source>%1: %2</source>
         <comment>name and length of a line</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 : %2</translation>
     </message>
     <message>
         <source>Take the selected line as the known distance</source>
-        <translation type="unfinished"></translation>
+        <translation>Prendre la ligne sélectionnée comme distance connue</translation>
     </message>
     <message>
         <source>Select one line on the image first</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionnez d’abord une seule ligne sur l’image</translation>
     </message>
 </context>
 <context>
     <name>KvDeskLiveBar</name>
     <message>
         <source>Live image</source>
-        <translation type="unfinished"></translation>
+        <translation>Image en direct</translation>
     </message>
     <message>
         <source>Freeze</source>
-        <translation type="unfinished"></translation>
+        <translation>Figer</translation>
     </message>
     <message>
         <source>%1 fps</source>
         <extracomment>frames per second</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1 i/s</translation>
     </message>
     <message>
         <source>%1 delivers no pictures any more; this is the last one</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 ne fournit plus d’images ; celle-ci est la dernière</translation>
     </message>
     <message>
         <source>%1 delivers no pictures</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 ne fournit pas d’images</translation>
     </message>
     <message>
         <source>%1 is stopped</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 est à l’arrêt</translation>
     </message>
     <message>
         <source>Waiting for the first picture of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>En attente de la première image de %1</translation>
     </message>
     <message>
         <source>Frozen: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Image figée : %1</translation>
     </message>
     <message>
         <source>Live: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>En direct : %1</translation>
     </message>
     <message>
         <source>This image is not live</source>
-        <translation type="unfinished"></translation>
+        <translation>Cette image n’est pas en direct</translation>
     </message>
     <message>
         <source>&amp;Reconnect</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Reconnecter</translation>
     </message>
     <message>
         <source>&amp;Start</source>
-        <translation type="unfinished"></translation>
+        <translation>Démarr&amp;er</translation>
     </message>
     <message>
         <source>Frames per second
 Dropped, because newer ones came first: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Images par seconde
+Ignorées au profit de plus récentes : %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
     <message>
         <source>&amp;File</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Fichier</translation>
     </message>
     <message>
         <source>&amp;Recent sessions</source>
-        <translation type="unfinished"></translation>
+        <translation>Sessions &amp;récentes</translation>
     </message>
     <message>
         <source>&amp;View</source>
-        <translation type="unfinished"></translation>
+        <translation>Affic&amp;hage</translation>
     </message>
     <message>
         <source>&amp;Help</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Aide</translation>
     </message>
     <message>
         <source>Main tool bar</source>
-        <translation type="unfinished"></translation>
+        <translation>Barre d’outils principale</translation>
     </message>
     <message>
         <source>%1[*] - Measuring Desk</source>
         <extracomment>%1 is the name of a session; [*] is replaced by a star when it has unsaved changes</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1[*] – Measuring Desk</translation>
     </message>
     <message>
         <source>None yet</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucune pour l’instant</translation>
     </message>
     <message>
         <source>About Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>À propos de Measuring Desk</translation>
     </message>
     <message>
         <source>&lt;b&gt;Measuring Desk %1&lt;/b&gt;&lt;p&gt;Measures objects on images, and hosts plug-ins such as the statistics reports.&lt;/p&gt;&lt;p&gt;%2, MIT licence&lt;/p&gt;</source>
-        <translation type="unfinished"></translation>
+        <translation>&lt;b&gt;Measuring Desk %1&lt;/b&gt;&lt;p&gt;Mesure des objets sur des images et accueille des plug-ins tels que les rapports statistiques.&lt;/p&gt;&lt;p&gt;%2, licence MIT&lt;/p&gt;</translation>
     </message>
     <message>
         <source>Measuring Desk</source>
-        <translation type="unfinished"></translation>
+        <translation>Measuring Desk</translation>
     </message>
     <message>
         <source>&amp;Edit</source>
-        <translation type="unfinished"></translation>
+        <translation>É&amp;dition</translation>
     </message>
     <message>
         <source>&amp;Image</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Image</translation>
     </message>
     <message>
         <source>&amp;Measure</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Mesurer</translation>
     </message>
     <message>
         <source>Choose the image source</source>
-        <translation type="unfinished"></translation>
+        <translation>Choisir la source d’image</translation>
     </message>
 </context>
 <context>
     <name>KvDeskNotice</name>
     <message>
         <source>Close this message</source>
-        <translation type="unfinished"></translation>
+        <translation>Fermer ce message</translation>
     </message>
 </context>
 <context>
     <name>KvDeskObjectClipboard</name>
     <message>
         <source>Type</source>
-        <translation type="unfinished"></translation>
+        <translation>Type</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>Objet</translation>
     </message>
     <message>
         <source>Value name</source>
-        <translation type="unfinished"></translation>
+        <translation>Grandeur</translation>
     </message>
     <message>
         <source>Value</source>
-        <translation type="unfinished"></translation>
+        <translation>Valeur</translation>
     </message>
 </context>
 <context>
@@ -1284,168 +1297,168 @@ Dropped, because newer ones came first: %1</source>
         <source>%n objects</source>
         <comment>several measured objects</comment>
         <extracomment>%n is 2 at least</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%n objet</numerusform>
+            <numerusform>%n objets</numerusform>
         </translation>
     </message>
     <message>
         <source>drawing of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>tracer %1</translation>
     </message>
     <message>
         <source>change of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>modifier %1</translation>
     </message>
     <message>
         <source>move of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>déplacer %1</translation>
     </message>
     <message>
         <source>renaming of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>renommer %1</translation>
     </message>
     <message>
         <source>text of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>modifier le texte (%1)</translation>
     </message>
     <message>
         <source>showing of %1 of %2</source>
         <extracomment>%1 is a value, %2 an object</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>afficher %1 (%2)</translation>
     </message>
     <message>
         <source>hiding of %1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>masquer %1 (%2)</translation>
     </message>
     <message>
         <source>deletion of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>supprimer %1</translation>
     </message>
     <message>
         <source>change of the calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>modifier l’étalonnage</translation>
     </message>
     <message>
         <source>place of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>ajouter une marque (%1)</translation>
     </message>
     <message>
         <source>deletion of a place of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>supprimer une marque (%1)</translation>
     </message>
     <message>
         <source>pasting of %1</source>
-        <translation type="unfinished"></translation>
+        <translation>coller %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
     <message>
         <source>No plug-ins were found</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucun plug-in n’a été trouvé</translation>
     </message>
     <message>
         <source>It is no plug-in for this program</source>
-        <translation type="unfinished"></translation>
+        <translation>Ce n’est pas un plug-in pour ce programme</translation>
     </message>
     <message>
         <source>Its tools &quot;%1&quot; could not be started</source>
-        <translation type="unfinished"></translation>
+        <translation>Ses outils « %1 » n’ont pas pu être démarrés</translation>
     </message>
     <message>
         <source>Plug-in loaded: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Plug-in chargé : %1</translation>
     </message>
     <message>
         <source>Plug-in not loaded: %1: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>Plug-in non chargé : %1 : %2</translation>
     </message>
     <message>
         <source>It failed: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Il a échoué : %1</translation>
     </message>
     <message>
         <source>It failed for a reason of its own</source>
-        <translation type="unfinished"></translation>
+        <translation>Il a échoué pour une raison inconnue</translation>
     </message>
 </context>
 <context>
     <name>KvDeskProgress</name>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished"></translation>
+        <translation>Annuler</translation>
     </message>
     <message>
         <source>Leave everything as it was (Esc)</source>
-        <translation type="unfinished"></translation>
+        <translation>Tout laisser en l’état (Esc)</translation>
     </message>
 </context>
 <context>
     <name>KvDeskRecovery</name>
     <message>
         <source>Untitled session</source>
-        <translation type="unfinished"></translation>
+        <translation>Session sans titre</translation>
     </message>
     <message>
         <source>%1 (objects: %2)</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1 (objets : %2)</translation>
     </message>
 </context>
 <context>
     <name>KvDeskRecoveryBar</name>
     <message>
         <source>Show other measurements that were not saved</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher d’autres mesures qui n’ont pas été enregistrées</translation>
     </message>
     <message>
         <source>Restore</source>
-        <translation type="unfinished"></translation>
+        <translation>Restaurer</translation>
     </message>
     <message>
         <source>Open these measurements as a session with unsaved changes</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrir ces mesures comme session avec des modifications non enregistrées</translation>
     </message>
     <message>
         <source>Discard</source>
-        <translation type="unfinished"></translation>
+        <translation>Abandonner</translation>
     </message>
     <message>
         <source>Delete these measurements for good</source>
-        <translation type="unfinished"></translation>
+        <translation>Supprimer définitivement ces mesures</translation>
     </message>
     <message>
         <source>%1: %2</source>
         <extracomment>%1 is a time, %2 a session</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1 : %2</translation>
     </message>
     <message numerus="yes">
         <source>%n more</source>
         <comment>measurements that were not saved</comment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%n autre</numerusform>
+            <numerusform>%n autres</numerusform>
         </translation>
     </message>
     <message>
         <source>Measurements from %1 were not saved.</source>
-        <translation type="unfinished"></translation>
+        <translation>Les mesures (%1) n’ont pas été enregistrées.</translation>
     </message>
 </context>
 <context>
     <name>KvDeskRuler</name>
     <message>
         <source>Horizontal ruler</source>
-        <translation type="unfinished"></translation>
+        <translation>Règle horizontale</translation>
     </message>
     <message>
         <source>Vertical ruler</source>
-        <translation type="unfinished"></translation>
+        <translation>Règle verticale</translation>
     </message>
     <message>
         <source>Ruler in %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Règle en %1</translation>
     </message>
 </context>
 <context>
@@ -1453,254 +1466,254 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>n = %1, mean %2, SD %3, min %4, max %5</source>
         <extracomment>number of values, their mean, standard deviation, smallest and largest one</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>n = %1, moyenne %2, ET %3, min %4, max %5</translation>
     </message>
     <message>
         <source>Selected values: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Valeurs sélectionnées : %1</translation>
     </message>
     <message>
         <source>&quot;%1&quot; among them: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>Dont « %1 » : %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Moyenne : %1</translation>
     </message>
     <message>
         <source>Standard deviation: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Écart-type : %1</translation>
     </message>
     <message>
         <source>Smallest: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Minimum : %1</translation>
     </message>
     <message>
         <source>Largest: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Maximum : %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSession</name>
     <message>
         <source>Untitled session</source>
-        <translation type="unfinished"></translation>
+        <translation>Session sans titre</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSettingsDialog</name>
     <message>
         <source>Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Paramètres</translation>
     </message>
     <message>
         <source>Appearance</source>
-        <translation type="unfinished"></translation>
+        <translation>Apparence</translation>
     </message>
     <message>
         <source>Theme</source>
-        <translation type="unfinished"></translation>
+        <translation>Thème</translation>
     </message>
     <message>
         <source>Dark</source>
-        <translation type="unfinished"></translation>
+        <translation>Sombre</translation>
     </message>
     <message>
         <source>Light</source>
-        <translation type="unfinished"></translation>
+        <translation>Clair</translation>
     </message>
     <message>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>Langue</translation>
     </message>
     <message>
         <source>Another language takes effect when the program is started again.</source>
-        <translation type="unfinished"></translation>
+        <translation>Le changement de langue prend effet au redémarrage du programme.</translation>
     </message>
     <message>
         <source>Measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Valeurs mesurées</translation>
     </message>
     <message>
         <source>Automatic</source>
-        <translation type="unfinished"></translation>
+        <translation>Automatique</translation>
     </message>
     <message>
         <source>Significant digits</source>
-        <translation type="unfinished"></translation>
+        <translation>Chiffres significatifs</translation>
     </message>
     <message>
         <source>Length unit</source>
-        <translation type="unfinished"></translation>
+        <translation>Unité de longueur</translation>
     </message>
     <message>
         <source>Angle unit</source>
-        <translation type="unfinished"></translation>
+        <translation>Unité d’angle</translation>
     </message>
     <message>
         <source>Degrees (°)</source>
-        <translation type="unfinished"></translation>
+        <translation>Degrés (°)</translation>
     </message>
     <message>
         <source>Radians (rad)</source>
-        <translation type="unfinished"></translation>
+        <translation>Radians (rad)</translation>
     </message>
     <message>
         <source>System default</source>
-        <translation type="unfinished"></translation>
+        <translation>Langue du système</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
     <message>
         <source>The folder cannot be created</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible de créer le dossier</translation>
     </message>
     <message>
         <source>The picture cannot be encoded</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible d’encoder l’image</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSnapshots</name>
     <message>
         <source>Open an image first</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrez d’abord une image</translation>
     </message>
     <message>
         <source>No snapshot was taken: earlier ones are still being saved</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucun instantané n’a été pris : les précédents sont encore en cours d’enregistrement</translation>
     </message>
     <message>
         <source>Snapshot saved: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Instantané enregistré : %1</translation>
     </message>
     <message>
         <source>The snapshot was not saved. %1</source>
-        <translation type="unfinished"></translation>
+        <translation>L’instantané n’a pas été enregistré. %1</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSourceCommands</name>
     <message>
         <source>The image source &quot;%1&quot; was not opened.</source>
-        <translation type="unfinished"></translation>
+        <translation>La source d’image « %1 » n’a pas été ouverte.</translation>
     </message>
     <message>
         <source>Image source: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Source d’image : %1</translation>
     </message>
     <message>
         <source>Open image folder</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrir un dossier d’images</translation>
     </message>
     <message>
         <source>Open video</source>
-        <translation type="unfinished"></translation>
+        <translation>Ouvrir une vidéo</translation>
     </message>
     <message>
         <source>Videos</source>
-        <translation type="unfinished"></translation>
+        <translation>Vidéos</translation>
     </message>
 </context>
 <context>
     <name>KvDeskSourceMenu</name>
     <message>
         <source>Image &amp;source</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Source d’image</translation>
     </message>
     <message>
         <source>Still &amp;image...</source>
-        <translation type="unfinished"></translation>
+        <translation>Image &amp;fixe...</translation>
     </message>
     <message>
         <source>Image &amp;folder...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Dossier d’images...</translation>
     </message>
     <message>
         <source>Play the images of a folder like a camera</source>
-        <translation type="unfinished"></translation>
+        <translation>Lire les images d’un dossier comme celles d’une caméra</translation>
     </message>
     <message>
         <source>&amp;Video...</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Vidéo...</translation>
     </message>
     <message>
         <source>Play a video like a camera</source>
-        <translation type="unfinished"></translation>
+        <translation>Lire une vidéo comme les images d’une caméra</translation>
     </message>
     <message>
         <source>Looking for cameras...</source>
-        <translation type="unfinished"></translation>
+        <translation>Recherche de caméras...</translation>
     </message>
     <message>
         <source>No camera is connected</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucune caméra n’est connectée</translation>
     </message>
 </context>
 <context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
-        <translation type="unfinished"></translation>
+        <translation>Avertissement</translation>
     </message>
     <message>
         <source>Error</source>
-        <translation type="unfinished"></translation>
+        <translation>Erreur</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Information</translation>
     </message>
 </context>
 <context>
     <name>KvDeskStatusBar</name>
     <message>
         <source>%1 × %2 px</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 × %2 px</translation>
     </message>
     <message>
         <source>%1 %</source>
         <comment>zoom</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 %</translation>
     </message>
     <message>
         <source>x %1, y %2</source>
         <comment>pixel below the pointer</comment>
-        <translation type="unfinished"></translation>
+        <translation>x %1, y %2</translation>
     </message>
     <message>
         <source>Statistics of the selected values</source>
-        <translation type="unfinished"></translation>
+        <translation>Statistiques des valeurs sélectionnées</translation>
     </message>
     <message>
         <source>, %1</source>
         <comment>objective</comment>
-        <translation type="unfinished"></translation>
+        <translation>, %1</translation>
     </message>
     <message>
         <source>, %1/px</source>
         <comment>size of a pixel</comment>
-        <translation type="unfinished"></translation>
+        <translation>, %1/px</translation>
     </message>
 </context>
 <context>
     <name>KvDeskStatusLog</name>
     <message>
         <source>Status log</source>
-        <translation type="unfinished"></translation>
+        <translation>Journal d’état</translation>
     </message>
     <message>
         <source>Hide the status log</source>
-        <translation type="unfinished"></translation>
+        <translation>Masquer le journal d’état</translation>
     </message>
     <message>
         <source>Clear the status log</source>
-        <translation type="unfinished"></translation>
+        <translation>Effacer le journal d’état</translation>
     </message>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
-        <translation type="unfinished"></translation>
+        <translation>Les messages du programme et de ses plug-ins s’affichent ici</translation>
     </message>
 </context>
 <context>
@@ -1709,756 +1722,757 @@ Dropped, because newer ones came first: %1</source>
         <source>%1
 Reported by %2</source>
         <comment>message, source</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1
+Signalé par %2</translation>
     </message>
     <message>
         <source>Category</source>
-        <translation type="unfinished"></translation>
+        <translation>Catégorie</translation>
     </message>
     <message>
         <source>Time</source>
-        <translation type="unfinished"></translation>
+        <translation>Heure</translation>
     </message>
     <message>
         <source>Message</source>
-        <translation type="unfinished"></translation>
+        <translation>Message</translation>
     </message>
 </context>
 <context>
     <name>KvDeskTableView</name>
     <message>
         <source>Copy</source>
-        <translation type="unfinished"></translation>
+        <translation>Copier</translation>
     </message>
 </context>
 <context>
     <name>KvDeskToolStrip</name>
     <message>
         <source>Measuring tools</source>
-        <translation type="unfinished"></translation>
+        <translation>Outils de mesure</translation>
     </message>
 </context>
 <context>
     <name>KvDeskTypedPixelSize</name>
     <message>
         <source>Width of a pixel in micrometres</source>
-        <translation type="unfinished"></translation>
+        <translation>Largeur d’un pixel en micromètres</translation>
     </message>
     <message>
         <source>Height of a pixel in micrometres</source>
-        <translation type="unfinished"></translation>
+        <translation>Hauteur d’un pixel en micromètres</translation>
     </message>
     <message>
         <source>Same size in both directions</source>
-        <translation type="unfinished"></translation>
+        <translation>Même taille dans les deux directions</translation>
     </message>
     <message>
         <source>Width</source>
-        <translation type="unfinished"></translation>
+        <translation>Largeur</translation>
     </message>
     <message>
         <source>Height</source>
-        <translation type="unfinished"></translation>
+        <translation>Hauteur</translation>
     </message>
     <message>
         <source>Type how large a pixel of the image is in reality.</source>
-        <translation type="unfinished"></translation>
+        <translation>Saisissez la taille réelle d’un pixel de l’image.</translation>
     </message>
 </context>
 <context>
     <name>KvDeskValueCommands</name>
     <message>
         <source>Rename</source>
-        <translation type="unfinished"></translation>
+        <translation>Renommer</translation>
     </message>
     <message>
         <source>Delete object</source>
-        <translation type="unfinished"></translation>
+        <translation>Supprimer l’objet</translation>
     </message>
     <message>
         <source>Hide value</source>
-        <translation type="unfinished"></translation>
+        <translation>Masquer la valeur</translation>
     </message>
     <message>
         <source>Show all values of the object</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher toutes les valeurs de l’objet</translation>
     </message>
     <message>
         <source>Select one object first</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionnez d’abord un seul objet</translation>
     </message>
     <message>
         <source>Select an object first</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionnez d’abord un objet</translation>
     </message>
     <message>
         <source>Select a value first</source>
-        <translation type="unfinished"></translation>
+        <translation>Sélectionnez d’abord une valeur</translation>
     </message>
     <message>
         <source>No value of the selected object is hidden</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucune valeur de l’objet sélectionné n’est masquée</translation>
     </message>
     <message>
         <source>showing of values</source>
-        <translation type="unfinished"></translation>
+        <translation>afficher des valeurs</translation>
     </message>
     <message>
         <source>hiding of values</source>
-        <translation type="unfinished"></translation>
+        <translation>masquer des valeurs</translation>
     </message>
 </context>
 <context>
     <name>KvDeskValueTable</name>
     <message>
         <source>Measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Valeurs mesurées</translation>
     </message>
     <message>
         <source>Hide the measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Masquer les valeurs mesurées</translation>
     </message>
     <message>
         <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation type="unfinished"></translation>
+        <translation>Les valeurs mesurées s’affichent ici dès qu’une session est ouverte ou qu’un tableau est importé</translation>
     </message>
     <message>
         <source>Filter by type, object or value name</source>
-        <translation type="unfinished"></translation>
+        <translation>Filtrer par type, objet ou grandeur</translation>
     </message>
     <message>
         <source>Filter of the measured values</source>
-        <translation type="unfinished"></translation>
+        <translation>Filtre des valeurs mesurées</translation>
     </message>
     <message>
         <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation type="unfinished"></translation>
+        <translation>N’affiche que les lignes qui contiennent tous ces mots (Ctrl+F)</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucune valeur mesurée ne correspond au filtre</translation>
     </message>
     <message>
         <source>Clear the filter</source>
-        <translation type="unfinished"></translation>
+        <translation>Effacer le filtre</translation>
     </message>
     <message>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>%1 sur %2</translation>
     </message>
 </context>
 <context>
     <name>KvDeskValueTableModel</name>
     <message>
         <source>Type</source>
-        <translation type="unfinished"></translation>
+        <translation>Type</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>Objet</translation>
     </message>
     <message>
         <source>Value name</source>
-        <translation type="unfinished"></translation>
+        <translation>Grandeur</translation>
     </message>
     <message>
         <source>Value</source>
-        <translation type="unfinished"></translation>
+        <translation>Valeur</translation>
     </message>
 </context>
 <context>
     <name>KvToolBase</name>
     <message>
         <source>Reset</source>
-        <translation type="unfinished"></translation>
+        <translation>Réinitialiser</translation>
     </message>
     <message>
         <source>Reset to the default values</source>
-        <translation type="unfinished"></translation>
+        <translation>Rétablir les valeurs par défaut</translation>
     </message>
 </context>
 <context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
-        <translation type="unfinished"></translation>
+        <translation>Les paramètres n’ont pas pu être enregistrés dans %1. Vérifiez que le dossier est accessible en écriture.</translation>
     </message>
     <message>
         <source>The settings file %1 cannot be read. Changes to the settings will not be kept.</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible de lire le fichier de paramètres %1. Les modifications des paramètres ne seront pas conservées.</translation>
     </message>
     <message>
         <source>The settings file %1 is damaged. It was renamed to %2; all settings are back at their defaults.</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier de paramètres %1 est endommagé. Il a été renommé en %2 ; tous les paramètres ont repris leur valeur par défaut.</translation>
     </message>
     <message>
         <source>The settings file %1 is damaged and could not be renamed to %2. Changes to the settings will not be kept.</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier de paramètres %1 est endommagé et n’a pas pu être renommé en %2. Les modifications des paramètres ne seront pas conservées.</translation>
     </message>
 </context>
 <context>
     <name>ZtAravisSource</name>
     <message>
         <source>%1 is disconnected; its last picture stays</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 est déconnectée ; sa dernière image reste affichée</translation>
     </message>
     <message>
         <source>%1 delivers pictures of a kind that cannot be shown</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 fournit des images d’un type qui ne peut pas être affiché</translation>
     </message>
     <message>
         <source>The camera does not take the setting (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>La caméra n’accepte pas le réglage (%1)</translation>
     </message>
     <message>
         <source>%1 cannot be opened (%2)</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible d’ouvrir %1 (%2)</translation>
     </message>
 </context>
 <context>
     <name>ZtCalibrationStore</name>
     <message>
         <source>This is not a calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>Ceci n’est pas un étalonnage</translation>
     </message>
     <message>
         <source>A calibration in the settings is damaged and was left out (%1: %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>Un étalonnage des paramètres est endommagé et a été ignoré (%1 : %2)</translation>
     </message>
 </context>
 <context>
     <name>ZtCsvReader</name>
     <message>
         <source>A quoted text does not end</source>
-        <translation type="unfinished"></translation>
+        <translation>Un texte entre guillemets n’est pas terminé</translation>
     </message>
     <message>
         <source>There is text after a closing quote</source>
-        <translation type="unfinished"></translation>
+        <translation>Du texte suit un guillemet fermant</translation>
     </message>
     <message>
         <source>Reading was cancelled</source>
-        <translation type="unfinished"></translation>
+        <translation>La lecture a été annulée</translation>
     </message>
 </context>
 <context>
     <name>ZtDrawnType</name>
     <message>
         <source>Rectangle</source>
-        <translation type="unfinished"></translation>
+        <translation>Rectangle</translation>
     </message>
     <message>
         <source>Width</source>
-        <translation type="unfinished"></translation>
+        <translation>Largeur</translation>
     </message>
     <message>
         <source>Height</source>
-        <translation type="unfinished"></translation>
+        <translation>Hauteur</translation>
     </message>
     <message>
         <source>Area</source>
-        <translation type="unfinished"></translation>
+        <translation>Aire</translation>
     </message>
     <message>
         <source>Line</source>
-        <translation type="unfinished"></translation>
+        <translation>Ligne</translation>
     </message>
     <message>
         <source>Length</source>
-        <translation type="unfinished"></translation>
+        <translation>Longueur</translation>
     </message>
     <message>
         <source>Arc</source>
-        <translation type="unfinished"></translation>
+        <translation>Arc</translation>
     </message>
     <message>
         <source>Angle</source>
-        <translation type="unfinished"></translation>
+        <translation>Angle</translation>
     </message>
     <message>
         <source>Arc length</source>
-        <translation type="unfinished"></translation>
+        <translation>Longueur d’arc</translation>
     </message>
     <message>
         <source>Polygon</source>
-        <translation type="unfinished"></translation>
+        <translation>Polygone</translation>
     </message>
     <message>
         <source>Perimeter</source>
-        <translation type="unfinished"></translation>
+        <translation>Périmètre</translation>
     </message>
     <message>
         <source>Polyline</source>
-        <translation type="unfinished"></translation>
+        <translation>Polyligne</translation>
     </message>
     <message>
         <source>Parallel distance</source>
-        <translation type="unfinished"></translation>
+        <translation>Distance parallèle</translation>
     </message>
     <message>
         <source>Distance</source>
-        <translation type="unfinished"></translation>
+        <translation>Distance</translation>
     </message>
     <message>
         <source>Text note</source>
-        <translation type="unfinished"></translation>
+        <translation>Note de texte</translation>
     </message>
     <message>
         <source>Scale bar</source>
-        <translation type="unfinished"></translation>
+        <translation>Barre d’échelle</translation>
     </message>
     <message>
         <source>Counter</source>
-        <translation type="unfinished"></translation>
+        <translation>Compteur</translation>
     </message>
     <message>
         <source>Count</source>
-        <translation type="unfinished"></translation>
+        <translation>Nombre</translation>
     </message>
     <message>
         <source>Share</source>
-        <translation type="unfinished"></translation>
+        <translation>Part</translation>
     </message>
     <message>
         <source>Circle</source>
-        <translation type="unfinished"></translation>
+        <translation>Cercle</translation>
     </message>
     <message>
         <source>Diameter</source>
-        <translation type="unfinished"></translation>
+        <translation>Diamètre</translation>
     </message>
 </context>
 <context>
     <name>ZtFrameSourceCatalogue</name>
     <message>
         <source>This program cannot play videos</source>
-        <translation type="unfinished"></translation>
+        <translation>Ce programme ne peut pas lire de vidéos</translation>
     </message>
     <message>
         <source>This program knows no cameras of this kind</source>
-        <translation type="unfinished"></translation>
+        <translation>Ce programme ne connaît pas de caméras de ce type</translation>
     </message>
 </context>
 <context>
     <name>ZtImageFolderSource</name>
     <message>
         <source>%1: no picture of the folder can be shown</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 : aucune image du dossier ne peut être affichée</translation>
     </message>
     <message>
         <source>The folder does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>Le dossier n’existe pas</translation>
     </message>
     <message>
         <source>The folder cannot be read</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible de lire le dossier</translation>
     </message>
     <message>
         <source>The folder holds no pictures</source>
-        <translation type="unfinished"></translation>
+        <translation>Le dossier ne contient pas d’images</translation>
     </message>
 </context>
 <context>
     <name>ZtKernelImage</name>
     <message>
         <source>%1 delivers pictures again</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 fournit de nouveau des images</translation>
     </message>
 </context>
 <context>
     <name>ZtLiveFrameSource</name>
     <message>
         <source>%1 has stopped delivering pictures; the last one stays</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 ne fournit plus d’images ; la dernière reste affichée</translation>
     </message>
 </context>
 <context>
     <name>ZtMeasureFormat</name>
     <message>
         <source>pcs</source>
-        <translation type="unfinished"></translation>
+        <translation>pcs</translation>
     </message>
 </context>
 <context>
     <name>ZtSession</name>
     <message>
         <source>The file is empty</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier est vide</translation>
     </message>
     <message>
         <source>The file is not a session</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier n’est pas une session</translation>
     </message>
     <message>
         <source>The file cannot be written (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible d’écrire le fichier (%1)</translation>
     </message>
     <message>
         <source>This must be a list</source>
-        <translation type="unfinished"></translation>
+        <translation>Une liste est attendue ici</translation>
     </message>
     <message>
         <source>This must be a text</source>
-        <translation type="unfinished"></translation>
+        <translation>Un texte est attendu ici</translation>
     </message>
     <message>
         <source>This must be a whole number from 1</source>
-        <translation type="unfinished"></translation>
+        <translation>Un nombre entier à partir de 1 est attendu ici</translation>
     </message>
     <message>
         <source>This must be a number</source>
-        <translation type="unfinished"></translation>
+        <translation>Un nombre est attendu ici</translation>
     </message>
     <message>
         <source>This must be a number greater than 0</source>
-        <translation type="unfinished"></translation>
+        <translation>Un nombre supérieur à 0 est attendu ici</translation>
     </message>
     <message>
         <source>Another object of this type has the same number</source>
-        <translation type="unfinished"></translation>
+        <translation>Un autre objet de ce type a le même numéro</translation>
     </message>
     <message>
         <source>This must be an object</source>
-        <translation type="unfinished"></translation>
+        <translation>Un objet est attendu ici</translation>
     </message>
     <message>
         <source>&quot;%1&quot; is not a type of objects</source>
-        <translation type="unfinished"></translation>
+        <translation>« %1 » n’est pas un type d’objet</translation>
     </message>
     <message>
         <source>An object of type &quot;%1&quot; cannot have this number of points (%2)</source>
-        <translation type="unfinished"></translation>
+        <translation>Un objet de type « %1 » ne peut pas avoir ce nombre de points (%2)</translation>
     </message>
     <message>
         <source>A point must be a list of two numbers between -1e9 and 1e9</source>
-        <translation type="unfinished"></translation>
+        <translation>Un point doit être une liste de deux nombres entre -1e9 et 1e9</translation>
     </message>
     <message>
         <source>This must be the name of a value</source>
-        <translation type="unfinished"></translation>
+        <translation>Le nom d’une valeur est attendu ici</translation>
     </message>
     <message>
         <source>The type has no name</source>
-        <translation type="unfinished"></translation>
+        <translation>Le type n’a pas de nom</translation>
     </message>
     <message>
         <source>A value must have a name of its own</source>
-        <translation type="unfinished"></translation>
+        <translation>Chaque valeur doit avoir un nom qui lui est propre</translation>
     </message>
     <message>
         <source>The numbers of the rows must rise</source>
-        <translation type="unfinished"></translation>
+        <translation>Les numéros des lignes doivent être croissants</translation>
     </message>
     <message>
         <source>A row must be a list of number, name and values</source>
-        <translation type="unfinished"></translation>
+        <translation>Une ligne doit être une liste composée d’un numéro, d’un nom et de valeurs</translation>
     </message>
     <message>
         <source>This must be a text or null</source>
-        <translation type="unfinished"></translation>
+        <translation>Un texte ou null est attendu ici</translation>
     </message>
     <message>
         <source>This must be a list or an object</source>
-        <translation type="unfinished"></translation>
+        <translation>Une liste ou un objet est attendu ici</translation>
     </message>
     <message>
         <source>The table has no such value</source>
-        <translation type="unfinished"></translation>
+        <translation>Le tableau ne contient pas cette valeur</translation>
     </message>
     <message>
         <source>This must be the text of a number</source>
-        <translation type="unfinished"></translation>
+        <translation>Un nombre sous forme de texte est attendu ici</translation>
     </message>
     <message>
         <source>The unit does not fit that of the value</source>
-        <translation type="unfinished"></translation>
+        <translation>L’unité n’est pas compatible avec celle de la valeur</translation>
     </message>
     <message>
         <source>The file is nested too deeply</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier comporte trop de niveaux d’imbrication</translation>
     </message>
     <message>
         <source>The file is not valid JSON (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier n’est pas du JSON valide (%1)</translation>
     </message>
     <message>
         <source>The file does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier n’existe pas</translation>
     </message>
     <message>
         <source>This is a folder, not a file</source>
-        <translation type="unfinished"></translation>
+        <translation>C’est un dossier, pas un fichier</translation>
     </message>
     <message>
         <source>The file cannot be read (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible de lire le fichier (%1)</translation>
     </message>
     <message>
         <source>The file is too large for a session</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier est trop volumineux pour une session</translation>
     </message>
     <message>
         <source>This must be a date such as 2026-01-31T12:00:00Z</source>
-        <translation type="unfinished"></translation>
+        <translation>Une date telle que 2026-01-31T12:00:00Z est attendue ici</translation>
     </message>
     <message>
         <source>This must be &quot;knownDistance&quot;, &quot;metadata&quot; or &quot;typed&quot;</source>
-        <translation type="unfinished"></translation>
+        <translation>&quot;knownDistance&quot;, &quot;metadata&quot; ou &quot;typed&quot; est attendu ici</translation>
     </message>
     <message>
         <source>The file is write-protected</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier est protégé en écriture</translation>
     </message>
     <message>
         <source>Writing was cancelled</source>
-        <translation type="unfinished"></translation>
+        <translation>L’écriture a été annulée</translation>
     </message>
     <message>
         <source>Reading was cancelled</source>
-        <translation type="unfinished"></translation>
+        <translation>La lecture a été annulée</translation>
     </message>
     <message>
         <source>The session is of the newer version %1; this program reads versions up to %2</source>
-        <translation type="unfinished"></translation>
+        <translation>La session est dans la version %1, plus récente ; ce programme lit les versions jusqu’à %2</translation>
     </message>
     <message>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
-        <translation type="unfinished"></translation>
+        <translation>Les sessions de version %1 ne sont pas connues ; ce programme lit les versions %2 à %3</translation>
     </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
     <message>
         <source>The picture does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>L’image n’existe pas</translation>
     </message>
     <message>
         <source>This is a folder, not a picture</source>
-        <translation type="unfinished"></translation>
+        <translation>C’est un dossier, pas une image</translation>
     </message>
     <message>
         <source>The picture cannot be read</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible de lire l’image</translation>
     </message>
     <message>
         <source>The picture has %1 x %2 pixels, which is too many</source>
-        <translation type="unfinished"></translation>
+        <translation>L’image comporte %1 x %2 pixels, ce qui est trop</translation>
     </message>
     <message>
         <source>The picture cannot be decoded (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible de décoder l’image (%1)</translation>
     </message>
     <message>
         <source>the file is empty</source>
-        <translation type="unfinished"></translation>
+        <translation>le fichier est vide</translation>
     </message>
     <message>
         <source>it has no size</source>
-        <translation type="unfinished"></translation>
+        <translation>elle n’a pas de dimensions</translation>
     </message>
     <message>
         <source>the file is damaged</source>
-        <translation type="unfinished"></translation>
+        <translation>le fichier est endommagé</translation>
     </message>
     <message>
         <source>the file is too short for its picture</source>
-        <translation type="unfinished"></translation>
+        <translation>le fichier est trop court pour son image</translation>
     </message>
     <message>
         <source>there is not enough memory</source>
-        <translation type="unfinished"></translation>
+        <translation>mémoire insuffisante</translation>
     </message>
 </context>
 <context>
     <name>ZtTableImport</name>
     <message>
         <source>&quot;%1&quot; already has a value &quot;%2&quot; in line %3</source>
-        <translation type="unfinished"></translation>
+        <translation>« %1 » a déjà une valeur « %2 » à la ligne %3</translation>
     </message>
     <message>
         <source>The file does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier n’existe pas</translation>
     </message>
     <message>
         <source>This is a folder, not a file</source>
-        <translation type="unfinished"></translation>
+        <translation>C’est un dossier, pas un fichier</translation>
     </message>
     <message>
         <source>The file cannot be read (%1)</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible de lire le fichier (%1)</translation>
     </message>
     <message>
         <source>The table is not open for reading</source>
-        <translation type="unfinished"></translation>
+        <translation>Le tableau n’est pas ouvert en lecture</translation>
     </message>
     <message>
         <source>The table has no rows</source>
-        <translation type="unfinished"></translation>
+        <translation>Le tableau n’a pas de lignes</translation>
     </message>
     <message>
         <source>The row and the header differ in their number of fields (%1 and %2)</source>
-        <translation type="unfinished"></translation>
+        <translation>La ligne et l’en-tête n’ont pas le même nombre de champs (%1 et %2)</translation>
     </message>
     <message>
         <source>%1 is not a finite number</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 n’est pas un nombre fini</translation>
     </message>
     <message>
         <source>%1 is not a number</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 n’est pas un nombre</translation>
     </message>
     <message>
         <source>&quot;%1&quot; of &quot;%2&quot; is given in &quot;%3&quot; here, but in &quot;%4&quot; before</source>
-        <translation type="unfinished"></translation>
+        <translation>« %1 » de « %2 » est en « %3 » ici, mais en « %4 » auparavant</translation>
     </message>
     <message>
         <source>There is no column %1; the columns are %2</source>
-        <translation type="unfinished"></translation>
+        <translation>Il n’y a pas de colonne %1 ; les colonnes sont %2</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>Objet</translation>
     </message>
     <message>
         <source>There is no value %1 to give a unit; the values are %2</source>
-        <translation type="unfinished"></translation>
+        <translation>Il n’y a pas de valeur %1 à laquelle attribuer une unité ; les valeurs sont %2</translation>
     </message>
     <message>
         <source>The first line announces %1 rows, but there are %2</source>
-        <translation type="unfinished"></translation>
+        <translation>La première ligne annonce %1 lignes de données, mais il y en a %2</translation>
     </message>
     <message>
         <source>The first line announces rows without values</source>
-        <translation type="unfinished"></translation>
+        <translation>La première ligne annonce des lignes sans valeurs</translation>
     </message>
     <message>
         <source>There is no column %1; the columns of this table have no names</source>
-        <translation type="unfinished"></translation>
+        <translation>Il n’y a pas de colonne %1 ; les colonnes de ce tableau n’ont pas de nom</translation>
     </message>
     <message>
         <source>%1 is not the index of a class; they go from 0 to %2</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 n’est pas l’indice d’une classe ; les indices vont de 0 à %2</translation>
     </message>
     <message>
         <source>Value %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Valeur %1</translation>
     </message>
     <message>
         <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation type="unfinished"></translation>
+        <translation>La ligne a %1 champs, mais la première ligne annonce %2 valeurs et une classe</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier dépasse %1 Mo</translation>
     </message>
     <message>
         <source>The file is empty</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier est vide</translation>
     </message>
     <message>
         <source>The first line does not name the columns</source>
-        <translation type="unfinished"></translation>
+        <translation>La première ligne n’indique pas le nom des colonnes</translation>
     </message>
     <message>
         <source>Column %1 is not part of a list of values and was left out</source>
-        <translation type="unfinished"></translation>
+        <translation>La colonne %1 ne fait pas partie d’une liste de valeurs et a été ignorée</translation>
     </message>
     <message>
         <source>Columns %1 are not part of a list of values and were left out</source>
-        <translation type="unfinished"></translation>
+        <translation>Les colonnes %1 ne font pas partie d’une liste de valeurs et ont été ignorées</translation>
     </message>
     <message>
         <source>The value has no name</source>
-        <translation type="unfinished"></translation>
+        <translation>La valeur n’a pas de nom</translation>
     </message>
     <message>
         <source>The row does not say which object it belongs to</source>
-        <translation type="unfinished"></translation>
+        <translation>La ligne n’indique pas à quel objet elle appartient</translation>
     </message>
     <message>
         <source>%1 is not a unit</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 n’est pas une unité</translation>
     </message>
     <message>
         <source>There is no column of numbers</source>
-        <translation type="unfinished"></translation>
+        <translation>Il n’y a pas de colonne de nombres</translation>
     </message>
     <message>
         <source>Column %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Colonne %1</translation>
     </message>
     <message>
         <source>Column %1 holds text and was left out</source>
-        <translation type="unfinished"></translation>
+        <translation>La colonne %1 contient du texte et a été ignorée</translation>
     </message>
     <message>
         <source>Columns %1 hold text and were left out</source>
-        <translation type="unfinished"></translation>
+        <translation>Les colonnes %1 contiennent du texte et ont été ignorées</translation>
     </message>
     <message>
         <source>Reading was cancelled</source>
-        <translation type="unfinished"></translation>
+        <translation>La lecture a été annulée</translation>
     </message>
 </context>
 <context>
     <name>ZtTextDecoder</name>
     <message>
         <source>The file is not a text file: it holds a NUL character</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier n’est pas un fichier texte : il contient un caractère NUL</translation>
     </message>
     <message>
         <source>The file is not valid UTF-16 text</source>
-        <translation type="unfinished"></translation>
+        <translation>Le fichier n’est pas un texte UTF-16 valide</translation>
     </message>
     <message>
         <source>The text is not valid UTF-8</source>
-        <translation type="unfinished"></translation>
+        <translation>Le texte n’est pas de l’UTF-8 valide</translation>
     </message>
 </context>
 <context>
     <name>ZtUvcCameraSource</name>
     <message>
         <source>%1 is not connected</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 n’est pas connectée</translation>
     </message>
     <message>
         <source>%1 is disconnected or in use (%2)</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 est déconnectée ou déjà utilisée (%2)</translation>
     </message>
 </context>
 <context>
     <name>ZtVideoFileSource</name>
     <message>
         <source>The video does not exist</source>
-        <translation type="unfinished"></translation>
+        <translation>La vidéo n’existe pas</translation>
     </message>
     <message>
         <source>The video cannot be read</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible de lire la vidéo</translation>
     </message>
     <message>
         <source>The video is empty</source>
-        <translation type="unfinished"></translation>
+        <translation>La vidéo est vide</translation>
     </message>
     <message>
         <source>there is only sound in it</source>
-        <translation type="unfinished"></translation>
+        <translation>elle ne contient que du son</translation>
     </message>
     <message>
         <source>The video %1 cannot be played (%2)</source>
-        <translation type="unfinished"></translation>
+        <translation>Impossible de lire la vidéo %1 (%2)</translation>
     </message>
     <message>
         <source>the file is damaged</source>
-        <translation type="unfinished"></translation>
+        <translation>le fichier est endommagé</translation>
     </message>
 </context>
 <context>
     <name>acss</name>
     <message>
         <source>The icon %1 is missing.</source>
-        <translation type="unfinished"></translation>
+        <translation>L’icône %1 est manquante.</translation>
     </message>
 </context>
 </TS>

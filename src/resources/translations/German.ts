@@ -5,205 +5,205 @@
     <name>GuiStatReportingPluginUi</name>
     <message>
         <source>Form</source>
-        <translation type="unfinished"></translation>
+        <translation>Formular</translation>
     </message>
     <message>
         <source>Open Templates Editor</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlageneditor öffnen</translation>
     </message>
     <message>
         <source>Opens Report Template Editor</source>
-        <translation type="unfinished"></translation>
+        <translation>Öffnet den Editor für Berichtsvorlagen</translation>
     </message>
     <message>
         <source>Generate Report File</source>
-        <translation type="unfinished"></translation>
+        <translation>Berichtsdatei erzeugen</translation>
     </message>
     <message>
         <source>Exports current measurments to pdf file.</source>
-        <translation type="unfinished"></translation>
+        <translation>Exportiert die aktuellen Messungen in eine PDF-Datei.</translation>
     </message>
     <message>
         <source>Open Statistics Window</source>
-        <translation type="unfinished"></translation>
+        <translation>Statistikfenster öffnen</translation>
     </message>
     <message>
         <source>Template:</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlage:</translation>
     </message>
     <message>
         <source>Browse Templates</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlage auswählen</translation>
     </message>
     <message>
         <source>Opens default template for report generation</source>
-        <translation type="unfinished"></translation>
+        <translation>Öffnet die Vorlage, nach der Berichte erzeugt werden</translation>
     </message>
 </context>
 <context>
     <name>KvAddImageDialog</name>
     <message>
         <source>Choose image file</source>
-        <translation type="unfinished"></translation>
+        <translation>Bilddatei auswählen</translation>
     </message>
     <message>
         <source>Image file(*.png *.jpg *.gif *.tif *.bmp)</source>
-        <translation type="unfinished"></translation>
+        <translation>Bilddatei (*.png *.jpg *.gif *.tif *.bmp)</translation>
     </message>
 </context>
 <context>
     <name>KvAddLinkDialogUi</name>
     <message>
         <source>Insert Link</source>
-        <translation type="unfinished"></translation>
+        <translation>Link einfügen</translation>
     </message>
     <message>
         <source>Title:</source>
-        <translation type="unfinished"></translation>
+        <translation>Titel:</translation>
     </message>
     <message>
         <source>URL:</source>
-        <translation type="unfinished"></translation>
+        <translation>URL:</translation>
     </message>
 </context>
 <context>
     <name>KvAlignmentOptionsRow</name>
     <message>
         <source>Align left</source>
-        <translation type="unfinished"></translation>
+        <translation>Linksbündig</translation>
     </message>
     <message>
         <source>Align center</source>
-        <translation type="unfinished"></translation>
+        <translation>Zentriert</translation>
     </message>
     <message>
         <source>Align right</source>
-        <translation type="unfinished"></translation>
+        <translation>Rechtsbündig</translation>
     </message>
 </context>
 <context>
     <name>KvBaseEditorNodeFactory</name>
     <message>
         <source>Measurements Table</source>
-        <translation type="unfinished"></translation>
+        <translation>Messwerttabelle</translation>
     </message>
     <message>
         <source>Text Document</source>
-        <translation type="unfinished"></translation>
+        <translation>Textdokument</translation>
     </message>
     <message>
         <source>Camera Image View</source>
-        <translation type="unfinished"></translation>
+        <translation>Kamerabild</translation>
     </message>
     <message>
         <source>Image View</source>
-        <translation type="unfinished"></translation>
+        <translation>Bild</translation>
     </message>
     <message>
         <source>Statistics</source>
-        <translation type="unfinished"></translation>
+        <translation>Statistik</translation>
     </message>
     <message>
         <source>Statistics Table</source>
-        <translation type="unfinished"></translation>
+        <translation>Statistiktabelle</translation>
     </message>
     <message>
         <source>Counters</source>
-        <translation type="unfinished"></translation>
+        <translation>Zähler</translation>
     </message>
     <message>
         <source>Min / Median / Max Box</source>
-        <translation type="unfinished"></translation>
+        <translation>Min-/Median-/Max-Box</translation>
     </message>
     <message>
         <source>Trend</source>
-        <translation type="unfinished"></translation>
+        <translation>Trend</translation>
     </message>
 </context>
 <context>
     <name>KvCameraImageNodeOptionsWidget</name>
     <message>
         <source>Camera image view</source>
-        <translation type="unfinished"></translation>
+        <translation>Kamerabild</translation>
     </message>
     <message>
         <source>Render measurements</source>
-        <translation type="unfinished"></translation>
+        <translation>Messungen einzeichnen</translation>
     </message>
     <message>
         <source>Draw the measurement objects on the picture</source>
-        <translation type="unfinished"></translation>
+        <translation>Messobjekte in das Bild einzeichnen</translation>
     </message>
 </context>
 <context>
     <name>KvCameraImageWidget</name>
     <message>
         <source>Camera Image View</source>
-        <translation type="unfinished"></translation>
+        <translation>Kamerabild</translation>
     </message>
 </context>
 <context>
     <name>KvColumnsOptionsRow</name>
     <message>
         <source>Select columns:</source>
-        <translation type="unfinished"></translation>
+        <translation>Spalten wählen:</translation>
     </message>
 </context>
 <context>
     <name>KvEditorAddImageExtWidgetUi</name>
     <message>
         <source>Width:</source>
-        <translation type="unfinished"></translation>
+        <translation>Breite:</translation>
     </message>
     <message>
         <source>Width in percent of the text&apos;s width</source>
-        <translation type="unfinished"></translation>
+        <translation>Breite in Prozent der Textbreite</translation>
     </message>
     <message>
         <source>Float:</source>
-        <translation type="unfinished"></translation>
+        <translation>Umfluss:</translation>
     </message>
     <message>
         <source>Side of the text at which the picture stands</source>
-        <translation type="unfinished"></translation>
+        <translation>Seite des Textes, an der das Bild steht</translation>
     </message>
     <message>
         <source>none</source>
-        <translation type="unfinished"></translation>
+        <translation>ohne</translation>
     </message>
     <message>
         <source>left</source>
-        <translation type="unfinished"></translation>
+        <translation>links</translation>
     </message>
     <message>
         <source>right</source>
-        <translation type="unfinished"></translation>
+        <translation>rechts</translation>
     </message>
 </context>
 <context>
     <name>KvEditorToolCombo</name>
     <message>
         <source>Group of blocks, open</source>
-        <translation type="unfinished"></translation>
+        <translation>Gruppe von Blöcken, geöffnet</translation>
     </message>
     <message>
         <source>Group of blocks, closed</source>
-        <translation type="unfinished"></translation>
+        <translation>Gruppe von Blöcken, geschlossen</translation>
     </message>
     <message>
         <source>Close the group (Enter)</source>
-        <translation type="unfinished"></translation>
+        <translation>Gruppe schließen (Enter)</translation>
     </message>
     <message>
         <source>Open the group (Enter)</source>
-        <translation type="unfinished"></translation>
+        <translation>Gruppe öffnen (Enter)</translation>
     </message>
 </context>
 <context>
     <name>KvEditorToolWidget</name>
     <message>
         <source>Drag onto the page, or press Enter to append</source>
-        <translation type="unfinished"></translation>
+        <translation>Auf die Seite ziehen oder mit Enter anhängen</translation>
     </message>
 </context>
 <context>
@@ -211,529 +211,530 @@
     <message>
         <source>%1 already exists.
 Do you want to replace it?</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 ist bereits vorhanden.
+Möchten Sie die Datei ersetzen?</translation>
     </message>
     <message>
         <source>Save</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichern</translation>
     </message>
 </context>
 <context>
     <name>KvFooterWidget</name>
     <message>
         <source>Footer</source>
-        <translation type="unfinished"></translation>
+        <translation>Fußzeile</translation>
     </message>
 </context>
 <context>
     <name>KvGroupByOptionsRow</name>
     <message>
         <source>Group by:</source>
-        <translation type="unfinished"></translation>
+        <translation>Gruppierung:</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>Objekt</translation>
     </message>
     <message>
         <source>Measurement</source>
-        <translation type="unfinished"></translation>
+        <translation>Messgröße</translation>
     </message>
 </context>
 <context>
     <name>KvHeaderWidget</name>
     <message>
         <source>Header</source>
-        <translation type="unfinished"></translation>
+        <translation>Kopfzeile</translation>
     </message>
 </context>
 <context>
     <name>KvImageFile</name>
     <message>
         <source>Cannot read the image file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Bilddatei %1 kann nicht gelesen werden</translation>
     </message>
     <message>
         <source>The image that the template holds of %1 is damaged</source>
-        <translation type="unfinished"></translation>
+        <translation>Das in der Vorlage gespeicherte Bild von %1 ist beschädigt</translation>
     </message>
 </context>
 <context>
     <name>KvImageNodeOptionsWidget</name>
     <message>
         <source>Image view</source>
-        <translation type="unfinished"></translation>
+        <translation>Bild</translation>
     </message>
     <message>
         <source>Browse</source>
-        <translation type="unfinished"></translation>
+        <translation>Wählen</translation>
     </message>
     <message>
         <source>Choose an image file</source>
-        <translation type="unfinished"></translation>
+        <translation>Eine Bilddatei auswählen</translation>
     </message>
     <message>
         <source>Choose image file</source>
-        <translation type="unfinished"></translation>
+        <translation>Bilddatei auswählen</translation>
     </message>
     <message>
         <source>Image file(*.png *.jpg *.gif *.tif *.bmp)</source>
-        <translation type="unfinished"></translation>
+        <translation>Bilddatei (*.png *.jpg *.gif *.tif *.bmp)</translation>
     </message>
 </context>
 <context>
     <name>KvImageWidget</name>
     <message>
         <source>Image View</source>
-        <translation type="unfinished"></translation>
+        <translation>Bild</translation>
     </message>
 </context>
 <context>
     <name>KvPageCountWidget</name>
     <message>
         <source>Page count</source>
-        <translation type="unfinished"></translation>
+        <translation>Seitenzahl</translation>
     </message>
 </context>
 <context>
     <name>KvPrintProgressDialog</name>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished"></translation>
+        <translation>Abbrechen</translation>
     </message>
     <message>
         <source>Printing the report</source>
-        <translation type="unfinished"></translation>
+        <translation>Bericht wird gedruckt</translation>
     </message>
     <message>
         <source>Progress</source>
-        <translation type="unfinished"></translation>
+        <translation>Fortschritt</translation>
     </message>
     <message>
         <source>Cancel (Esc)</source>
-        <translation type="unfinished"></translation>
+        <translation>Abbrechen (Esc)</translation>
     </message>
     <message>
         <source>Page %1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>Seite %1 von %2</translation>
     </message>
 </context>
 <context>
     <name>KvReportKeywords</name>
     <message>
         <source>Creation date (ISO)</source>
-        <translation type="unfinished"></translation>
+        <translation>Erstellungsdatum (ISO)</translation>
     </message>
     <message>
         <source>Creation date (Text)</source>
-        <translation type="unfinished"></translation>
+        <translation>Erstellungsdatum (Text)</translation>
     </message>
     <message>
         <source>Creation time</source>
-        <translation type="unfinished"></translation>
+        <translation>Erstellungsuhrzeit</translation>
     </message>
     <message>
         <source>Program name</source>
-        <translation type="unfinished"></translation>
+        <translation>Programmname</translation>
     </message>
     <message>
         <source>Program version</source>
-        <translation type="unfinished"></translation>
+        <translation>Programmversion</translation>
     </message>
     <message>
         <source>Program vendor</source>
-        <translation type="unfinished"></translation>
+        <translation>Programmhersteller</translation>
     </message>
 </context>
 <context>
     <name>KvReportTemplatesEditor</name>
     <message>
         <source>Report template editor</source>
-        <translation type="unfinished"></translation>
+        <translation>Editor für Berichtsvorlagen</translation>
     </message>
     <message>
         <source>Report template file (*.rtp)</source>
-        <translation type="unfinished"></translation>
+        <translation>Berichtsvorlage (*.rtp)</translation>
     </message>
 </context>
 <context>
     <name>KvRotationOptionsRow</name>
     <message>
         <source>Rotation</source>
-        <translation type="unfinished"></translation>
+        <translation>Drehung</translation>
     </message>
     <message>
         <source>Rotation of the picture, clockwise</source>
-        <translation type="unfinished"></translation>
+        <translation>Drehung des Bildes im Uhrzeigersinn</translation>
     </message>
 </context>
 <context>
     <name>KvSelectionOverlay</name>
     <message>
         <source>Delete block</source>
-        <translation type="unfinished"></translation>
+        <translation>Block löschen</translation>
     </message>
     <message>
         <source>Delete block (Del)</source>
-        <translation type="unfinished"></translation>
+        <translation>Block löschen (Del)</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsMeasurementsTableNodeCfg</name>
     <message>
         <source>Object Name</source>
-        <translation type="unfinished"></translation>
+        <translation>Objektname</translation>
     </message>
     <message>
         <source>Object Type</source>
-        <translation type="unfinished"></translation>
+        <translation>Objekttyp</translation>
     </message>
     <message>
         <source>Value Name</source>
-        <translation type="unfinished"></translation>
+        <translation>Messgröße</translation>
     </message>
     <message>
         <source>Value</source>
-        <translation type="unfinished"></translation>
+        <translation>Wert</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsMeasurementsTableOptionsWidget</name>
     <message>
         <source>Measurements table</source>
-        <translation type="unfinished"></translation>
+        <translation>Messwerttabelle</translation>
     </message>
     <message>
         <source>Order by:</source>
-        <translation type="unfinished"></translation>
+        <translation>Sortierung:</translation>
     </message>
     <message>
         <source>default</source>
-        <translation type="unfinished"></translation>
+        <translation>Standard</translation>
     </message>
     <message>
         <source>%1, ascending</source>
-        <translation type="unfinished"></translation>
+        <translation>%1, aufsteigend</translation>
     </message>
     <message>
         <source>%1, descending</source>
-        <translation type="unfinished"></translation>
+        <translation>%1, absteigend</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsMeasurementsTableWidget</name>
     <message>
         <source>Measurements Table</source>
-        <translation type="unfinished"></translation>
+        <translation>Messwerttabelle</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsStatsTableNodeCfg</name>
     <message>
         <source>Min</source>
-        <translation type="unfinished"></translation>
+        <translation>Min</translation>
     </message>
     <message>
         <source>Max</source>
-        <translation type="unfinished"></translation>
+        <translation>Max</translation>
     </message>
     <message>
         <source>Average</source>
-        <translation type="unfinished"></translation>
+        <translation>Mittelwert</translation>
     </message>
     <message>
         <source>Sigma</source>
-        <translation type="unfinished"></translation>
+        <translation>Sigma</translation>
     </message>
     <message>
         <source>3 Sigma</source>
-        <translation type="unfinished"></translation>
+        <translation>3 Sigma</translation>
     </message>
     <message>
         <source>6 Sigma</source>
-        <translation type="unfinished"></translation>
+        <translation>6 Sigma</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsStatsTableOptionsWidget</name>
     <message>
         <source>Statistics table</source>
-        <translation type="unfinished"></translation>
+        <translation>Statistiktabelle</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsStatsTableWidget</name>
     <message>
         <source>Statistics Table</source>
-        <translation type="unfinished"></translation>
+        <translation>Statistiktabelle</translation>
     </message>
     <message>
         <source>Object Type</source>
-        <translation type="unfinished"></translation>
+        <translation>Objekttyp</translation>
     </message>
     <message>
         <source>Measurement Type</source>
-        <translation type="unfinished"></translation>
+        <translation>Messgröße</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsUnitConverter</name>
     <message>
         <source>deg</source>
-        <translation type="unfinished"></translation>
+        <translation>Grad</translation>
     </message>
     <message>
         <source>pcs</source>
-        <translation type="unfinished"></translation>
+        <translation>Stk.</translation>
     </message>
     <message>
         <source>%</source>
-        <translation type="unfinished"></translation>
+        <translation>%</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsWindow</name>
     <message>
         <source>Measurement statistics</source>
-        <translation type="unfinished"></translation>
+        <translation>Messstatistik</translation>
     </message>
     <message>
         <source>Choose a statistics view on the right.</source>
-        <translation type="unfinished"></translation>
+        <translation>Wählen Sie rechts eine Statistikansicht aus.</translation>
     </message>
     <message>
         <source>No statistics blocks are installed.</source>
-        <translation type="unfinished"></translation>
+        <translation>Es sind keine Statistikblöcke installiert.</translation>
     </message>
 </context>
 <context>
     <name>KvTemplateModel</name>
     <message>
         <source>Cannot read</source>
-        <translation type="unfinished"></translation>
+        <translation>Lesen nicht möglich</translation>
     </message>
     <message>
         <source>Cannot open file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Datei %1 kann nicht geöffnet werden</translation>
     </message>
     <message>
         <source>Error reading file</source>
-        <translation type="unfinished"></translation>
+        <translation>Fehler beim Lesen der Datei</translation>
     </message>
     <message>
         <source>Cannot read file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Datei %1 kann nicht gelesen werden</translation>
     </message>
     <message>
         <source>Cannot save</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichern nicht möglich</translation>
     </message>
     <message>
         <source>Cannot create file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Datei %1 kann nicht angelegt werden</translation>
     </message>
 </context>
 <context>
     <name>KvTemplatesEditorWindow</name>
     <message>
         <source>Open a template file</source>
-        <translation type="unfinished"></translation>
+        <translation>Eine Vorlagendatei öffnen</translation>
     </message>
     <message>
         <source>Start a new, empty template</source>
-        <translation type="unfinished"></translation>
+        <translation>Eine neue, leere Vorlage beginnen</translation>
     </message>
     <message>
         <source>Save the template to another file</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlage in einer anderen Datei speichern</translation>
     </message>
     <message>
         <source>Save the template</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlage speichern</translation>
     </message>
     <message>
         <source>Print the report to a PDF file</source>
-        <translation type="unfinished"></translation>
+        <translation>Bericht in eine PDF-Datei drucken</translation>
     </message>
     <message>
         <source>Header on every page</source>
-        <translation type="unfinished"></translation>
+        <translation>Kopfzeile auf jeder Seite</translation>
     </message>
     <message>
         <source>Footer on every page</source>
-        <translation type="unfinished"></translation>
+        <translation>Fußzeile auf jeder Seite</translation>
     </message>
     <message>
         <source>Page numbers</source>
-        <translation type="unfinished"></translation>
+        <translation>Seitenzahlen</translation>
     </message>
     <message>
         <source>Report pages</source>
-        <translation type="unfinished"></translation>
+        <translation>Berichtsseiten</translation>
     </message>
     <message>
         <source>Blocks to add</source>
-        <translation type="unfinished"></translation>
+        <translation>Blöcke zum Hinzufügen</translation>
     </message>
     <message>
         <source>Are you sure?</source>
-        <translation type="unfinished"></translation>
+        <translation>Sind Sie sicher?</translation>
     </message>
     <message>
         <source>The template is modified, do you want to save it first?</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Vorlage wurde geändert. Möchten Sie sie zuerst speichern?</translation>
     </message>
     <message>
         <source>Choose file to open</source>
-        <translation type="unfinished"></translation>
+        <translation>Datei zum Öffnen auswählen</translation>
     </message>
     <message>
         <source>Choose file to save</source>
-        <translation type="unfinished"></translation>
+        <translation>Datei zum Speichern auswählen</translation>
     </message>
     <message>
         <source>Choose file to print to</source>
-        <translation type="unfinished"></translation>
+        <translation>Zieldatei für den Druck auswählen</translation>
     </message>
     <message>
         <source>Pdf file (*.pdf)</source>
-        <translation type="unfinished"></translation>
+        <translation>PDF-Datei (*.pdf)</translation>
     </message>
     <message>
         <source>Save failed</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichern fehlgeschlagen</translation>
     </message>
     <message>
         <source>Cannot write to file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>In die Datei %1 kann nicht geschrieben werden</translation>
     </message>
     <message>
         <source>[new]</source>
-        <translation type="unfinished"></translation>
+        <translation>[neu]</translation>
     </message>
 </context>
 <context>
     <name>KvTemplatesEditorWindowUi</name>
     <message>
         <source>Open File</source>
-        <translation type="unfinished"></translation>
+        <translation>Öffnen</translation>
     </message>
     <message>
         <source>Clear</source>
-        <translation type="unfinished"></translation>
+        <translation>Leeren</translation>
     </message>
     <message>
         <source>Save as ...</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichern unter...</translation>
     </message>
     <message>
         <source>Save</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichern</translation>
     </message>
     <message>
         <source>Print</source>
-        <translation type="unfinished"></translation>
+        <translation>Drucken</translation>
     </message>
     <message>
         <source>Add block</source>
-        <translation type="unfinished"></translation>
+        <translation>Block einfügen</translation>
     </message>
     <message>
         <source>The template is empty. Drag a block from here onto the page.</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Vorlage ist leer. Ziehen Sie einen Block von hier auf die Seite.</translation>
     </message>
 </context>
 <context>
     <name>KvTextDocumentNodeOptionsWidget</name>
     <message>
         <source>Text</source>
-        <translation type="unfinished"></translation>
+        <translation>Text</translation>
     </message>
     <message>
         <source>Font size in points</source>
-        <translation type="unfinished"></translation>
+        <translation>Schriftgröße in Punkt</translation>
     </message>
     <message>
         <source>Font size</source>
-        <translation type="unfinished"></translation>
+        <translation>Schriftgröße</translation>
     </message>
     <message>
         <source>Text color</source>
-        <translation type="unfinished"></translation>
+        <translation>Textfarbe</translation>
     </message>
     <message>
         <source>Bold</source>
-        <translation type="unfinished"></translation>
+        <translation>Fett</translation>
     </message>
     <message>
         <source>Italic</source>
-        <translation type="unfinished"></translation>
+        <translation>Kursiv</translation>
     </message>
     <message>
         <source>Underline</source>
-        <translation type="unfinished"></translation>
+        <translation>Unterstrichen</translation>
     </message>
     <message>
         <source>Align left</source>
-        <translation type="unfinished"></translation>
+        <translation>Linksbündig</translation>
     </message>
     <message>
         <source>Align center</source>
-        <translation type="unfinished"></translation>
+        <translation>Zentriert</translation>
     </message>
     <message>
         <source>Align right</source>
-        <translation type="unfinished"></translation>
+        <translation>Rechtsbündig</translation>
     </message>
     <message>
         <source>Justify</source>
-        <translation type="unfinished"></translation>
+        <translation>Blocksatz</translation>
     </message>
     <message>
         <source>Superscript</source>
-        <translation type="unfinished"></translation>
+        <translation>Hochgestellt</translation>
     </message>
     <message>
         <source>Subscript</source>
-        <translation type="unfinished"></translation>
+        <translation>Tiefgestellt</translation>
     </message>
     <message>
         <source>Insert link</source>
-        <translation type="unfinished"></translation>
+        <translation>Link einfügen</translation>
     </message>
     <message>
         <source>Insert picture</source>
-        <translation type="unfinished"></translation>
+        <translation>Bild einfügen</translation>
     </message>
     <message>
         <source>Insert tag</source>
-        <translation type="unfinished"></translation>
+        <translation>Feld einfügen</translation>
     </message>
     <message>
         <source>Insert a tag that the report replaces by its value</source>
-        <translation type="unfinished"></translation>
+        <translation>Ein Feld einfügen, das im Bericht durch seinen Wert ersetzt wird</translation>
     </message>
 </context>
 <context>
     <name>KvTextDocumentNodeWidget</name>
     <message>
         <source>Text</source>
-        <translation type="unfinished"></translation>
+        <translation>Text</translation>
     </message>
 </context>
 <context>
     <name>KvThemeOptionsRow</name>
     <message>
         <source>Color theme:</source>
-        <translation type="unfinished"></translation>
+        <translation>Design:</translation>
     </message>
     <message>
         <source>Dark</source>
-        <translation type="unfinished"></translation>
+        <translation>Dunkel</translation>
     </message>
     <message>
         <source>Light</source>
-        <translation type="unfinished"></translation>
+        <translation>Hell</translation>
     </message>
 </context>
 <context>
@@ -741,41 +742,41 @@ Do you want to replace it?</source>
     <message>
         <source>W</source>
         <comment>short for width</comment>
-        <translation type="unfinished"></translation>
+        <translation>B</translation>
     </message>
     <message>
         <source>Width in percent</source>
-        <translation type="unfinished"></translation>
+        <translation>Breite in Prozent</translation>
     </message>
     <message>
         <source>Width in percent of the page&apos;s content</source>
-        <translation type="unfinished"></translation>
+        <translation>Breite in Prozent des Seiteninhalts</translation>
     </message>
 </context>
 <context>
     <name>KvWindowTitleBar</name>
     <message>
         <source>Close</source>
-        <translation type="unfinished"></translation>
+        <translation>Schließen</translation>
     </message>
 </context>
 <context>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation type="unfinished"></translation>
+        <translation>Statistikwerkzeuge</translation>
     </message>
     <message>
         <source>Select Template File</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlagendatei auswählen</translation>
     </message>
     <message>
         <source>Report Template File (*.rtp)</source>
-        <translation type="unfinished"></translation>
+        <translation>Berichtsvorlage (*.rtp)</translation>
     </message>
     <message>
         <source>No report template selected.</source>
-        <translation type="unfinished"></translation>
+        <translation>Keine Berichtsvorlage ausgewählt.</translation>
     </message>
 </context>
 </TS>

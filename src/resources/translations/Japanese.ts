@@ -5,205 +5,205 @@
     <name>GuiStatReportingPluginUi</name>
     <message>
         <source>Form</source>
-        <translation type="unfinished"></translation>
+        <translation>フォーム</translation>
     </message>
     <message>
         <source>Open Templates Editor</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートエディターを開く</translation>
     </message>
     <message>
         <source>Opens Report Template Editor</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートテンプレートエディターを開きます</translation>
     </message>
     <message>
         <source>Generate Report File</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートファイルを作成</translation>
     </message>
     <message>
         <source>Exports current measurments to pdf file.</source>
-        <translation type="unfinished"></translation>
+        <translation>現在の測定値を PDF ファイルにエクスポートします。</translation>
     </message>
     <message>
         <source>Open Statistics Window</source>
-        <translation type="unfinished"></translation>
+        <translation>統計ウィンドウを開く</translation>
     </message>
     <message>
         <source>Template:</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレート:</translation>
     </message>
     <message>
         <source>Browse Templates</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートを参照</translation>
     </message>
     <message>
         <source>Opens default template for report generation</source>
-        <translation type="unfinished"></translation>
+        <translation>レポート作成に使う既定のテンプレートを開きます</translation>
     </message>
 </context>
 <context>
     <name>KvAddImageDialog</name>
     <message>
         <source>Choose image file</source>
-        <translation type="unfinished"></translation>
+        <translation>画像ファイルの選択</translation>
     </message>
     <message>
         <source>Image file(*.png *.jpg *.gif *.tif *.bmp)</source>
-        <translation type="unfinished"></translation>
+        <translation>画像ファイル (*.png *.jpg *.gif *.tif *.bmp)</translation>
     </message>
 </context>
 <context>
     <name>KvAddLinkDialogUi</name>
     <message>
         <source>Insert Link</source>
-        <translation type="unfinished"></translation>
+        <translation>リンクの挿入</translation>
     </message>
     <message>
         <source>Title:</source>
-        <translation type="unfinished"></translation>
+        <translation>タイトル:</translation>
     </message>
     <message>
         <source>URL:</source>
-        <translation type="unfinished"></translation>
+        <translation>URL:</translation>
     </message>
 </context>
 <context>
     <name>KvAlignmentOptionsRow</name>
     <message>
         <source>Align left</source>
-        <translation type="unfinished"></translation>
+        <translation>左揃え</translation>
     </message>
     <message>
         <source>Align center</source>
-        <translation type="unfinished"></translation>
+        <translation>中央揃え</translation>
     </message>
     <message>
         <source>Align right</source>
-        <translation type="unfinished"></translation>
+        <translation>右揃え</translation>
     </message>
 </context>
 <context>
     <name>KvBaseEditorNodeFactory</name>
     <message>
         <source>Measurements Table</source>
-        <translation type="unfinished"></translation>
+        <translation>測定値表</translation>
     </message>
     <message>
         <source>Text Document</source>
-        <translation type="unfinished"></translation>
+        <translation>テキスト文書</translation>
     </message>
     <message>
         <source>Camera Image View</source>
-        <translation type="unfinished"></translation>
+        <translation>カメラ画像ビュー</translation>
     </message>
     <message>
         <source>Image View</source>
-        <translation type="unfinished"></translation>
+        <translation>画像ビュー</translation>
     </message>
     <message>
         <source>Statistics</source>
-        <translation type="unfinished"></translation>
+        <translation>統計</translation>
     </message>
     <message>
         <source>Statistics Table</source>
-        <translation type="unfinished"></translation>
+        <translation>統計表</translation>
     </message>
     <message>
         <source>Counters</source>
-        <translation type="unfinished"></translation>
+        <translation>カウンター</translation>
     </message>
     <message>
         <source>Min / Median / Max Box</source>
-        <translation type="unfinished"></translation>
+        <translation>箱ひげ図 (最小/中央値/最大)</translation>
     </message>
     <message>
         <source>Trend</source>
-        <translation type="unfinished"></translation>
+        <translation>トレンド</translation>
     </message>
 </context>
 <context>
     <name>KvCameraImageNodeOptionsWidget</name>
     <message>
         <source>Camera image view</source>
-        <translation type="unfinished"></translation>
+        <translation>カメラ画像ビュー</translation>
     </message>
     <message>
         <source>Render measurements</source>
-        <translation type="unfinished"></translation>
+        <translation>測定を描画</translation>
     </message>
     <message>
         <source>Draw the measurement objects on the picture</source>
-        <translation type="unfinished"></translation>
+        <translation>測定オブジェクトを画像に重ねて描画します</translation>
     </message>
 </context>
 <context>
     <name>KvCameraImageWidget</name>
     <message>
         <source>Camera Image View</source>
-        <translation type="unfinished"></translation>
+        <translation>カメラ画像ビュー</translation>
     </message>
 </context>
 <context>
     <name>KvColumnsOptionsRow</name>
     <message>
         <source>Select columns:</source>
-        <translation type="unfinished"></translation>
+        <translation>列の選択:</translation>
     </message>
 </context>
 <context>
     <name>KvEditorAddImageExtWidgetUi</name>
     <message>
         <source>Width:</source>
-        <translation type="unfinished"></translation>
+        <translation>幅:</translation>
     </message>
     <message>
         <source>Width in percent of the text&apos;s width</source>
-        <translation type="unfinished"></translation>
+        <translation>テキスト幅に対する幅 (%)</translation>
     </message>
     <message>
         <source>Float:</source>
-        <translation type="unfinished"></translation>
+        <translation>配置:</translation>
     </message>
     <message>
         <source>Side of the text at which the picture stands</source>
-        <translation type="unfinished"></translation>
+        <translation>テキストに対して画像を置く側</translation>
     </message>
     <message>
         <source>none</source>
-        <translation type="unfinished"></translation>
+        <translation>なし</translation>
     </message>
     <message>
         <source>left</source>
-        <translation type="unfinished"></translation>
+        <translation>左</translation>
     </message>
     <message>
         <source>right</source>
-        <translation type="unfinished"></translation>
+        <translation>右</translation>
     </message>
 </context>
 <context>
     <name>KvEditorToolCombo</name>
     <message>
         <source>Group of blocks, open</source>
-        <translation type="unfinished"></translation>
+        <translation>ブロックのグループ、開いています</translation>
     </message>
     <message>
         <source>Group of blocks, closed</source>
-        <translation type="unfinished"></translation>
+        <translation>ブロックのグループ、閉じています</translation>
     </message>
     <message>
         <source>Close the group (Enter)</source>
-        <translation type="unfinished"></translation>
+        <translation>グループを閉じる (Enter)</translation>
     </message>
     <message>
         <source>Open the group (Enter)</source>
-        <translation type="unfinished"></translation>
+        <translation>グループを開く (Enter)</translation>
     </message>
 </context>
 <context>
     <name>KvEditorToolWidget</name>
     <message>
         <source>Drag onto the page, or press Enter to append</source>
-        <translation type="unfinished"></translation>
+        <translation>ページへドラッグします。Enter キーを押すと末尾に追加されます</translation>
     </message>
 </context>
 <context>
@@ -211,529 +211,530 @@
     <message>
         <source>%1 already exists.
 Do you want to replace it?</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 はすでに存在します。
+置き換えますか?</translation>
     </message>
     <message>
         <source>Save</source>
-        <translation type="unfinished"></translation>
+        <translation>保存</translation>
     </message>
 </context>
 <context>
     <name>KvFooterWidget</name>
     <message>
         <source>Footer</source>
-        <translation type="unfinished"></translation>
+        <translation>フッター</translation>
     </message>
 </context>
 <context>
     <name>KvGroupByOptionsRow</name>
     <message>
         <source>Group by:</source>
-        <translation type="unfinished"></translation>
+        <translation>グループ化:</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>オブジェクト</translation>
     </message>
     <message>
         <source>Measurement</source>
-        <translation type="unfinished"></translation>
+        <translation>測定項目</translation>
     </message>
 </context>
 <context>
     <name>KvHeaderWidget</name>
     <message>
         <source>Header</source>
-        <translation type="unfinished"></translation>
+        <translation>ヘッダー</translation>
     </message>
 </context>
 <context>
     <name>KvImageFile</name>
     <message>
         <source>Cannot read the image file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>画像ファイル %1 を読み取れません</translation>
     </message>
     <message>
         <source>The image that the template holds of %1 is damaged</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートに保存されている %1 の画像が壊れています</translation>
     </message>
 </context>
 <context>
     <name>KvImageNodeOptionsWidget</name>
     <message>
         <source>Image view</source>
-        <translation type="unfinished"></translation>
+        <translation>画像ビュー</translation>
     </message>
     <message>
         <source>Browse</source>
-        <translation type="unfinished"></translation>
+        <translation>参照</translation>
     </message>
     <message>
         <source>Choose an image file</source>
-        <translation type="unfinished"></translation>
+        <translation>画像ファイルを選択します</translation>
     </message>
     <message>
         <source>Choose image file</source>
-        <translation type="unfinished"></translation>
+        <translation>画像ファイルの選択</translation>
     </message>
     <message>
         <source>Image file(*.png *.jpg *.gif *.tif *.bmp)</source>
-        <translation type="unfinished"></translation>
+        <translation>画像ファイル (*.png *.jpg *.gif *.tif *.bmp)</translation>
     </message>
 </context>
 <context>
     <name>KvImageWidget</name>
     <message>
         <source>Image View</source>
-        <translation type="unfinished"></translation>
+        <translation>画像ビュー</translation>
     </message>
 </context>
 <context>
     <name>KvPageCountWidget</name>
     <message>
         <source>Page count</source>
-        <translation type="unfinished"></translation>
+        <translation>ページ数</translation>
     </message>
 </context>
 <context>
     <name>KvPrintProgressDialog</name>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished"></translation>
+        <translation>キャンセル</translation>
     </message>
     <message>
         <source>Printing the report</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートの印刷中</translation>
     </message>
     <message>
         <source>Progress</source>
-        <translation type="unfinished"></translation>
+        <translation>進行状況</translation>
     </message>
     <message>
         <source>Cancel (Esc)</source>
-        <translation type="unfinished"></translation>
+        <translation>キャンセル (Esc)</translation>
     </message>
     <message>
         <source>Page %1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 / %2 ページ</translation>
     </message>
 </context>
 <context>
     <name>KvReportKeywords</name>
     <message>
         <source>Creation date (ISO)</source>
-        <translation type="unfinished"></translation>
+        <translation>作成日 (ISO)</translation>
     </message>
     <message>
         <source>Creation date (Text)</source>
-        <translation type="unfinished"></translation>
+        <translation>作成日 (テキスト)</translation>
     </message>
     <message>
         <source>Creation time</source>
-        <translation type="unfinished"></translation>
+        <translation>作成時刻</translation>
     </message>
     <message>
         <source>Program name</source>
-        <translation type="unfinished"></translation>
+        <translation>プログラム名</translation>
     </message>
     <message>
         <source>Program version</source>
-        <translation type="unfinished"></translation>
+        <translation>プログラムのバージョン</translation>
     </message>
     <message>
         <source>Program vendor</source>
-        <translation type="unfinished"></translation>
+        <translation>プログラムの提供元</translation>
     </message>
 </context>
 <context>
     <name>KvReportTemplatesEditor</name>
     <message>
         <source>Report template editor</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートテンプレートエディター</translation>
     </message>
     <message>
         <source>Report template file (*.rtp)</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートテンプレートファイル (*.rtp)</translation>
     </message>
 </context>
 <context>
     <name>KvRotationOptionsRow</name>
     <message>
         <source>Rotation</source>
-        <translation type="unfinished"></translation>
+        <translation>回転</translation>
     </message>
     <message>
         <source>Rotation of the picture, clockwise</source>
-        <translation type="unfinished"></translation>
+        <translation>画像の回転 (時計回り)</translation>
     </message>
 </context>
 <context>
     <name>KvSelectionOverlay</name>
     <message>
         <source>Delete block</source>
-        <translation type="unfinished"></translation>
+        <translation>ブロックを削除</translation>
     </message>
     <message>
         <source>Delete block (Del)</source>
-        <translation type="unfinished"></translation>
+        <translation>ブロックを削除 (Del)</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsMeasurementsTableNodeCfg</name>
     <message>
         <source>Object Name</source>
-        <translation type="unfinished"></translation>
+        <translation>オブジェクト名</translation>
     </message>
     <message>
         <source>Object Type</source>
-        <translation type="unfinished"></translation>
+        <translation>オブジェクトの種類</translation>
     </message>
     <message>
         <source>Value Name</source>
-        <translation type="unfinished"></translation>
+        <translation>値の名前</translation>
     </message>
     <message>
         <source>Value</source>
-        <translation type="unfinished"></translation>
+        <translation>値</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsMeasurementsTableOptionsWidget</name>
     <message>
         <source>Measurements table</source>
-        <translation type="unfinished"></translation>
+        <translation>測定値表</translation>
     </message>
     <message>
         <source>Order by:</source>
-        <translation type="unfinished"></translation>
+        <translation>並べ替え:</translation>
     </message>
     <message>
         <source>default</source>
-        <translation type="unfinished"></translation>
+        <translation>既定</translation>
     </message>
     <message>
         <source>%1, ascending</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 (昇順)</translation>
     </message>
     <message>
         <source>%1, descending</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 (降順)</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsMeasurementsTableWidget</name>
     <message>
         <source>Measurements Table</source>
-        <translation type="unfinished"></translation>
+        <translation>測定値表</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsStatsTableNodeCfg</name>
     <message>
         <source>Min</source>
-        <translation type="unfinished"></translation>
+        <translation>最小</translation>
     </message>
     <message>
         <source>Max</source>
-        <translation type="unfinished"></translation>
+        <translation>最大</translation>
     </message>
     <message>
         <source>Average</source>
-        <translation type="unfinished"></translation>
+        <translation>平均</translation>
     </message>
     <message>
         <source>Sigma</source>
-        <translation type="unfinished"></translation>
+        <translation>σ</translation>
     </message>
     <message>
         <source>3 Sigma</source>
-        <translation type="unfinished"></translation>
+        <translation>3σ</translation>
     </message>
     <message>
         <source>6 Sigma</source>
-        <translation type="unfinished"></translation>
+        <translation>6σ</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsStatsTableOptionsWidget</name>
     <message>
         <source>Statistics table</source>
-        <translation type="unfinished"></translation>
+        <translation>統計表</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsStatsTableWidget</name>
     <message>
         <source>Statistics Table</source>
-        <translation type="unfinished"></translation>
+        <translation>統計表</translation>
     </message>
     <message>
         <source>Object Type</source>
-        <translation type="unfinished"></translation>
+        <translation>オブジェクトの種類</translation>
     </message>
     <message>
         <source>Measurement Type</source>
-        <translation type="unfinished"></translation>
+        <translation>測定項目</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsUnitConverter</name>
     <message>
         <source>deg</source>
-        <translation type="unfinished"></translation>
+        <translation>度</translation>
     </message>
     <message>
         <source>pcs</source>
-        <translation type="unfinished"></translation>
+        <translation>個</translation>
     </message>
     <message>
         <source>%</source>
-        <translation type="unfinished"></translation>
+        <translation>%</translation>
     </message>
 </context>
 <context>
     <name>KvStatisticsWindow</name>
     <message>
         <source>Measurement statistics</source>
-        <translation type="unfinished"></translation>
+        <translation>測定値の統計</translation>
     </message>
     <message>
         <source>Choose a statistics view on the right.</source>
-        <translation type="unfinished"></translation>
+        <translation>右側で統計ビューを選択してください。</translation>
     </message>
     <message>
         <source>No statistics blocks are installed.</source>
-        <translation type="unfinished"></translation>
+        <translation>統計ブロックがインストールされていません。</translation>
     </message>
 </context>
 <context>
     <name>KvTemplateModel</name>
     <message>
         <source>Cannot read</source>
-        <translation type="unfinished"></translation>
+        <translation>読み取りエラー</translation>
     </message>
     <message>
         <source>Cannot open file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイル %1 を開けません</translation>
     </message>
     <message>
         <source>Error reading file</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイルの読み取りエラー</translation>
     </message>
     <message>
         <source>Cannot read file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイル %1 を読み取れません</translation>
     </message>
     <message>
         <source>Cannot save</source>
-        <translation type="unfinished"></translation>
+        <translation>保存エラー</translation>
     </message>
     <message>
         <source>Cannot create file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイル %1 を作成できません</translation>
     </message>
 </context>
 <context>
     <name>KvTemplatesEditorWindow</name>
     <message>
         <source>Open a template file</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイルを開きます</translation>
     </message>
     <message>
         <source>Start a new, empty template</source>
-        <translation type="unfinished"></translation>
+        <translation>新しい空のテンプレートを作成します</translation>
     </message>
     <message>
         <source>Save the template to another file</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートを別のファイルに保存します</translation>
     </message>
     <message>
         <source>Save the template</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートを保存します</translation>
     </message>
     <message>
         <source>Print the report to a PDF file</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートを PDF ファイルに印刷します</translation>
     </message>
     <message>
         <source>Header on every page</source>
-        <translation type="unfinished"></translation>
+        <translation>各ページにヘッダーを付ける</translation>
     </message>
     <message>
         <source>Footer on every page</source>
-        <translation type="unfinished"></translation>
+        <translation>各ページにフッターを付ける</translation>
     </message>
     <message>
         <source>Page numbers</source>
-        <translation type="unfinished"></translation>
+        <translation>ページ番号</translation>
     </message>
     <message>
         <source>Report pages</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートのページ</translation>
     </message>
     <message>
         <source>Blocks to add</source>
-        <translation type="unfinished"></translation>
+        <translation>追加できるブロック</translation>
     </message>
     <message>
         <source>Are you sure?</source>
-        <translation type="unfinished"></translation>
+        <translation>確認</translation>
     </message>
     <message>
         <source>The template is modified, do you want to save it first?</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートが変更されています。先に保存しますか?</translation>
     </message>
     <message>
         <source>Choose file to open</source>
-        <translation type="unfinished"></translation>
+        <translation>開くファイルの選択</translation>
     </message>
     <message>
         <source>Choose file to save</source>
-        <translation type="unfinished"></translation>
+        <translation>保存先ファイルの選択</translation>
     </message>
     <message>
         <source>Choose file to print to</source>
-        <translation type="unfinished"></translation>
+        <translation>印刷先ファイルの選択</translation>
     </message>
     <message>
         <source>Pdf file (*.pdf)</source>
-        <translation type="unfinished"></translation>
+        <translation>PDF ファイル (*.pdf)</translation>
     </message>
     <message>
         <source>Save failed</source>
-        <translation type="unfinished"></translation>
+        <translation>保存に失敗しました</translation>
     </message>
     <message>
         <source>Cannot write to file %1</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイル %1 に書き込めません</translation>
     </message>
     <message>
         <source>[new]</source>
-        <translation type="unfinished"></translation>
+        <translation>[新規]</translation>
     </message>
 </context>
 <context>
     <name>KvTemplatesEditorWindowUi</name>
     <message>
         <source>Open File</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイルを開く</translation>
     </message>
     <message>
         <source>Clear</source>
-        <translation type="unfinished"></translation>
+        <translation>クリア</translation>
     </message>
     <message>
         <source>Save as ...</source>
-        <translation type="unfinished"></translation>
+        <translation>名前を付けて保存...</translation>
     </message>
     <message>
         <source>Save</source>
-        <translation type="unfinished"></translation>
+        <translation>保存</translation>
     </message>
     <message>
         <source>Print</source>
-        <translation type="unfinished"></translation>
+        <translation>印刷</translation>
     </message>
     <message>
         <source>Add block</source>
-        <translation type="unfinished"></translation>
+        <translation>ブロックの追加</translation>
     </message>
     <message>
         <source>The template is empty. Drag a block from here onto the page.</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートは空です。ここからページへブロックをドラッグしてください。</translation>
     </message>
 </context>
 <context>
     <name>KvTextDocumentNodeOptionsWidget</name>
     <message>
         <source>Text</source>
-        <translation type="unfinished"></translation>
+        <translation>テキスト</translation>
     </message>
     <message>
         <source>Font size in points</source>
-        <translation type="unfinished"></translation>
+        <translation>フォントサイズ (ポイント)</translation>
     </message>
     <message>
         <source>Font size</source>
-        <translation type="unfinished"></translation>
+        <translation>フォントサイズ</translation>
     </message>
     <message>
         <source>Text color</source>
-        <translation type="unfinished"></translation>
+        <translation>文字色</translation>
     </message>
     <message>
         <source>Bold</source>
-        <translation type="unfinished"></translation>
+        <translation>太字</translation>
     </message>
     <message>
         <source>Italic</source>
-        <translation type="unfinished"></translation>
+        <translation>斜体</translation>
     </message>
     <message>
         <source>Underline</source>
-        <translation type="unfinished"></translation>
+        <translation>下線</translation>
     </message>
     <message>
         <source>Align left</source>
-        <translation type="unfinished"></translation>
+        <translation>左揃え</translation>
     </message>
     <message>
         <source>Align center</source>
-        <translation type="unfinished"></translation>
+        <translation>中央揃え</translation>
     </message>
     <message>
         <source>Align right</source>
-        <translation type="unfinished"></translation>
+        <translation>右揃え</translation>
     </message>
     <message>
         <source>Justify</source>
-        <translation type="unfinished"></translation>
+        <translation>両端揃え</translation>
     </message>
     <message>
         <source>Superscript</source>
-        <translation type="unfinished"></translation>
+        <translation>上付き</translation>
     </message>
     <message>
         <source>Subscript</source>
-        <translation type="unfinished"></translation>
+        <translation>下付き</translation>
     </message>
     <message>
         <source>Insert link</source>
-        <translation type="unfinished"></translation>
+        <translation>リンクを挿入</translation>
     </message>
     <message>
         <source>Insert picture</source>
-        <translation type="unfinished"></translation>
+        <translation>画像を挿入</translation>
     </message>
     <message>
         <source>Insert tag</source>
-        <translation type="unfinished"></translation>
+        <translation>タグを挿入</translation>
     </message>
     <message>
         <source>Insert a tag that the report replaces by its value</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートで実際の値に置き換えられるタグを挿入します</translation>
     </message>
 </context>
 <context>
     <name>KvTextDocumentNodeWidget</name>
     <message>
         <source>Text</source>
-        <translation type="unfinished"></translation>
+        <translation>テキスト</translation>
     </message>
 </context>
 <context>
     <name>KvThemeOptionsRow</name>
     <message>
         <source>Color theme:</source>
-        <translation type="unfinished"></translation>
+        <translation>カラーテーマ:</translation>
     </message>
     <message>
         <source>Dark</source>
-        <translation type="unfinished"></translation>
+        <translation>ダーク</translation>
     </message>
     <message>
         <source>Light</source>
-        <translation type="unfinished"></translation>
+        <translation>ライト</translation>
     </message>
 </context>
 <context>
@@ -741,41 +742,41 @@ Do you want to replace it?</source>
     <message>
         <source>W</source>
         <comment>short for width</comment>
-        <translation type="unfinished"></translation>
+        <translation>幅</translation>
     </message>
     <message>
         <source>Width in percent</source>
-        <translation type="unfinished"></translation>
+        <translation>幅 (%)</translation>
     </message>
     <message>
         <source>Width in percent of the page&apos;s content</source>
-        <translation type="unfinished"></translation>
+        <translation>ページの本文領域に対する幅 (%)</translation>
     </message>
 </context>
 <context>
     <name>KvWindowTitleBar</name>
     <message>
         <source>Close</source>
-        <translation type="unfinished"></translation>
+        <translation>閉じる</translation>
     </message>
 </context>
 <context>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation type="unfinished"></translation>
+        <translation>統計ツール</translation>
     </message>
     <message>
         <source>Select Template File</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイルの選択</translation>
     </message>
     <message>
         <source>Report Template File (*.rtp)</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートテンプレートファイル (*.rtp)</translation>
     </message>
     <message>
         <source>No report template selected.</source>
-        <translation type="unfinished"></translation>
+        <translation>レポートテンプレートが選択されていません。</translation>
     </message>
 </context>
 </TS>
