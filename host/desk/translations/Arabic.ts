@@ -385,7 +385,7 @@
     </message>
     <message>
         <source>Unsaved changes are not being copied: %1</source>
-        <translation>لا تُنسخ التغييرات غير المحفوظة احتياطيًا: %1</translation>
+        <translation>لا تُحفظ نسخة احتياطية من التغييرات غير المحفوظة: %1</translation>
     </message>
 </context>
 <context>
@@ -435,7 +435,7 @@
     </message>
     <message>
         <source>Typed</source>
-        <translation>إدخال يدوي</translation>
+        <translation>يدوي</translation>
     </message>
     <message>
         <source>Name</source>
@@ -539,7 +539,7 @@
     </message>
     <message>
         <source>Typed</source>
-        <translation>إدخال يدوي</translation>
+        <translation>يدوي</translation>
     </message>
     <message>
         <source>Not calibrated</source>
@@ -1368,7 +1368,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>It is no plug-in for this program</source>
-        <translation>ليس إضافة لهذا البرنامج</translation>
+        <translation>الملف ليس إضافة لهذا البرنامج</translation>
     </message>
     <message>
         <source>Its tools &quot;%1&quot; could not be started</source>
@@ -1735,7 +1735,7 @@ Dropped, because newer ones came first: %1</source>
 Reported by %2</source>
         <comment>message, source</comment>
         <translation>%1
-أبلغ عنه %2</translation>
+أبلغ عنها: %2</translation>
     </message>
     <message>
         <source>Category</source>
@@ -1950,7 +1950,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>A calibration in the settings is damaged and was left out (%1: %2)</source>
-        <translation>توجد في الإعدادات معايرة تالفة وقد تُركت (%1: %2)</translation>
+        <translation>توجد في الإعدادات معايرة تالفة وقد جرى تجاهلها (%1: %2)</translation>
     </message>
 </context>
 <context>
@@ -2388,11 +2388,11 @@ Reported by %2</source>
     </message>
     <message>
         <source>Column %1 is not part of a list of values and was left out</source>
-        <translation>العمود %1 ليس جزءًا من قائمة قيم وقد تُرك</translation>
+        <translation>العمود %1 ليس جزءًا من قائمة قيم وقد جرى تجاهله</translation>
     </message>
     <message>
         <source>Columns %1 are not part of a list of values and were left out</source>
-        <translation>الأعمدة %1 ليست جزءًا من قائمة قيم وقد تُركت</translation>
+        <translation>الأعمدة %1 ليست جزءًا من قائمة قيم وقد جرى تجاهلها</translation>
     </message>
     <message>
         <source>The value has no name</source>
@@ -2416,11 +2416,11 @@ Reported by %2</source>
     </message>
     <message>
         <source>Column %1 holds text and was left out</source>
-        <translation>العمود %1 يحوي نصًا وقد تُرك</translation>
+        <translation>العمود %1 يحوي نصًا وقد جرى تجاهله</translation>
     </message>
     <message>
         <source>Columns %1 hold text and were left out</source>
-        <translation>الأعمدة %1 تحوي نصوصًا وقد تُركت</translation>
+        <translation>الأعمدة %1 تحوي نصوصًا وقد جرى تجاهلها</translation>
     </message>
     <message>
         <source>Reading was cancelled</source>

@@ -286,7 +286,7 @@
     </message>
     <message>
         <source>Count by clicks</source>
-        <translation>按一下以計數</translation>
+        <translation>以點擊計數</translation>
     </message>
     <message>
         <source>&amp;Text note</source>

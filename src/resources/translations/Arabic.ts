@@ -55,7 +55,7 @@
     <name>KvAddLinkDialogUi</name>
     <message>
         <source>Insert Link</source>
-        <translation>إدراج ارتباط</translation>
+        <translation>إدراج رابط</translation>
     </message>
     <message>
         <source>Title:</source>
@@ -63,14 +63,14 @@
     </message>
     <message>
         <source>URL:</source>
-        <translation>عنوان URL:</translation>
+        <translation>الرابط:</translation>
     </message>
 </context>
 <context>
     <name>KvAlignmentOptionsRow</name>
     <message>
         <source>Align left</source>
-        <translation>محاذاة إلى اليسار</translation>
+        <translation>محاذاة لليسار</translation>
     </message>
     <message>
         <source>Align center</source>
@@ -78,7 +78,7 @@
     </message>
     <message>
         <source>Align right</source>
-        <translation>محاذاة إلى اليمين</translation>
+        <translation>محاذاة لليمين</translation>
     </message>
 </context>
 <context>
@@ -574,7 +574,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Blocks to add</source>
-        <translation>الكتل المتاحة للإضافة</translation>
+        <translation>الكتل المتاحة</translation>
     </message>
     <message>
         <source>Are you sure?</source>
@@ -676,7 +676,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Align left</source>
-        <translation>محاذاة إلى اليسار</translation>
+        <translation>محاذاة لليسار</translation>
     </message>
     <message>
         <source>Align center</source>
@@ -684,7 +684,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Align right</source>
-        <translation>محاذاة إلى اليمين</translation>
+        <translation>محاذاة لليمين</translation>
     </message>
     <message>
         <source>Justify</source>
@@ -700,7 +700,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Insert link</source>
-        <translation>إدراج ارتباط</translation>
+        <translation>إدراج رابط</translation>
     </message>
     <message>
         <source>Insert picture</source>
