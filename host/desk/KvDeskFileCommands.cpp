@@ -115,8 +115,11 @@ bool KvDeskFileCommands::openFile(const QString &path)
 void KvDeskFileCommands::openFiles(const QStringList &paths)
 {
     QMap<int, QStringList> byKind;
-    for (const QString &path : paths)
-        byKind[KvDeskFileKind::isKnown(path) ? KvDeskFileKind::of(path) : -1].append(path);
+    for (const QString &path : paths) {
+        // Opening one that is not there says so.
+        const bool isTried = KvDeskFileKind::isKnown(path) || !QFileInfo::exists(path);
+        byKind[isTried ? KvDeskFileKind::of(path) : -1].append(path);
+    }
     QStringList sessions = byKind.take(KvDeskFileKind::Session);
     QStringList others = byKind.take(-1);
     {

@@ -51,6 +51,8 @@
 #include <QToolButton>
 #include <QUrl>
 
+#include <algorithm>
+
 namespace {
 
 constexpr QSize firstSize(1280, 800);
@@ -316,9 +318,9 @@ void KvDeskMainWindow::connectActions()
     onTrigger(A::Settings, this, SLOT(slotSettings()));
     onTrigger(A::About, this, SLOT(slotAbout()));
     connect(m_actions->action(A::ShowLabels), SIGNAL(toggled(bool)), m_imageView,
-                                              SLOT(slotSetLabelsVisible(bool)));
+                                                     SLOT(slotSetLabelsVisible(bool)));
     connect(m_actions->action(A::ShowRulers), SIGNAL(toggled(bool)), m_imageView,
-                                              SLOT(slotSetRulersVisible(bool)));
+                                                     SLOT(slotSetRulersVisible(bool)));
     connect(m_actions->action(A::ShowValues), SIGNAL(toggled(bool)), m_valueTable, SLOT(setVisible(bool)));
     connect(m_actions->action(A::ShowGallery), SIGNAL(toggled(bool)), m_gallery, SLOT(setVisible(bool)));
     connect(m_actions->action(A::ShowLog), SIGNAL(toggled(bool)), m_statusLog, SLOT(setVisible(bool)));
@@ -459,7 +461,7 @@ void KvDeskMainWindow::dropEvent(QDropEvent *event)
     event->setDropAction(Qt::CopyAction);
     event->accept();
     // Later: the program that the files come from waits for the end of the drag.
-    QMetaObject::invokeMethod(this, "slotOpenDropped", Qt::QueuedConnection,
+    QMetaObject::invokeMethod(this, "slotOpenFiles", Qt::QueuedConnection,
                               Q_ARG(QStringList, localFiles(event->mimeData())));
 }
 
@@ -469,10 +471,23 @@ void KvDeskMainWindow::showFolder(const QString &path)
     m_gallery->showFolder(path);
 }
 
-void KvDeskMainWindow::slotOpenDropped(const QStringList &aPaths)
+bool KvDeskMainWindow::openWithTool(const QString &path)
+{
+    const QList<KvToolBase *> all = tools();
+    const auto tool = std::find_if(
+        all.begin(), all.end(), [&path](const KvToolBase *candidate) { return candidate->opensFile(path); });
+    if (tool == all.end() || !QFileInfo(path).isFile())
+        return false;
+    (*tool)->openFile(path);
+    return true;
+}
+
+void KvDeskMainWindow::slotOpenFiles(const QStringList &aPaths)
 {
     QStringList files;
     for (const QString &path : aPaths) {
+        if (openWithTool(path))
+            continue;
         const ZtFrameSourceInfo info = ZtFrameSourceCatalogue::infoOfPath(path);
         if (info.kind == ZtFrameSourceInfo::ImageFolder)
             showFolder(path);
@@ -494,8 +509,7 @@ void KvDeskMainWindow::slotStateChanged()
 
 void KvDeskMainWindow::slotImageStateChanged()
 {
-    m_statusBar->setImage(m_imageView->frame().image().size(),
-                          m_session->document()->calibration());
+    m_statusBar->setImage(m_imageView->frame().image().size(), m_session->document()->calibration());
     m_statusBar->slotZoomChanged(m_imageView->zoom());
 }
 

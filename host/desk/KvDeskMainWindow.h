@@ -76,6 +76,10 @@ public:
     KvDeskAutosave *autosave() const { return m_autosave.get(); }
     KvDeskRecoveryBar *recoveryBar() const { return m_recoveryBar; }
 
+public slots:
+    /** Opens whatever the user gave the program: with a tool that takes such files, else as the menu does. */
+    void slotOpenFiles(const QStringList &aPaths);
+
 signals:
     void signalClosed();
 
@@ -87,7 +91,6 @@ protected:
 
 private slots:
     void slotStateChanged();
-    void slotOpenDropped(const QStringList &aPaths);
     void slotImageStateChanged();
     void slotFillRecentMenu();
     void slotRecentTriggered(QAction *aAction);
@@ -115,6 +118,7 @@ private:
     void saveWindow() const;
     QStringList activeTools() const;
     void showFolder(const QString &path);
+    bool openWithTool(const QString &path);
     bool closeOtherWindows();
 
     KvDeskActions *m_actions;

@@ -3,6 +3,7 @@
 
 #include "gui/KvGuiMainWindowBase.h"
 
+#include <QFileInfo>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QToolButton>
@@ -104,6 +105,19 @@ bool KvToolBase::isEnabled() const
 bool KvToolBase::isActivated() const
 {
     return m_button && m_button->isChecked();
+}
+
+bool KvToolBase::opensFile(const QString &path) const
+{
+    return m_fileSuffixes.contains(QFileInfo(path).suffix(), Qt::CaseInsensitive);
+}
+
+void KvToolBase::openFile(const QString &path)
+{
+    if (!isEnabled())
+        return;
+    m_button->setChecked(true);
+    emit fileGiven(path);
 }
 
 void KvToolBase::createButton(const QIcon &icon, bool activated)

@@ -7,6 +7,7 @@
 #include <QObject>
 #include <QPointer>
 #include <QString>
+#include <QStringList>
 
 class KvGuiMainWindowBase;
 class QToolButton;
@@ -62,15 +63,27 @@ public:
     bool isEnabled() const;
     bool isActivated() const;
 
+    /**
+     * Kinds of files that the tool opens when the user gives one to the program, by a double click or a drop:
+     * suffixes without a dot, compared without regard to case. None at first.
+     */
+    void setFileSuffixes(const QStringList &suffixes) { m_fileSuffixes = suffixes; }
+    QStringList fileSuffixes() const { return m_fileSuffixes; }
+    bool opensFile(const QString &path) const;
+    /** Has the tool open a file (fileGiven()); it becomes active. A tool that is not enabled does nothing. */
+    void openFile(const QString &path);
+
 signals:
     void toolActivated(bool anActivated); ///< the button was checked or unchecked, by the user or by code
     void resetClicked();                  ///< the user wants the tool's values back at their defaults
+    void fileGiven(const QString &aPath); ///< the user gave the program a file of the tool's kinds
 
 private:
     void createButton(const QIcon &icon, bool activated);
     void createPanel();
 
     QString m_title;
+    QStringList m_fileSuffixes;
     QPointer<QToolButton> m_button;
     QPointer<QToolButton> m_resetButton;
     QPointer<QWidget> m_panel;

@@ -297,6 +297,11 @@ void KvTemplatesEditorWindow::slotOpenTemplate()
     m_model->load(path);
 }
 
+bool KvTemplatesEditorWindow::openTemplateFile(const QString &path)
+{
+    return mayClose() && m_model->load(path);
+}
+
 bool KvTemplatesEditorWindow::slotSaveTemplate()
 {
     QString suggested = QFileInfo(m_model->filePath()).fileName();

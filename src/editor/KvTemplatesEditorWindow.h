@@ -48,6 +48,10 @@ public:
     /** The palette, which is the registry of block types, too. */
     KvEditorToolsList *toolsList() const;
 
+    /** Opens a template after asking, as before closing, about changes of the present one; false when it was
+     * not opened. */
+    bool openTemplateFile(const QString &path);
+
     /** Whether the user may cancel closing a modified template; true at first. */
     bool isCloseCancellable() const { return m_closeCancellable; }
     void setCloseCancellable(bool cancellable) { m_closeCancellable = cancellable; }

@@ -112,6 +112,7 @@ void StatReportingPlugin::createTool()
     m_tool = new KvToolBase(m_mainWindow, icon(kToolIcon), tr("Statistics tools"),
                             QStringLiteral("statreport"), false);
     m_tool->setResetVisible(false);
+    m_tool->setFileSuffixes({QStringLiteral("rtp")});
     createPanel();
     m_tool->setGuiWidget(m_panel);
     m_tool->setEnabled(true, false);
@@ -170,6 +171,7 @@ void StatReportingPlugin::connectSignals()
     connect(m_ui->theExportButton, SIGNAL(clicked()), this, SLOT(slotExportClicked()));
     connect(m_ui->theStatisticsButton, SIGNAL(clicked()), this, SLOT(slotStatisticsClicked()));
     connect(m_tool, SIGNAL(toolActivated(bool)), this, SLOT(slotToolActivated(bool)));
+    connect(m_tool, &KvToolBase::fileGiven, this, &StatReportingPlugin::openGivenTemplate);
     connect(m_ui->theTemplatePath, SIGNAL(currentIndexChanged(int)), this,
                                           SLOT(slotCurrentTemplateSelected(int)));
     connect(ZtSignalCenter::getInstance(), SIGNAL(signalAppAboutToClose()), this,
@@ -254,6 +256,22 @@ void StatReportingPlugin::slotEditorClicked()
     ensureEditor();
     m_editor->templateModel()->newTemplate();
     m_editor->show();
+}
+
+void StatReportingPlugin::openGivenTemplate(const QString &path)
+{
+    if (!m_panel)
+        return;
+    ensureEditor();
+    if (!m_editor->isVisible())
+        m_editor->templateModel()->newTemplate();
+    m_editor->show();
+    m_editor->raise();
+    m_editor->activateWindow();
+    m_ui->theEditorButton->setChecked(true);
+    const QString file = QFileInfo(path).absoluteFilePath();
+    if (m_editor->openTemplateFile(file) && m_panel && file != currentTemplate())
+        useTemplate(file);
 }
 
 void StatReportingPlugin::closeEditor()

@@ -74,6 +74,8 @@ private:
     QString browseFolder() const;
     void addTemplate(int index, const QString &path);
     void useTemplate(const QString &path);
+    /** Opens a template that the user gave the host: in the editor, and as the current one of the panel. */
+    void openGivenTemplate(const QString &path);
 
     // Pointers to windows are cleared when the main window, their parent, deletes them.
     QPointer<KvReportTemplatesEditor> m_editor;

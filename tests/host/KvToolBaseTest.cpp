@@ -29,6 +29,9 @@ private slots:
     void anotherWidgetReplacesTheFirst();
     void nullTakesTheWidgetAway();
     void theIconCanChange();
+    void opensFilesOfItsKinds_data();
+    void opensFilesOfItsKinds();
+    void openingAFileActivates();
     void outlivesItsWidgets();
 
 private:
@@ -208,6 +211,40 @@ void KvToolBaseTest::theIconCanChange()
     QVERIFY(m_tool->getToolButton()->icon().cacheKey() != before);
 }
 
+void KvToolBaseTest::opensFilesOfItsKinds_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::addColumn<bool>("isOpened");
+    QTest::newRow("its kind") << QStringLiteral("/a/b.rtp") << true;
+    QTest::newRow("in capitals") << QStringLiteral("B.RTP") << true;
+    QTest::newRow("more dots") << QStringLiteral("a.b.rtp") << true;
+    QTest::newRow("another kind") << QStringLiteral("a.rtp.json") << false;
+    QTest::newRow("none") << QStringLiteral("rtp") << false;
+    QTest::newRow("nothing") << QString() << false;
+}
+
+void KvToolBaseTest::opensFilesOfItsKinds()
+{
+    QFETCH(QString, path);
+    QFETCH(bool, isOpened);
+    QVERIFY(!m_tool->opensFile(path));
+    m_tool->setFileSuffixes({QStringLiteral("rtp")});
+    QCOMPARE(m_tool->opensFile(path), isOpened);
+}
+
+void KvToolBaseTest::openingAFileActivates()
+{
+    m_tool->setEnabled(true, false);
+    QSignalSpy given(m_tool, SIGNAL(fileGiven(QString)));
+    m_tool->openFile(QStringLiteral("a.rtp"));
+    QCOMPARE(given, QList<QVariantList>({{QStringLiteral("a.rtp")}}));
+    QVERIFY(m_tool->isActivated());
+    m_tool->setEnabled(false, false);
+    m_tool->openFile(QStringLiteral("b.rtp"));
+    QCOMPARE(given.count(), 1);
+    QVERIFY(!m_tool->isActivated());
+}
+
 /// A host may put button and panel where they die before the tool.
 void KvToolBaseTest::outlivesItsWidgets()
 {
@@ -219,6 +256,7 @@ void KvToolBaseTest::outlivesItsWidgets()
     m_tool->setResetVisible(true);
     m_tool->setGuiWidget(nullptr);
     m_tool->setEnabled(true, true);
+    m_tool->openFile(QStringLiteral("a.rtp"));
     QVERIFY(!m_tool->isEnabled());
     QVERIFY(!m_tool->isActivated());
 }

@@ -78,6 +78,13 @@ QStringList templates(const QString &names)
     return paths;
 }
 
+/// Off-screen windows cannot be raised, and say so.
+void expectRaise()
+{
+    if (QGuiApplication::platformName() == QLatin1String("offscreen"))
+        StatReportTest::expectWarning(QRegularExpression(QStringLiteral("raise")));
+}
+
 /// The template with one text block.
 QString templateWithText()
 {
@@ -186,6 +193,10 @@ private slots:
     void theEditorButtonOpensAndCloses();
     void theEditorStartsEmpty();
     void theEditorMayStayOpen();
+    void givenTemplateOpensInTheEditor();
+    void givenTemplateAsksAboutChanges_data();
+    void givenTemplateAsksAboutChanges();
+    void givenTemplateMayBeBroken();
     void uncheckingClosesAHiddenEditor();
     void theEditorTellsThatItClosed();
     void theEditorIsMadeAgain();
@@ -1068,6 +1079,64 @@ void StatReportingPluginTest::theEditorMayStayOpen()
     QVERIFY(editor()->isVisible());
     QVERIFY(button("theEditorButton")->isChecked());
     QCOMPARE(toggled.count(), 1); // by the click; it was set again in silence
+}
+
+void StatReportingPluginTest::givenTemplateOpensInTheEditor()
+{
+    const QStringList known = templates(QStringLiteral("ab"));
+    store(QStringLiteral("ReportTemplatePaths"), known);
+    initialize();
+    KvToolBase *const tool = m_window->tools().constFirst();
+    QVERIFY(!tool->isActivated());
+    QVERIFY(tool->opensFile(QStringLiteral("x.rtp")));
+    QVERIFY(!tool->opensFile(QStringLiteral("x.json")));
+    expectRaise();
+    tool->openFile(templateWithText());
+    QVERIFY(tool->isActivated());
+    QVERIFY(editor()->isVisible());
+    QVERIFY(editor()->windowTitle().endsWith(QStringLiteral("text.rtp")));
+    QVERIFY(button("theEditorButton")->isChecked());
+    QCOMPARE(list()->count(), 3);
+    QCOMPARE(list()->currentData().toString(), templateWithText());
+    expectRaise();
+    tool->openFile(known.at(1));
+    QCOMPARE(list()->count(), 3);
+    QCOMPARE(list()->currentData().toString(), known.at(1));
+}
+
+void StatReportingPluginTest::givenTemplateAsksAboutChanges_data()
+{
+    QTest::addColumn<int>("answer");
+    QTest::newRow("lose them") << int(QMessageBox::No);
+    QTest::newRow("stay") << int(QMessageBox::Cancel);
+}
+
+void StatReportingPluginTest::givenTemplateAsksAboutChanges()
+{
+    QFETCH(int, answer);
+    initialize();
+    openModifiedEditor();
+    const MessageBoxAnswerer boxes(static_cast<QMessageBox::StandardButton>(answer));
+    expectRaise();
+    m_window->tools().constFirst()->openFile(templateWithText());
+    QCOMPARE(boxes.boxes().size(), 1);
+    QCOMPARE(int(boxes.boxes().at(0).buttons), int(QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel));
+    const bool isOpened = answer == QMessageBox::No;
+    QCOMPARE(editor()->windowTitle().endsWith(QStringLiteral("text.rtp")), isOpened);
+    QCOMPARE(list()->count(), isOpened ? 1 : 0);
+    QVERIFY(editor()->isVisible());
+}
+
+void StatReportingPluginTest::givenTemplateMayBeBroken()
+{
+    initialize();
+    const MessageBoxAnswerer boxes(QMessageBox::Ok);
+    const QString path = writeFile(temporaryPath(QStringLiteral("templates/broken.rtp")), "{\"nodes\":");
+    expectRaise();
+    m_window->tools().constFirst()->openFile(path);
+    QCOMPARE(boxes.boxes().size(), 1);
+    QCOMPARE(list()->count(), 0);
+    QVERIFY(editor()->isVisible());
 }
 
 void StatReportingPluginTest::uncheckingClosesAHiddenEditor()

@@ -89,6 +89,7 @@ private slots:
     void dropsOpenFiles();
     void dropsOfOtherThingsAreRefused();
     void droppedFolderIsShownInTheGallery();
+    void toolsOpenFilesOfTheirKinds();
     void unknownFileIsALineOfTheLog();
     void unsavedWorkIsOfferedAfterACrash();
     void unsavedWorkStaysUntilTheEnd_data();
@@ -300,6 +301,19 @@ void KvDeskMainWindowTest::droppedFolderIsShownInTheGallery()
     QTRY_VERIFY(m_window->gallery()->isVisible());
     QTRY_COMPARE(m_window->gallery()->model()->rowCount(), 1);
     QCOMPARE(m_window->session()->objectCount(), 0);
+}
+
+void KvDeskMainWindowTest::toolsOpenFilesOfTheirKinds()
+{
+    auto *const tool =
+        new KvToolBase(m_window.get(), QIcon(), QStringLiteral("Reports"), QStringLiteral("reports"), false);
+    tool->setFileSuffixes({QStringLiteral("rtp")});
+    QSignalSpy given(tool, SIGNAL(fileGiven(QString)));
+    const QString path = DeskFiles::text(QStringLiteral("a.rtp"), QByteArray("{}"));
+    QVERIFY(drop(m_window.get(), {QUrl::fromLocalFile(path), QUrl::fromLocalFile(DeskFiles::table())}));
+    QTRY_COMPARE(m_window->session()->objectCount(), 2);
+    QCOMPARE(given, QList<QVariantList>({{path}}));
+    QVERIFY(tool->isActivated());
 }
 
 void KvDeskMainWindowTest::unknownFileIsALineOfTheLog()
