@@ -14,6 +14,7 @@
 namespace {
 
 constexpr int lineRoom = 9;        ///< pixels by which lines and markers reach beyond an object's bounds
+constexpr double roughStays = 0.8; ///< of the most objects in full
 constexpr int mostRectangles = 48; ///< beyond that it is quicker to draw everything between them, too
 
 bool isWhole(double number)
@@ -119,14 +120,20 @@ QRectF KvDeskObjectLayer::areaOf(const QRectF &rect) const
 void KvDeskObjectLayer::chooseRoughness(const KvDeskObjectIndex &index)
 {
     const QRectF view(QPointF(), QSizeF(m_image.size()) / m_image.devicePixelRatio());
+    // What is drawn anew anyway is drawn in full where that is quick enough. Else a rough picture stays until
+    // there is clearly less to see: one object that comes and goes would change all of it each time.
+    const bool isAnew = m_dirty.boundingRect().contains(view.toRect()) && m_dirty.rectCount() == 1;
+    const double share = m_isRough && !isAnew ? roughStays : 1.0;
+    const int mostObjects = qRound(share * mostInFull);
+    const int mostPoints = qRound(share * mostPointsInFull);
     int objects = 0;
     int points = 0;
     index.visit(areaOf(view), [&](const KvDeskObjectIndex::Entry &entry) {
         ++objects;
         points += pointCount(entry.object);
-        return objects <= mostInFull && points <= mostPointsInFull;
+        return objects <= mostObjects && points <= mostPoints;
     });
-    const bool isRough = objects > mostInFull || points > mostPointsInFull;
+    const bool isRough = objects > mostObjects || points > mostPoints;
     if (isRough != m_isRough)
         m_dirty = view.toAlignedRect();
     m_isRough = isRough;

@@ -35,6 +35,7 @@
 #include "kernel/ZtAppSettings.h"
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtDrawnType.h"
+#include "measuring/ZtFault.h"
 #include "measuring/ZtFrameSourceCatalogue.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "support/MessageBoxAnswerer.h"
@@ -149,6 +150,7 @@ private slots:
     void fitsIntoSmallScreens();
     void endsInTheMiddleOfAnything_data();
     void endsInTheMiddleOfAnything();
+    void whatIsBeingWrittenIsKept();
 
 private:
     void open();
@@ -763,6 +765,21 @@ void KvDeskMainWindowTest::endsInTheMiddleOfAnything()
     QVERIFY(m_document->addObject(ZtDrawnType::Line, diagonal) > 0);
     m_document->setCalibration(ZtCalibration(4.0));
     m_document->clear();
+}
+
+void KvDeskMainWindowTest::whatIsBeingWrittenIsKept()
+{
+    QVERIFY(m_window->files()->openImage(DeskFiles::image(QStringLiteral("noted.png"), QSize(400, 300))));
+    ZtFault fault;
+    QVERIFY(m_window->session()->save(temporaryPath(QStringLiteral("noted.json")), &fault));
+    choose(m_window.get(), KvDeskActions::NoteTool);
+    click(m_window.get(), QPoint());
+    QTest::keyClicks(m_window->imageView()->inlineEditor(), QStringLiteral("Look"));
+    MessageBoxAnswerer answerer(QMessageBox::Cancel);
+    QVERIFY(!m_window->close());
+    QCOMPARE(answerer.boxes().size(), 1);
+    QCOMPARE(m_window->session()->objectCount(), 1);
+    QVERIFY(m_window->isWindowModified());
 }
 
 STATREPORT_TEST_MAIN(KvDeskMainWindowTest)

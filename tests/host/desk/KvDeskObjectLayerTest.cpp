@@ -31,6 +31,7 @@ private slots:
     void manyPlacesOfACounterAreRough();
     void roughnessFollowsTheView();
     void oneObjectMoreRedrawsEverythingOnce();
+    void picturesDrawnAnewAreInFull();
     void roughPicturesAreKept();
     void roughPicturesScroll();
     void burntPicturesAreAlwaysInFull();
@@ -61,6 +62,11 @@ private:
             const QPointF centre(4 + 8 * (i % 50), 4 + 8 * (i / 50));
             m_document.addObject(ZtDrawnType::Circle, polygon({centre, centre + QPointF(3, 0)}));
         }
+    }
+    void remove(KvDeskObjectLayer *layer, const KvDeskObjectId &object)
+    {
+        layer->invalidate(rect(object));
+        ZtKernelData::getInstance()->removeObject(object.type, object.id);
     }
     QRectF rect(const KvDeskObjectId &object) const { return m_places.index().rect(object); }
 
@@ -187,9 +193,26 @@ void KvDeskObjectLayerTest::oneObjectMoreRedrawsEverythingOnce()
     layer.invalidate(rect(added));
     QCOMPARE(draw(&layer), drawAnew());
     QVERIFY(layer.isRough());
-    const QRectF before = rect(added);
-    ZtKernelData::getInstance()->removeObject(added.type, added.id);
-    layer.invalidate(before);
+    // One that comes and goes does not change everything each time.
+    const qint64 drawn = layer.drawnObjects();
+    remove(&layer, added);
+    draw(&layer);
+    QVERIFY(layer.isRough());
+    QVERIFY(layer.drawnObjects() - drawn < 100);
+    for (int id = 1; id <= KvDeskObjectLayer::mostInFull / 4; ++id)
+        remove(&layer, {ZtDrawnType::Circle, id});
+    QCOMPARE(draw(&layer), drawAnew());
+    QVERIFY(!layer.isRough());
+}
+
+void KvDeskObjectLayerTest::picturesDrawnAnewAreInFull()
+{
+    addCircles(KvDeskObjectLayer::mostInFull + 1);
+    KvDeskObjectLayer layer;
+    draw(&layer);
+    QVERIFY(layer.isRough());
+    ZtKernelData::getInstance()->removeObject(ZtDrawnType::Circle, 1);
+    layer.invalidate();
     QCOMPARE(draw(&layer), drawAnew());
     QVERIFY(!layer.isRough());
 }
