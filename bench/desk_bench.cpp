@@ -15,6 +15,7 @@
 
 #include <QApplication>
 #include <QPainter>
+#include <QScrollBar>
 
 #include <benchmark/benchmark.h>
 
@@ -200,6 +201,21 @@ void zoomStep(benchmark::State &state)
     }
 }
 
+void panStep(benchmark::State &state)
+{
+    Desk desk(static_cast<int>(state.range(0)));
+    desk.view.slotZoomIn();
+    int step = 17;
+    for (auto _ : state) {
+        QScrollBar *const bar = desk.view.horizontalScrollBar();
+        const int before = bar->value();
+        bar->setValue(before + step);
+        if (bar->value() != before + step)
+            step = -step;
+        desk.show();
+    }
+}
+
 using Clock = std::chrono::steady_clock;
 
 /// Stands for a movement of the mouse; knows when it was made.
@@ -291,6 +307,7 @@ BENCHMARK(inputWhileFramesCome)
     ->UseManualTime()
     ->Iterations(1)
     ->Unit(benchmark::kMillisecond);
+BENCHMARK(panStep)->Arg(1000)->Arg(100000)->Unit(benchmark::kMillisecond);
 BENCHMARK(zoomStep)->Arg(0)->Arg(1000)->Arg(100000)->Unit(benchmark::kMillisecond);
 
 int main(int argc, char **argv)
