@@ -2,7 +2,6 @@
 #include "KvDeskObjectLayer.h"
 
 #include "KvDeskObjectIndex.h"
-#include "KvDeskRoughObjects.h"
 #include "kernel/ZtKernelData.h"
 #include "measuring/ZtDrawnObjectData.h"
 #include "measuring/ZtObjectsPainter.h"
@@ -165,12 +164,12 @@ void KvDeskObjectLayer::drawInFull(QPainter *painter, const KvDeskObjectIndex &i
 
 void KvDeskObjectLayer::drawRoughly(QPainter *painter, const KvDeskObjectIndex &index, const QRectF &area)
 {
-    KvDeskRoughObjects objects(m_toView);
+    m_rough.restart(m_toView);
     index.visit(area, [&](const KvDeskObjectIndex::Entry &entry) {
         if (m_lifted.isEmpty() || !m_lifted.contains(entry.object))
-            objects.add(entry.object, entry.rect);
+            m_rough.add(entry.object, entry.rect);
         ++m_drawnObjects;
         return true;
     });
-    objects.draw(painter);
+    m_rough.draw(painter);
 }

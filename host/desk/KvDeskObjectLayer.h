@@ -7,6 +7,7 @@
 #include <QTransform>
 
 #include "KvDeskObjectId.h"
+#include "KvDeskRoughObjects.h"
 
 class KvDeskObjectIndex;
 class QPainter;
@@ -63,4 +64,5 @@ private:
     qint64 m_drawnObjects = 0;
     bool m_isStale = true; ///< all of it is out of date
     bool m_isRough = false;
+    KvDeskRoughObjects m_rough; ///< of the last part that was drawn roughly
 };

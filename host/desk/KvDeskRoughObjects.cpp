@@ -49,11 +49,24 @@ const ZtDrawnObjectData *dataOf(const KvDeskObjectId &object)
 
 } // namespace
 
+void KvDeskRoughObjects::restart(const QTransform &toView)
+{
+    m_toView = toView;
+    m_level.resize(0);
+    m_steep.resize(0);
+    m_long.resize(0);
+}
+
 // There is no turning.
 QRectF KvDeskRoughObjects::onView(const QRectF &rect) const
 {
     return QRectF(rect.x() * m_toView.m11() + m_toView.dx(), rect.y() * m_toView.m22() + m_toView.dy(),
                   rect.width() * m_toView.m11(), rect.height() * m_toView.m22());
+}
+
+QPointF KvDeskRoughObjects::onView(const QPointF &point) const
+{
+    return QPointF(point.x() * m_toView.m11() + m_toView.dx(), point.y() * m_toView.m22() + m_toView.dy());
 }
 
 void KvDeskRoughObjects::add(const KvDeskObjectId &object, const QRectF &rect)
@@ -75,7 +88,7 @@ void KvDeskRoughObjects::add(const KvDeskObjectId &object, const QRectF &rect)
 void KvDeskRoughObjects::addOutline(const ZtDrawnType &type, const QPolygonF &points)
 {
     if (type.id == ZtDrawnType::Line || type.id == ZtDrawnType::ScaleBar)
-        addLine(m_toView.map(points.first()), m_toView.map(points.last()));
+        addLine(onView(points.first()), onView(points.last()));
     else if (type.outline)
         addPath(ZtDrawnManipulator::outlineOf(type, points));
     else
@@ -133,7 +146,7 @@ void KvDeskRoughObjects::addPath(const QPainterPath &path)
 void KvDeskRoughObjects::addMarkers(const QPolygonF &points)
 {
     for (const QPointF &point : points) {
-        const QPointF place = m_toView.map(point);
+        const QPointF place = onView(point);
         addLine(place - QPointF(markerArm, 0.0), place + QPointF(markerArm, 0.0));
         addLine(place - QPointF(0.0, markerArm), place + QPointF(0.0, markerArm));
     }

@@ -25,9 +25,12 @@ class KvDeskRoughObjects
 {
 public:
     /** \a toView from the scene to the view, without turning. */
-    explicit KvDeskRoughObjects(const QTransform &toView)
+    explicit KvDeskRoughObjects(const QTransform &toView = QTransform())
         : m_toView(toView)
     {}
+
+    /** Forgets all objects but keeps their memory: asking for it again at every step takes longer. */
+    void restart(const QTransform &toView);
 
     /** \a rect is the bounding rectangle of the object's outline, in scene coordinates. */
     void add(const KvDeskObjectId &object, const QRectF &rect);
@@ -43,6 +46,7 @@ public:
 
 private:
     QRectF onView(const QRectF &rect) const;
+    QPointF onView(const QPointF &point) const;
     void addLine(const QPointF &from, const QPointF &to);
     void addOutline(const ZtDrawnType &type, const QPolygonF &points);
     void addSpeck(const QPointF &place);
