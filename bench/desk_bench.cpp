@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: MIT
 // What the user waits for on the Desk's image: many objects, large frames. A step counts with the drawing
 // that shows it. Floor: 16 ms for a step, 20 ms for a frame.
+#include "BenchCamera.h"
 #include "KvDeskImageView.h"
 #include "KvDeskObjectEditor.h"
 #include "KvDeskSelection.h"
 #include "KvDeskSession.h"
+#include "ThreadTime.h"
 #include "kernel/ZtKernelData.h"
 #include "measuring/ZtDrawnObjectData.h"
 #include "measuring/ZtDrawnType.h"
@@ -13,10 +15,15 @@
 
 #include <QApplication>
 #include <QPainter>
+#include <QScrollBar>
 
 #include <benchmark/benchmark.h>
 
+#include <algorithm>
+#include <atomic>
+#include <chrono>
 #include <random>
+#include <thread>
 
 namespace {
 
@@ -194,6 +201,97 @@ void zoomStep(benchmark::State &state)
     }
 }
 
+void panStep(benchmark::State &state)
+{
+    Desk desk(static_cast<int>(state.range(0)));
+    desk.view.slotZoomIn();
+    int step = 17;
+    for (auto _ : state) {
+        QScrollBar *const bar = desk.view.horizontalScrollBar();
+        const int before = bar->value();
+        bar->setValue(before + step);
+        if (bar->value() != before + step)
+            step = -step;
+        desk.show();
+    }
+}
+
+using Clock = std::chrono::steady_clock;
+
+/// Stands for a movement of the mouse; knows when it was made.
+class Input : public QEvent
+{
+public:
+    Input()
+        : QEvent(QEvent::User)
+    {}
+    const Clock::time_point made = Clock::now();
+};
+
+/// Makes a hundred inputs per second in a thread of its own, and measures how long each waits for the view.
+class InputProbe : public QObject
+{
+public:
+    explicit InputProbe(QObject *receiver)
+    {
+        receiver->installEventFilter(this);
+        m_hand = std::thread([this, receiver]() {
+            while (!m_isEnded) {
+                QCoreApplication::postEvent(receiver, new Input);
+                std::this_thread::sleep_for(std::chrono::milliseconds(10));
+            }
+        });
+    }
+    ~InputProbe() override
+    {
+        m_isEnded = true;
+        m_hand.join();
+    }
+
+    bool eventFilter(QObject *, QEvent *event) override
+    {
+        if (event->type() != QEvent::User)
+            return false;
+        const double delay =
+            std::chrono::duration<double>(Clock::now() - static_cast<Input *>(event)->made).count();
+        worst = std::max(worst, delay);
+        sum += delay;
+        ++count;
+        return true;
+    }
+
+    double worst = 0.0; ///< seconds
+    double sum = 0.0;
+    int count = 0;
+
+private:
+    std::atomic<bool> m_isEnded{false};
+    std::thread m_hand;
+};
+
+/// A camera of 25 frames per second in the view: what a frame costs this thread, and how long input waits.
+void inputWhileFramesCome(benchmark::State &state)
+{
+    Desk desk(static_cast<int>(state.range(0)));
+    auto source = std::make_unique<BenchCamera>(ZtRawFormat{ZtRawFormat::Mono, 8}, 25.0);
+    BenchCamera *const camera = source.get();
+    desk.document.setFrameSource(std::move(source));
+    camera->start();
+    for (auto _ : state) {
+        InputProbe probe(desk.view.viewport());
+        const double before = ThreadTime::seconds();
+        const Clock::time_point start = Clock::now();
+        while (Clock::now() - start < std::chrono::seconds(3))
+            QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+        state.SetIterationTime(probe.sum / probe.count);
+        state.counters["worst_ms"] = probe.worst * 1e3;
+        state.counters["thread_ms_per_frame"] =
+            (ThreadTime::seconds() - before) * 1e3 / std::max(1.0, 3.0 * camera->frameRate());
+        state.counters["fps"] = camera->frameRate();
+        state.counters["dropped"] = static_cast<double>(camera->droppedFrames());
+    }
+}
+
 } // namespace
 
 BENCHMARK(selectOne)->Arg(1000)->Arg(100000)->Unit(benchmark::kMillisecond);
@@ -203,7 +301,14 @@ BENCHMARK(undoAndRedoOne)->Arg(1000)->Arg(100000)->Unit(benchmark::kMillisecond)
 BENCHMARK(drawAndRemoveOne)->Arg(1000)->Arg(100000)->Unit(benchmark::kMillisecond);
 BENCHMARK(liveFrame)->Arg(0)->Arg(1000)->Arg(100000)->Unit(benchmark::kMillisecond);
 BENCHMARK(liveFrameWhileDragging)->Arg(1000)->Unit(benchmark::kMillisecond);
-BENCHMARK(zoomStep)->Arg(1000)->Arg(100000)->Unit(benchmark::kMillisecond);
+BENCHMARK(inputWhileFramesCome)
+    ->Arg(0)
+    ->Arg(1000)
+    ->UseManualTime()
+    ->Iterations(1)
+    ->Unit(benchmark::kMillisecond);
+BENCHMARK(panStep)->Arg(1000)->Arg(100000)->Unit(benchmark::kMillisecond);
+BENCHMARK(zoomStep)->Arg(0)->Arg(1000)->Arg(100000)->Unit(benchmark::kMillisecond);
 
 int main(int argc, char **argv)
 {

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "KvDeskHalvedImage.h"
+
 #include <QImage>
 #include <QRectF>
 
@@ -30,10 +32,11 @@ public:
     void draw(QPainter *painter, const QRectF &exposed, double scale) const;
 
 private:
-    const QImage &imageFor(double pixelScale) const;
+    const QImage &imageFor(int reduction) const;
 
     QImage m_image;
     QRectF m_sceneRect;
-    mutable QImage m_reduced; ///< the picture at half, a quarter, ... of its size; made when drawn
+    mutable KvDeskHalvedImage m_halved;
+    mutable QImage m_reduced; ///< of m_halved; made when drawn, and given up before the next one is made
     mutable int m_reduction = 0;
 };

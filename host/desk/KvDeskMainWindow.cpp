@@ -11,6 +11,7 @@
 #include "KvDeskFileCommands.h"
 #include "KvDeskGallery.h"
 #include "KvDeskImageView.h"
+#include "KvDeskInlineEditor.h"
 #include "KvDeskLiveBar.h"
 #include "KvDeskObjectEditor.h"
 #include "KvDeskRecentFiles.h"
@@ -418,6 +419,8 @@ void KvDeskMainWindow::closeEvent(QCloseEvent *event)
 {
     if (m_isClosed)
         return;
+    // What is being written on the image is not lost with the field.
+    m_imageView->inlineEditor()->slotAccept();
     if (!m_files->maybeSave() || !closeOtherWindows()) {
         event->ignore();
         return;

@@ -60,7 +60,7 @@ void KvDeskObjectIndex::set(const KvDeskObjectId &object, const QRectF &rect)
     remove(object);
     m_rects.insert(object, rect);
     const int level = levelOf(rect);
-    m_grids[level][cellOf(rect.center(), level)].append(object);
+    m_grids[level][cellOf(rect.center(), level)].append({object, rect});
     if (m_areBoundsKnown)
         m_bounds = united(m_bounds, rect);
 }
@@ -82,7 +82,8 @@ void KvDeskObjectIndex::take(const KvDeskObjectId &object, const QRectF &rect)
     const auto grid = m_grids.find(level);
     const auto cell = grid->find(cellOf(rect.center(), level));
     const int last = cell->size() - 1;
-    cell->swapItemsAt(cell->indexOf(object), last);
+    const auto isIt = [&object](const Entry &entry) { return entry.object == object; };
+    std::swap(*std::find_if(cell->begin(), cell->end(), isIt), (*cell)[last]);
     cell->removeLast();
     if (cell->isEmpty())
         grid->erase(cell);
@@ -106,40 +107,47 @@ QRectF KvDeskObjectIndex::bounds() const
     return m_bounds;
 }
 
-void KvDeskObjectIndex::collect(const QVector<KvDeskObjectId> &cell, const QRectF &area,
-                                QVector<KvDeskObjectId> *found) const
+bool KvDeskObjectIndex::visitCell(const QVector<Entry> &cell, const QRectF &area, const Visitor &visitor)
 {
-    for (const KvDeskObjectId &object : cell) {
-        if (touch(m_rects.value(object), area))
-            found->append(object);
-    }
+    return std::all_of(cell.begin(), cell.end(),
+                       [&](const Entry &entry) { return !touch(entry.rect, area) || visitor(entry); });
 }
 
-void KvDeskObjectIndex::collect(const Grid &grid, int level, const QRectF &area, int limit,
-                                QVector<KvDeskObjectId> *found) const
+bool KvDeskObjectIndex::visitGrid(const Grid &grid, int level, const QRectF &area, const Visitor &visitor)
 {
     // The centre of what touches the area lies at most half a cell beside it.
     const double size = cellSize(level);
     const QRectF reach = grown(area, 0.5 * size);
     const double cells = (reach.width() / size + 2.0) * (reach.height() / size + 2.0);
-    if (cells > grid.size()) {
-        for (auto cell = grid.constBegin(); cell != grid.constEnd() && found->size() < limit; ++cell)
-            collect(*cell, area, found);
-        return;
-    }
+    if (cells > grid.size())
+        return std::all_of(grid.begin(), grid.end(),
+                           [&](const QVector<Entry> &cell) { return visitCell(cell, area, visitor); });
     const Cell first = cellOf(reach.topLeft(), level);
     const Cell last = cellOf(reach.bottomRight(), level);
-    for (int row = first.row; row <= last.row && found->size() < limit; ++row) {
-        for (int column = first.column; column <= last.column; ++column)
-            collect(grid.value({column, row}), area, found);
+    for (int row = first.row; row <= last.row; ++row) {
+        for (int column = first.column; column <= last.column; ++column) {
+            if (!visitCell(grid.value({column, row}), area, visitor))
+                return false;
+        }
+    }
+    return true;
+}
+
+void KvDeskObjectIndex::visit(const QRectF &area, const Visitor &visitor) const
+{
+    for (auto grid = m_grids.constBegin(); grid != m_grids.constEnd(); ++grid) {
+        if (!visitGrid(*grid, grid.key(), area, visitor))
+            return;
     }
 }
 
 QVector<KvDeskObjectId> KvDeskObjectIndex::objectsIn(const QRectF &area, int limit) const
 {
     QVector<KvDeskObjectId> found;
-    for (auto grid = m_grids.constBegin(); grid != m_grids.constEnd() && found.size() < limit; ++grid)
-        collect(*grid, grid.key(), area, limit, &found);
+    visit(area, [&](const Entry &entry) {
+        found.append(entry.object);
+        return found.size() < limit;
+    });
     std::sort(found.begin(), found.end());
     return found;
 }

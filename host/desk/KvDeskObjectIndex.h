@@ -6,6 +6,7 @@
 #include <QRectF>
 #include <QVector>
 
+#include <functional>
 #include <limits>
 
 /**
@@ -17,6 +18,13 @@
 class KvDeskObjectIndex
 {
 public:
+    /** An object and the rectangle in which it lies. */
+    struct Entry
+    {
+        KvDeskObjectId object;
+        QRectF rect;
+    };
+
     /** Adds an object or moves it. The rectangle may be empty, as that of a point or a level line is. */
     void set(const KvDeskObjectId &object, const QRectF &rect);
     void remove(const KvDeskObjectId &object);
@@ -31,6 +39,10 @@ public:
     /** The objects whose rectangles touch \a area, in the order in which they are drawn. Once \a limit of
      * them are found, the search may end. */
     QVector<KvDeskObjectId> objectsIn(const QRectF &area, int limit = std::numeric_limits<int>::max()) const;
+
+    /** Shows the same to \a visitor, in any order, which is quicker where there are many; until it returns
+     * false. */
+    void visit(const QRectF &area, const std::function<bool(const Entry &)> &visitor) const;
 
     /** Whether two rectangles have a point in common; borders belong to them. */
     static bool touch(const QRectF &a, const QRectF &b);
@@ -50,16 +62,16 @@ private:
                            seed);
         }
     };
-    using Grid = QHash<Cell, QVector<KvDeskObjectId>>;
+    using Grid = QHash<Cell, QVector<Entry>>;
 
     static int levelOf(const QRectF &rect);
     static double cellSize(int level);
     static Cell cellOf(const QPointF &point, int level);
     void take(const KvDeskObjectId &object, const QRectF &rect);
-    void collect(const QVector<KvDeskObjectId> &cell, const QRectF &area,
-                 QVector<KvDeskObjectId> *found) const;
-    void collect(const Grid &grid, int level, const QRectF &area, int limit,
-                 QVector<KvDeskObjectId> *found) const;
+    using Visitor = std::function<bool(const Entry &)>;
+
+    static bool visitCell(const QVector<Entry> &cell, const QRectF &area, const Visitor &visitor);
+    static bool visitGrid(const Grid &grid, int level, const QRectF &area, const Visitor &visitor);
 
     QHash<KvDeskObjectId, QRectF> m_rects;
     QHash<int, Grid> m_grids; ///< by level

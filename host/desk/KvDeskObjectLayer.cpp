@@ -2,6 +2,8 @@
 #include "KvDeskObjectLayer.h"
 
 #include "KvDeskObjectIndex.h"
+#include "kernel/ZtKernelData.h"
+#include "measuring/ZtDrawnObjectData.h"
 #include "measuring/ZtObjectsPainter.h"
 
 #include <QPainter>
@@ -11,11 +13,19 @@
 namespace {
 
 constexpr int lineRoom = 9;        ///< pixels by which lines and markers reach beyond an object's bounds
+constexpr double roughStays = 0.8; ///< of the most objects in full
 constexpr int mostRectangles = 48; ///< beyond that it is quicker to draw everything between them, too
 
 bool isWhole(double number)
 {
     return std::abs(number - std::round(number)) < 1e-6;
+}
+
+int pointCount(const KvDeskObjectId &object)
+{
+    const auto *const data =
+        dynamic_cast<const ZtDrawnObjectData *>(ZtKernelData::getInstance()->object(object.type, object.id));
+    return data ? data->points().size() : 0;
 }
 
 } // namespace
@@ -89,6 +99,8 @@ void KvDeskObjectLayer::draw(QPainter *painter, const KvDeskObjectIndex &index, 
                              const QSize &size, double pixelRatio)
 {
     prepare(toView, size, pixelRatio);
+    if (!m_dirty.isEmpty())
+        chooseRoughness(index);
     for (const QRect &rect : m_dirty)
         redraw(index, rect);
     m_dirty = QRegion();
@@ -96,6 +108,34 @@ void KvDeskObjectLayer::draw(QPainter *painter, const KvDeskObjectIndex &index, 
     painter->setWorldTransform(QTransform());
     painter->drawImage(QPointF(), m_image);
     painter->restore();
+}
+
+// The part of the scene whose objects may be seen in a rectangle of the view.
+QRectF KvDeskObjectLayer::areaOf(const QRectF &rect) const
+{
+    return m_toView.inverted().mapRect(rect.adjusted(-lineRoom, -lineRoom, lineRoom, lineRoom));
+}
+
+void KvDeskObjectLayer::chooseRoughness(const KvDeskObjectIndex &index)
+{
+    const QRectF view(QPointF(), QSizeF(m_image.size()) / m_image.devicePixelRatio());
+    // What is drawn anew anyway is drawn in full where that is quick enough. Else a rough picture stays until
+    // there is clearly less to see: one object that comes and goes would change all of it each time.
+    const bool isAnew = m_dirty.boundingRect().contains(view.toRect()) && m_dirty.rectCount() == 1;
+    const double share = m_isRough && !isAnew ? roughStays : 1.0;
+    const int mostObjects = qRound(share * mostInFull);
+    const int mostPoints = qRound(share * mostPointsInFull);
+    int objects = 0;
+    int points = 0;
+    index.visit(areaOf(view), [&](const KvDeskObjectIndex::Entry &entry) {
+        ++objects;
+        points += pointCount(entry.object);
+        return objects <= mostObjects && points <= mostPoints;
+    });
+    const bool isRough = objects > mostObjects || points > mostPoints;
+    if (isRough != m_isRough)
+        m_dirty = view.toAlignedRect();
+    m_isRough = isRough;
 }
 
 void KvDeskObjectLayer::redraw(const KvDeskObjectIndex &index, const QRect &rect)
@@ -106,12 +146,30 @@ void KvDeskObjectLayer::redraw(const KvDeskObjectIndex &index, const QRect &rect
     painter.fillRect(rect, Qt::transparent);
     painter.setCompositionMode(QPainter::CompositionMode_SourceOver);
     painter.setWorldTransform(m_toView);
-    const QRectF area =
-        m_toView.inverted().mapRect(QRectF(rect).adjusted(-lineRoom, -lineRoom, lineRoom, lineRoom));
+    if (m_isRough)
+        drawRoughly(&painter, index, areaOf(rect));
+    else
+        drawInFull(&painter, index, areaOf(rect));
+}
+
+void KvDeskObjectLayer::drawInFull(QPainter *painter, const KvDeskObjectIndex &index, const QRectF &area)
+{
     for (const KvDeskObjectId &object : index.objectsIn(area)) {
         if (m_lifted.contains(object))
             continue;
-        ZtObjectsPainter::drawShape(&painter, {object.type, object.id});
+        ZtObjectsPainter::drawShape(painter, {object.type, object.id});
         ++m_drawnObjects;
     }
+}
+
+void KvDeskObjectLayer::drawRoughly(QPainter *painter, const KvDeskObjectIndex &index, const QRectF &area)
+{
+    m_rough.restart(m_toView);
+    index.visit(area, [&](const KvDeskObjectIndex::Entry &entry) {
+        if (m_lifted.isEmpty() || !m_lifted.contains(entry.object))
+            m_rough.add(entry.object, entry.rect);
+        ++m_drawnObjects;
+        return true;
+    });
+    m_rough.draw(painter);
 }

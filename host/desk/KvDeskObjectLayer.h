@@ -7,6 +7,7 @@
 #include <QTransform>
 
 #include "KvDeskObjectId.h"
+#include "KvDeskRoughObjects.h"
 
 class KvDeskObjectIndex;
 class QPainter;
@@ -14,6 +15,10 @@ class QPainter;
 /**
  * The picture of all objects as they lie in the view, kept from one frame to the next: only what changed is
  * drawn again, and when the view moves only what comes into sight.
+ *
+ * Where very many objects are in view they are drawn roughly, see KvDeskRoughObjects. They stay so while the
+ * user pauses: drawing them in full would take seconds of this thread, and nobody could tell one line from
+ * the other.
  */
 class KvDeskObjectLayer
 {
@@ -35,13 +40,22 @@ public:
     void draw(QPainter *painter, const KvDeskObjectIndex &index, const QTransform &toView, const QSize &size,
               double pixelRatio);
 
+    /** With more objects in view, or more points of them, they are drawn roughly. */
+    static constexpr int mostInFull = 1000;
+    static constexpr int mostPointsInFull = 10000;
+    bool isRough() const { return m_isRough; }
+
     /** Objects drawn since the layer was made, to count the work. */
     qint64 drawnObjects() const { return m_drawnObjects; }
 
 private:
     void prepare(const QTransform &toView, const QSize &size, double pixelRatio);
     bool scroll(const QTransform &toView);
+    void chooseRoughness(const KvDeskObjectIndex &index);
+    QRectF areaOf(const QRectF &rect) const;
     void redraw(const KvDeskObjectIndex &index, const QRect &rect);
+    void drawInFull(QPainter *painter, const KvDeskObjectIndex &index, const QRectF &area);
+    void drawRoughly(QPainter *painter, const KvDeskObjectIndex &index, const QRectF &area);
 
     QImage m_image;
     QTransform m_toView;
@@ -49,4 +63,6 @@ private:
     QSet<KvDeskObjectId> m_lifted;
     qint64 m_drawnObjects = 0;
     bool m_isStale = true; ///< all of it is out of date
+    bool m_isRough = false;
+    KvDeskRoughObjects m_rough; ///< of the last part that was drawn roughly
 };

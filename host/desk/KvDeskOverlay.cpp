@@ -2,7 +2,9 @@
 #include "KvDeskOverlay.h"
 
 #include "KvDeskObjectShape.h"
+#include "KvDeskRoughObjects.h"
 #include "KvDeskSelection.h"
+#include "gui/QtAdvancedStylesheet.h"
 #include "kernel/ZtKernelData.h"
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtObjectsPainter.h"
@@ -133,16 +135,34 @@ void KvDeskOverlay::drawTop(const QTransform &toView, const QSize &size)
     const QRectF page(QPointF(), size);
     const QRectF area = toView.inverted().mapRect(page.adjusted(-lineRoom, -lineRoom, lineRoom, lineRoom));
     const QVector<KvDeskObjectId> selected = selectedIn(area);
-    for (const KvDeskObjectId &object : selected)
-        shapeOf(object).drawHighlight(&painter);
-    for (const KvDeskObjectId &object : selected)
-        ZtObjectsPainter::drawShape(&painter, {object.type, object.id});
+    if (selected.size() > KvDeskObjectLayer::mostInFull)
+        drawSelectedRoughly(&painter, selected);
+    else
+        drawSelected(&painter, selected);
     if (!m_painter)
         return;
     QVector<ZtObjectsPainter::Object> labelled;
     for (const KvDeskObjectId &object : labelledIn(area, selected))
         labelled.append({object.type, object.id});
     ZtObjectsPainter::drawLabels(&painter, m_painter->labels(labelled, toView, page));
+}
+
+void KvDeskOverlay::drawSelected(QPainter *painter, const QVector<KvDeskObjectId> &selected) const
+{
+    for (const KvDeskObjectId &object : selected)
+        shapeOf(object).drawHighlight(painter);
+    for (const KvDeskObjectId &object : selected)
+        ZtObjectsPainter::drawShape(painter, {object.type, object.id});
+}
+
+void KvDeskOverlay::drawSelectedRoughly(QPainter *painter, const QVector<KvDeskObjectId> &selected) const
+{
+    KvDeskRoughObjects objects(painter->worldTransform());
+    for (const KvDeskObjectId &object : selected)
+        objects.add(object, m_places.index().rect(object));
+    const auto *const style = acss::QtAdvancedStylesheet::getInstance();
+    objects.draw(painter, style->color(QStringLiteral("accent-hover")),
+                 style->color(QStringLiteral("on-accent")));
 }
 
 QVector<KvDeskObjectId> KvDeskOverlay::selectedIn(const QRectF &area) const
@@ -167,10 +187,23 @@ QVector<KvDeskObjectId> KvDeskOverlay::labelledIn(const QRectF &area,
     QVector<KvDeskObjectId> result = selected;
     if (others.size() > most) {
         result.resize(qMin(result.size(), mostSelectedLabels));
-        others = objectsOf(ZtDrawnType::TextNote) + objectsOf(ZtDrawnType::ScaleBar);
+        others = textsIn(area);
     }
     for (const KvDeskObjectId &object : qAsConst(others)) {
         if (!m_selection || !m_selection->contains(object))
+            result.append(object);
+    }
+    return result;
+}
+
+// Texts and scale bars, but no more than anybody reads.
+QVector<KvDeskObjectId> KvDeskOverlay::textsIn(const QRectF &area) const
+{
+    const KvDeskObjectIndex &index = m_places.index();
+    QVector<KvDeskObjectId> result;
+    for (const KvDeskObjectId &object : objectsOf(ZtDrawnType::TextNote) + objectsOf(ZtDrawnType::ScaleBar)) {
+        if (result.size() < ZtObjectsPainter::maximumLabels && index.contains(object) &&
+            KvDeskObjectIndex::touch(index.rect(object), area))
             result.append(object);
     }
     return result;

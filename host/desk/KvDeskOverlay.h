@@ -45,8 +45,11 @@ private:
     bool isLiftable(const KvDeskObjectId &object) const;
     void settle();
     void drawTop(const QTransform &toView, const QSize &size);
+    void drawSelected(QPainter *painter, const QVector<KvDeskObjectId> &selected) const;
+    void drawSelectedRoughly(QPainter *painter, const QVector<KvDeskObjectId> &selected) const;
     QVector<KvDeskObjectId> selectedIn(const QRectF &area) const;
     QVector<KvDeskObjectId> labelledIn(const QRectF &area, const QVector<KvDeskObjectId> &selected) const;
+    QVector<KvDeskObjectId> textsIn(const QRectF &area) const;
 
     KvDeskObjectPlaces m_places;
     KvDeskObjectLayer m_objects;

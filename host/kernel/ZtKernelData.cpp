@@ -83,6 +83,7 @@ void ZtKernelData::registerType(int type, std::unique_ptr<ZtGsManipulator> manip
 
 void ZtKernelData::unregisterType(int type)
 {
+    ++m_revision;
     const ZtObjectMap objects = m_objects.take(type);
     qDeleteAll(objects);
     m_manipulators.erase(type);
@@ -106,6 +107,7 @@ int ZtKernelData::addObject(int type, std::unique_ptr<ZtKernelObjectData> object
         objects.insert(objects.constEnd(), id, added);
     else
         objects.insert(id, added);
+    ++m_revision;
     if (m_blockers == 0)
         emit ZtSignalCenter::getInstance()->signalObjectCreated(type, id, added);
     return id;
@@ -121,6 +123,7 @@ bool ZtKernelData::removeObject(int type, int id)
     const std::unique_ptr<ZtKernelObjectData> removed(objects->take(id));
     if (objects->isEmpty())
         m_objects.erase(objects);
+    ++m_revision;
     if (ZtGsManipulator *const manipulator = getGsManipulator(type))
         manipulator->setObjectName(id, QString());
     if (m_blockers == 0)
@@ -130,6 +133,7 @@ bool ZtKernelData::removeObject(int type, int id)
 
 void ZtKernelData::notifyObjectChanged(int type, int id) const
 {
+    ++m_revision;
     const ZtKernelObjectData *const changed = object(type, id);
     if (changed != nullptr && m_blockers == 0)
         emit ZtSignalCenter::getInstance()->signalObjectChanged(type, id, changed);

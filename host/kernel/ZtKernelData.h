@@ -66,6 +66,10 @@ public:
     /** Removes all objects of all types, emitting a removal for each. Types stay registered. */
     void clearObjects();
 
+    /** Another number after every change of objects, announced or not; the change counts before anybody hears
+     * of it. For whoever keeps what was computed of many objects. */
+    quint64 revision() const { return m_revision; }
+
     /** While at least one blocker lives, object changes are not announced (bulk loads). */
     class ZT_KERNEL_EXPORT SignalBlocker
     {
@@ -86,5 +90,6 @@ private:
     std::map<int, std::unique_ptr<ZtKernelObjectDataDescr>> m_descriptors;
     iZTKernelImage *m_image = nullptr;
     const iZTObjectPainter *m_objectPainter = nullptr;
+    mutable quint64 m_revision = 0; ///< announcing a change leaves the data as they are
     int m_blockers = 0;
 };

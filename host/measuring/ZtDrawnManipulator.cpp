@@ -16,16 +16,6 @@ const ZtDrawnObjectData &drawn(const ZtKernelObjectData *object)
     return *static_cast<const ZtDrawnObjectData *>(object);
 }
 
-// A counter's count in percent of all counters' counts; 0 where nothing was counted.
-double countShare(const ZtDrawnObjectData &counter)
-{
-    double total = 0.0;
-    const ZtObjectMap counters = ZtKernelData::getInstance()->objects().value(ZtDrawnType::Counter);
-    for (const ZtKernelObjectData *other : counters)
-        total += drawn(other).points().size();
-    return total > 0.0 ? counter.points().size() * 100.0 / total : 0.0;
-}
-
 // Lengths and areas have no unit known to the statistics as long as they are in pixels.
 int effectiveKind(const ZtDrawnValue &definition, const ZtCalibration &calibration)
 {
@@ -43,6 +33,28 @@ ZtDrawnManipulator::ZtDrawnManipulator(const ZtDrawnType &type,
     , m_calibration(std::move(calibration))
     , m_typeName(type.displayName())
 {}
+
+// In percent; 0 where nothing was counted.
+double ZtDrawnManipulator::countShare(const ZtDrawnObjectData &counter) const
+{
+    const double total = countOfAll();
+    return total > 0.0 ? counter.points().size() * 100.0 / total : 0.0;
+}
+
+// Kept until any object changes: whoever shows all counters asks for the share of each of them.
+double ZtDrawnManipulator::countOfAll() const
+{
+    const ZtKernelData *const kernel = ZtKernelData::getInstance();
+    if (m_isCountKnown && m_countRevision == kernel->revision())
+        return m_countOfAll;
+    m_isCountKnown = true;
+    m_countRevision = kernel->revision();
+    m_countOfAll = 0.0;
+    const ZtObjectMap counters = kernel->objects().value(ZtDrawnType::Counter);
+    for (const ZtKernelObjectData *other : counters)
+        m_countOfAll += drawn(other).points().size();
+    return m_countOfAll;
+}
 
 void ZtDrawnManipulator::retranslate()
 {

@@ -51,8 +51,13 @@ private:
     double inBaseUnits(const ZtDrawnValue &definition, const ZtDrawnObjectData &object) const;
     QString firstValueText(const ZtDrawnObjectData &object) const;
     QString lengthText(const ZtDrawnObjectData &object) const;
+    double countShare(const ZtDrawnObjectData &counter) const;
+    double countOfAll() const;
 
     const ZtDrawnType &m_type;
     std::shared_ptr<const ZtCalibration> m_calibration;
     QString m_typeName;
+    mutable double m_countOfAll = 0.0;   ///< places of all counters
+    mutable quint64 m_countRevision = 0; ///< of the kernel's objects when they were counted
+    mutable bool m_isCountKnown = false;
 };

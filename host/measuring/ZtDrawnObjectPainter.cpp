@@ -18,8 +18,6 @@ constexpr int labelPixelSize = 13;
 constexpr double labelPadding = 3.0;
 constexpr double labelOffset = 6.0;
 
-const QColor haloColor(20, 20, 20, 190);
-const QColor lineColor(255, 214, 64);
 const QColor labelColor(255, 255, 255);
 
 // Not cosmetic, as such pens are thin on screens with more than one pixel per device-independent one.
@@ -36,6 +34,16 @@ QFont labelFont()
 }
 
 } // namespace
+
+QColor ZtDrawnObjectPainter::lineColor()
+{
+    return QColor(255, 214, 64);
+}
+
+QColor ZtDrawnObjectPainter::haloColor()
+{
+    return QColor(20, 20, 20, 190);
+}
 
 void ZtDrawnObjectPainter::drawOutline(const QPainterPath &path) const
 {
@@ -61,9 +69,9 @@ void ZtDrawnObjectPainter::strokeOnDevice(const QPainterPath &path) const
     m_painter->setWorldTransform(QTransform());
     m_painter->setRenderHint(QPainter::Antialiasing);
     m_painter->setBrush(Qt::NoBrush);
-    m_painter->setPen(linePen(haloColor, haloWidth));
+    m_painter->setPen(linePen(haloColor(), haloWidth));
     m_painter->drawPath(path);
-    m_painter->setPen(linePen(lineColor, lineWidth));
+    m_painter->setPen(linePen(lineColor(), lineWidth));
     m_painter->drawPath(path);
     m_painter->restore();
 }
@@ -101,7 +109,7 @@ void ZtDrawnObjectPainter::drawLabelBox(const QRectF &box, const QString &text) 
     m_painter->setRenderHint(QPainter::Antialiasing);
     m_painter->setFont(labelFont());
     m_painter->setPen(Qt::NoPen);
-    m_painter->setBrush(haloColor);
+    m_painter->setBrush(haloColor());
     m_painter->drawRoundedRect(box, labelPadding, labelPadding);
     m_painter->setPen(labelColor);
     const QRectF inside = box.adjusted(labelPadding, labelPadding, -labelPadding, -labelPadding);

@@ -3,6 +3,7 @@
 
 #include "measuring/ZtMeasuringGlobal.h"
 
+class QColor;
 class QPainter;
 class QPainterPath;
 class QPointF;
@@ -32,6 +33,11 @@ public:
     /** A text in a dark box, its lower left corner near \a anchor; moved so that it stays on the device when
      * \a anchor is on it. */
     void drawLabel(const QPointF &anchor, const QString &text) const;
+
+    /** The colours of an outline and of the dark line below it, as in full so where objects are drawn with
+     * less care. */
+    static QColor lineColor();
+    static QColor haloColor();
 
     /** What a painter can reach, in the coordinates that it has without a transform. */
     static QRectF page(const QPainter &painter);

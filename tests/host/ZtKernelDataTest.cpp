@@ -63,6 +63,7 @@ class ZtKernelDataTest : public StatReportTest
     Q_OBJECT
 
 private slots:
+    void revisionCountsEveryChange();
     void init();
     void cleanup();
     void isTheSameForAll();
@@ -313,6 +314,28 @@ void ZtKernelDataTest::keepsTheImage()
     SilentImage image;
     m_kernel->setKernelImage(&image);
     QVERIFY(m_kernel->kernelImage() == &image);
+}
+
+void ZtKernelDataTest::revisionCountsEveryChange()
+{
+    ZtKernelData *const kernel = ZtKernelData::getInstance();
+    registerFakeType(7);
+    QVector<quint64> seen{kernel->revision()};
+    const auto isChange = [&]() {
+        seen.append(kernel->revision());
+        return seen.count(seen.last()) == 1;
+    };
+    QVERIFY(add(7) > 0 && isChange());
+    kernel->notifyObjectChanged(7, 1);
+    QVERIFY(isChange());
+    {
+        const ZtKernelData::SignalBlocker blocker;
+        QVERIFY(add(7) > 0 && isChange());
+        QVERIFY(kernel->removeObject(7, 2) && isChange());
+    }
+    QVERIFY(!kernel->removeObject(7, 2) && !isChange());
+    kernel->unregisterType(7);
+    QVERIFY(isChange());
 }
 
 STATREPORT_TEST_MAIN(ZtKernelDataTest)

@@ -2,6 +2,7 @@
 #include "KvDeskMainWindow.h"
 
 #include "DeskFiles.h"
+#include "FakeCamera.h"
 #include "GalleryFolder.h"
 #include "KvDeskActions.h"
 #include "KvDeskAutosave.h"
@@ -11,7 +12,9 @@
 #include "KvDeskGallerySettings.h"
 #include "KvDeskGalleryView.h"
 #include "KvDeskImageView.h"
+#include "KvDeskInlineEditor.h"
 #include "KvDeskLiveBar.h"
+#include "KvDeskObjectEditor.h"
 #include "KvDeskPanelHeader.h"
 #include "KvDeskRecentFiles.h"
 #include "KvDeskRecoveryBar.h"
@@ -32,9 +35,14 @@
 #include "kernel/ZtAppSettings.h"
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtDrawnType.h"
+#include "measuring/ZtFault.h"
 #include "measuring/ZtFrameSourceCatalogue.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "support/MessageBoxAnswerer.h"
+
+#include <QLineEdit>
+
+#include <functional>
 
 namespace {
 
@@ -68,6 +76,33 @@ bool drop(QWidget *window, const QList<QUrl> &urls)
 }
 
 } // namespace
+
+namespace {
+
+using Work = std::function<void(KvDeskMainWindow *)>;
+
+/// Clicks at the middle of the image, shifted by so many pixels.
+void click(KvDeskMainWindow *window, const QPoint &shift)
+{
+    QWidget *const viewport = window->imageView()->viewport();
+    QTest::mouseClick(viewport, Qt::LeftButton, Qt::NoModifier, viewport->rect().center() + shift);
+}
+
+void choose(KvDeskMainWindow *window, KvDeskActions::Id tool)
+{
+    window->actions()->action(tool)->trigger();
+}
+
+void makeHistory(KvDeskMainWindow *window)
+{
+    for (int i = 0; i < 3; ++i)
+        window->objectEditor()->create(ZtDrawnType::Line, diagonal);
+    window->objectEditor()->slotUndo();
+}
+
+} // namespace
+
+Q_DECLARE_METATYPE(Work)
 
 class KvDeskMainWindowTest : public StatReportTest
 {
@@ -114,6 +149,9 @@ private slots:
     void toggledTheme();
     void everyButtonIsExplained();
     void fitsIntoSmallScreens();
+    void endsInTheMiddleOfAnything_data();
+    void endsInTheMiddleOfAnything();
+    void whatIsBeingWrittenIsKept();
 
 private:
     void open();
@@ -652,6 +690,110 @@ void KvDeskMainWindowTest::fitsIntoSmallScreens()
     open();
     QVERIFY(m_window->minimumSizeHint().width() <= 1024);
     QVERIFY(m_window->minimumSizeHint().height() <= 640);
+}
+
+void KvDeskMainWindowTest::endsInTheMiddleOfAnything_data()
+{
+    QTest::addColumn<bool>("isClosedFirst");
+    QTest::addColumn<Work>("work");
+    const auto row = [](const char *name, const Work &work) {
+        QTest::addRow("%s, closed", name) << true << work;
+        QTest::addRow("%s, deleted at once", name) << false << work;
+    };
+    row("history", [](KvDeskMainWindow *w) { makeHistory(w); });
+    row("running source", [](KvDeskMainWindow *w) {
+        auto camera = std::make_unique<FakeCamera>();
+        FakeCamera *const running = camera.get();
+        w->session()->showSource(std::move(camera));
+        running->start();
+        running->deliver();
+        QTRY_COMPARE(w->imageView()->frame().image().size(), QSize(7, 5));
+        running->deliver(Qt::blue); // still on its way
+    });
+    row("open plug-in panel", [](KvDeskMainWindow *w) {
+        auto *const tool = new KvToolBase(w, QIcon(), QStringLiteral("A"), QStringLiteral("a"), true);
+        tool->setGuiWidget(new QLineEdit);
+        tool->guiWidget()->setFocus();
+        makeHistory(w);
+    });
+    row("half-drawn line", [](KvDeskMainWindow *w) {
+        choose(w, KvDeskActions::LineTool);
+        click(w, QPoint());
+    });
+    row("half-drawn polygon", [](KvDeskMainWindow *w) {
+        choose(w, KvDeskActions::PolygonTool);
+        click(w, QPoint());
+        click(w, QPoint(40, 0));
+        click(w, QPoint(40, 40));
+    });
+    row("object being dragged", [](KvDeskMainWindow *w) {
+        makeHistory(w);
+        QWidget *const viewport = w->imageView()->viewport();
+        const QPoint place = w->imageView()->viewportTransform().map(QPointF(5, 5)).toPoint();
+        QTest::mousePress(viewport, Qt::LeftButton, Qt::NoModifier, place);
+        QMouseEvent move(QEvent::MouseMove, QPointF(place + QPoint(30, 10)), Qt::NoButton, Qt::LeftButton,
+                         Qt::NoModifier);
+        QApplication::sendEvent(viewport, &move);
+    });
+    row("name being written", [](KvDeskMainWindow *w) {
+        makeHistory(w);
+        w->imageView()->inlineEditor()->rename({ZtDrawnType::Line, 1});
+        QTest::keyClicks(w->imageView()->inlineEditor(), QStringLiteral("Edge"));
+    });
+    row("note being written", [](KvDeskMainWindow *w) {
+        choose(w, KvDeskActions::NoteTool);
+        click(w, QPoint());
+        QTest::keyClicks(w->imageView()->inlineEditor(), QStringLiteral("Look"));
+    });
+    row("counting", [](KvDeskMainWindow *w) {
+        choose(w, KvDeskActions::CounterTool);
+        click(w, QPoint());
+        click(w, QPoint(30, 0));
+    });
+    row("calibrating", [](KvDeskMainWindow *w) {
+        w->files()->openImage(DeskFiles::image(QStringLiteral("calibrated.png"), QSize(400, 300)));
+        w->objectEditor()->setCalibration(ZtCalibration(3.0));
+        makeHistory(w);
+    });
+}
+
+void KvDeskMainWindowTest::endsInTheMiddleOfAnything()
+{
+    QFETCH(bool, isClosedFirst);
+    QFETCH(Work, work);
+    QVERIFY(m_window->files()->openImage(DeskFiles::image(QStringLiteral("ended.png"), QSize(400, 300))));
+    m_window->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    work(m_window.get());
+    if (isClosedFirst) {
+        MessageBoxAnswerer answerer(QMessageBox::Discard);
+        QVERIFY(m_window->close());
+    }
+    const QPointer<KvDeskObjectEditor> editor = m_window->objectEditor();
+    const int objects = m_window->session()->objectCount();
+    m_window.reset();
+    QVERIFY(!editor);
+    QCoreApplication::processEvents();
+    // The end of the window changes nothing of what was measured, and the document goes on without it.
+    QCOMPARE(KvDeskSession(m_document.get()).objectCount(), objects);
+    QVERIFY(m_document->addObject(ZtDrawnType::Line, diagonal) > 0);
+    m_document->setCalibration(ZtCalibration(4.0));
+    m_document->clear();
+}
+
+void KvDeskMainWindowTest::whatIsBeingWrittenIsKept()
+{
+    QVERIFY(m_window->files()->openImage(DeskFiles::image(QStringLiteral("noted.png"), QSize(400, 300))));
+    ZtFault fault;
+    QVERIFY(m_window->session()->save(temporaryPath(QStringLiteral("noted.json")), &fault));
+    choose(m_window.get(), KvDeskActions::NoteTool);
+    click(m_window.get(), QPoint());
+    QTest::keyClicks(m_window->imageView()->inlineEditor(), QStringLiteral("Look"));
+    MessageBoxAnswerer answerer(QMessageBox::Cancel);
+    QVERIFY(!m_window->close());
+    QCOMPARE(answerer.boxes().size(), 1);
+    QCOMPARE(m_window->session()->objectCount(), 1);
+    QVERIFY(m_window->isWindowModified());
 }
 
 STATREPORT_TEST_MAIN(KvDeskMainWindowTest)

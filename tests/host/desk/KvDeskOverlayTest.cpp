@@ -2,6 +2,7 @@
 #include "KvDeskOverlay.h"
 
 #include "DeskView.h"
+#include "gui/QtAdvancedStylesheet.h"
 #include "image/ZtImage.h"
 #include "kernel/ZtImageTools.h"
 #include "measuring/ZtObjectsPainter.h"
@@ -27,6 +28,8 @@ private slots:
     void burntPictureIsWhatTheScreenShows();
     void labelsAreHiddenWhereCrowded();
     void labelsCanBeHidden();
+    void manySelectedObjectsAreRough();
+    void noMoreTextsThanAnybodyReads();
 
 private:
     static QImage draw(KvDeskOverlay *overlay, const QTransform &toView, double ratio = 1.0)
@@ -220,6 +223,43 @@ void KvDeskOverlayTest::labelsCanBeHidden()
     QCOMPARE(without.pixelColor(desk.at(150, 90)), QColor(Qt::blue));
     desk.view.slotSetLabelsVisible(true);
     QVERIFY(desk.shown() == with);
+}
+
+void KvDeskOverlayTest::manySelectedObjectsAreRough()
+{
+    DeskView desk;
+    desk.view.slotSetLabelsVisible(false);
+    QSet<KvDeskObjectId> all;
+    for (int i = 0; i <= KvDeskObjectLayer::mostInFull; ++i) {
+        const QPointF start(4 + 8 * (i % 48), 4 + 8 * (i / 48));
+        all.insert(desk.line(start, start + QPointF(4, 0)));
+    }
+    const QImage before = desk.shown();
+    desk.selection.set(all, *all.begin());
+    const QImage selected = desk.shown();
+    const QColor accent = acss::QtAdvancedStylesheet::getInstance()->color(QStringLiteral("accent-hover"));
+    for (int i = 0; i <= KvDeskObjectLayer::mostInFull; ++i) {
+        const QPoint middle = desk.at(6 + 8 * (i % 48), 4 + 8 * (i / 48));
+        QVERIFY(before.pixelColor(middle) != accent);
+        QCOMPARE(selected.pixelColor(middle), accent);
+    }
+    desk.selection.clear();
+    QCOMPARE(desk.shown(), before);
+}
+
+void KvDeskOverlayTest::noMoreTextsThanAnybodyReads()
+{
+    ZtMeasuringDocument document;
+    for (int i = 0; i < 20 * ZtObjectsPainter::maximumLabels; ++i)
+        document.addObject(ZtDrawnType::TextNote, polygon({{1.0 * (i % 400), 0.25 * (i % 1200)}}), QString(),
+                           QStringLiteral("x"));
+    KvDeskOverlay overlay;
+    overlay.setPainter(document.objectsPainter());
+    const QImage shown = draw(&overlay, QTransform());
+    // Some are there, the first ones.
+    QVERIFY(shown != drawAnew(nullptr, QTransform()));
+    const QImage again = draw(&overlay, QTransform::fromTranslate(-1.0, 0.0));
+    QVERIFY(again != shown);
 }
 
 STATREPORT_TEST_MAIN(KvDeskOverlayTest)

@@ -5,6 +5,7 @@
 #include "kernel/ZtAppSettings.h"
 #include "kernel/ZtKernelData.h"
 #include "kernel/ZtKernelObjectDataDescr.h"
+#include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtCalibration.h"
 #include "measuring/ZtDrawnManipulator.h"
 #include "measuring/ZtDrawnObjectData.h"
@@ -16,6 +17,7 @@
 #include <QPainter>
 
 #include <cmath>
+#include <functional>
 #include <limits>
 #include <memory>
 
@@ -80,6 +82,81 @@ struct Drawing
 
 } // namespace
 
+namespace {
+
+constexpr int counterType = ZtDrawnType::Counter;
+
+QPolygonF places(int count)
+{
+    return QPolygonF(QVector<QPointF>(count, QPointF(1, 1)));
+}
+
+/// Counters of the kernel, measured by the type's manipulator.
+struct Counters
+{
+    Counters()
+    {
+        const ZtDrawnType &type = *ZtDrawnType::find(counterType);
+        kernel->registerType(counterType,
+                             std::make_unique<ZtDrawnManipulator>(type, std::make_shared<ZtCalibration>()),
+                             std::make_unique<ZtKernelObjectDataDescr>(counterType, QLatin1String(type.key)));
+        add(1);
+        add(3);
+    }
+    ~Counters() { kernel->unregisterType(counterType); }
+
+    int add(int count) const
+    {
+        return kernel->addObject(counterType, std::make_unique<ZtDrawnObjectData>(places(count)));
+    }
+    void set(int id, int count) const
+    {
+        static_cast<ZtDrawnObjectData *>(kernel->object(counterType, id))->setPoints(places(count));
+        kernel->notifyObjectChanged(counterType, id);
+    }
+    double share(int id) const
+    {
+        int kind = 0;
+        return kernel->getGsManipulator(counterType)
+            ->value(QStringLiteral("Share"), kernel->object(counterType, id), kind)
+            .toDouble();
+    }
+
+    ZtKernelData *kernel = ZtKernelData::getInstance();
+};
+
+using Change = std::function<void(const Counters &)>;
+
+/// Asks for the share of the first counter as soon as it hears of a change.
+class EagerReader : public QObject
+{
+    Q_OBJECT
+public:
+    EagerReader()
+    {
+        const ZtSignalCenter *const center = ZtSignalCenter::getInstance();
+        connect(center, SIGNAL(signalObjectCreated(int,int,const ZtKernelObjectData*)), this,
+                               SLOT(slotRead()));
+        connect(center, SIGNAL(signalObjectChanged(int,int,const ZtKernelObjectData*)), this,
+                               SLOT(slotRead()));
+        connect(center, SIGNAL(signalObjectRemoved(int,int)), this, SLOT(slotRead()));
+    }
+
+    const Counters *counters = nullptr;
+    QVector<double> read;
+
+private slots:
+    void slotRead()
+    {
+        if (counters)
+            read.append(counters->share(1));
+    }
+};
+
+} // namespace
+
+Q_DECLARE_METATYPE(Change)
+
 class ZtDrawnManipulatorTest : public StatReportTest
 {
     Q_OBJECT
@@ -97,6 +174,9 @@ private slots:
     void labelsScaleBarsInReality();
     void readsInPixelsWithoutCalibration();
     void countsShares();
+    void sharesFollowEveryChange_data();
+    void sharesFollowEveryChange();
+    void sharesAreRightFirst();
     void refusesPoints_data();
     void refusesPoints();
     void knowsNoOtherValues();
@@ -365,6 +445,54 @@ void ZtDrawnManipulatorTest::countsShares()
     kernel->unregisterType(type.id);
     QCOMPARE(texts, (QStringList{QStringLiteral("25.000 %"), QStringLiteral("75.000 %"),
                                  QStringLiteral("0.000 %")}));
+}
+
+void ZtDrawnManipulatorTest::sharesFollowEveryChange_data()
+{
+    QTest::addColumn<Change>("change");
+    QTest::addColumn<double>("share");
+    const auto row = [](const char *name, double share, const Change &change) {
+        QTest::newRow(name) << change << share;
+    };
+    row("nothing", 25.0, [](const Counters &) {});
+    row("more places", 10.0, [](const Counters &c) { c.set(2, 9); });
+    row("fewer places", 50.0, [](const Counters &c) { c.set(2, 1); });
+    row("own places", 50.0, [](const Counters &c) { c.set(1, 3); });
+    row("another counter", 20.0, [](const Counters &c) { c.add(1); });
+    row("one counter less", 100.0, [](const Counters &c) { c.kernel->removeObject(counterType, 2); });
+    row("silently another one", 12.5, [](const Counters &c) {
+        const ZtKernelData::SignalBlocker blocker;
+        c.add(4);
+    });
+    row("silently changed", 50.0, [](const Counters &c) {
+        const ZtKernelData::SignalBlocker blocker;
+        c.set(2, 1);
+    });
+    row("in place of another one", 50.0, [](const Counters &c) {
+        c.kernel->addObject(counterType, std::make_unique<ZtDrawnObjectData>(places(1)), 2);
+    });
+}
+
+void ZtDrawnManipulatorTest::sharesFollowEveryChange()
+{
+    QFETCH(Change, change);
+    QFETCH(double, share);
+    const Counters counters;
+    QCOMPARE(counters.share(1), 25.0);
+    change(counters);
+    QCOMPARE(counters.share(1), share);
+}
+
+// Whoever hears of a change first reads right values already.
+void ZtDrawnManipulatorTest::sharesAreRightFirst()
+{
+    EagerReader reader;
+    const Counters counters;
+    reader.counters = &counters;
+    counters.set(2, 9);
+    const int added = counters.add(10);
+    counters.kernel->removeObject(counterType, added);
+    QCOMPARE(reader.read, (QVector<double>{10.0, 5.0, 10.0}));
 }
 
 void ZtDrawnManipulatorTest::refusesPoints_data()
