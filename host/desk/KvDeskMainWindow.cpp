@@ -316,9 +316,9 @@ void KvDeskMainWindow::connectActions()
     onTrigger(A::Settings, this, SLOT(slotSettings()));
     onTrigger(A::About, this, SLOT(slotAbout()));
     connect(m_actions->action(A::ShowLabels), SIGNAL(toggled(bool)), m_imageView,
-                                              SLOT(slotSetLabelsVisible(bool)));
+                                                     SLOT(slotSetLabelsVisible(bool)));
     connect(m_actions->action(A::ShowRulers), SIGNAL(toggled(bool)), m_imageView,
-                                              SLOT(slotSetRulersVisible(bool)));
+                                                     SLOT(slotSetRulersVisible(bool)));
     connect(m_actions->action(A::ShowValues), SIGNAL(toggled(bool)), m_valueTable, SLOT(setVisible(bool)));
     connect(m_actions->action(A::ShowGallery), SIGNAL(toggled(bool)), m_gallery, SLOT(setVisible(bool)));
     connect(m_actions->action(A::ShowLog), SIGNAL(toggled(bool)), m_statusLog, SLOT(setVisible(bool)));
@@ -473,15 +473,29 @@ void KvDeskMainWindow::slotOpenDropped(const QStringList &aPaths)
 {
     QStringList files;
     for (const QString &path : aPaths) {
-        const ZtFrameSourceInfo info = ZtFrameSourceCatalogue::infoOfPath(path);
-        if (info.kind == ZtFrameSourceInfo::ImageFolder)
-            showFolder(path);
-        else if (info.kind == ZtFrameSourceInfo::VideoFile)
-            m_sources->open(info);
-        else
+        if (!openAsSource(path))
             files.append(path);
     }
     m_files->openFiles(files);
+}
+
+void KvDeskMainWindow::openPath(const QString &path)
+{
+    if (!openAsSource(path))
+        m_files->openFile(path);
+}
+
+// False for what is no folder and no video.
+bool KvDeskMainWindow::openAsSource(const QString &path)
+{
+    const ZtFrameSourceInfo info = ZtFrameSourceCatalogue::infoOfPath(path);
+    if (info.kind == ZtFrameSourceInfo::ImageFolder)
+        showFolder(path);
+    else if (info.kind == ZtFrameSourceInfo::VideoFile)
+        m_sources->open(info);
+    else
+        return false;
+    return true;
 }
 
 void KvDeskMainWindow::slotStateChanged()
@@ -494,8 +508,7 @@ void KvDeskMainWindow::slotStateChanged()
 
 void KvDeskMainWindow::slotImageStateChanged()
 {
-    m_statusBar->setImage(m_imageView->frame().image().size(),
-                          m_session->document()->calibration());
+    m_statusBar->setImage(m_imageView->frame().image().size(), m_session->document()->calibration());
     m_statusBar->slotZoomChanged(m_imageView->zoom());
 }
 

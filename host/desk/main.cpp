@@ -35,8 +35,9 @@ QStringList wordsOf(int argc, char **argv)
     return words;
 }
 
-void openFiles(const KvDeskCommandLine &commandLine, KvDeskFileCommands *files)
+void openFiles(const KvDeskCommandLine &commandLine, KvDeskMainWindow *window)
 {
+    KvDeskFileCommands *const files = window->files();
     if (!commandLine.session().isEmpty())
         files->openSession(commandLine.session());
     if (!commandLine.image().isEmpty())
@@ -44,7 +45,7 @@ void openFiles(const KvDeskCommandLine &commandLine, KvDeskFileCommands *files)
     if (!commandLine.table().isEmpty())
         files->importTable(commandLine.table());
     for (const QString &file : commandLine.files())
-        files->openFile(file);
+        window->openPath(file);
 }
 
 int run(const KvDeskCommandLine &commandLine)
@@ -61,7 +62,7 @@ int run(const KvDeskCommandLine &commandLine)
     QObject::connect(&window, SIGNAL(signalClosed()), qApp, SLOT(quit()));
     window.startRecovery(KvDeskRecoveryFile::standardFolder());
     window.show();
-    openFiles(commandLine, window.files());
+    openFiles(commandLine, &window);
     return QApplication::exec();
 }
 
