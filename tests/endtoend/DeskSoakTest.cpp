@@ -19,12 +19,13 @@
 namespace {
 
 constexpr double kShortMinutes = 1.0 / 3;
-constexpr int kStepInterval = 20;        ///< ms between two changes of objects
-constexpr int kMostObjects = 150;        ///< then more are removed than drawn
-constexpr int kPulse = 5;                ///< ms between two looks whether the user interface lives
-constexpr double kMostGrowth = 24.0;     ///< MB that the memory may vary by after the warm-up
-constexpr qint64 kLongestGap = 5000;     ///< ms; far more than there should be, for machines that are busy
-constexpr double kLeastFrameShare = 0.3; ///< of the camera's frames that are shown
+constexpr int kStepInterval = 20;    ///< ms between two changes of objects
+constexpr int kMostObjects = 150;    ///< then more are removed than drawn
+constexpr int kPulse = 5;            ///< ms between two looks whether the user interface lives
+constexpr double kMostGrowth = 32.0; ///< MB that the memory may vary by after the warm-up
+constexpr qint64 kLongestGap = 5000; ///< ms; far more than there should be, for machines that are busy
+constexpr double kLeastFrameShare =
+    0.05; ///< of the camera's frames that are shown, on machines that are busy
 
 double residentMegabytes()
 {
