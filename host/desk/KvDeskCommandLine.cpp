@@ -65,7 +65,7 @@ QString KvDeskCommandLine::requestedText(const QStringList &words)
 
 QString KvDeskCommandLine::helpText()
 {
-    return tr("Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]\n"
+    return tr("Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]\n"
               "Measures objects on images and shows their values.\n"
               "\n"
               "  --session FILE      open a session\n"

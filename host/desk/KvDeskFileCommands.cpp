@@ -231,7 +231,7 @@ bool KvDeskFileCommands::openImage(const QString &path)
     const auto reading = std::make_shared<Reading<ZtLoadedSession>>();
     reading->result.session.imagePath = path;
     ZtFault fault;
-    const auto work = [reading](ZtProgress *) { reading->result.readImage(); };
+    const auto work = [reading](ZtProgress *progress) { reading->result.readImage(progress); };
     if (!run(tr("Opening \"%1\"").arg(fileName(path)), work, &fault))
         return tellFault(failure, fault, source);
     if (!reading->result.image)

@@ -54,8 +54,7 @@ void KvDeskLiveBar::createWidgets()
     m_icon = new QLabel(this);
     m_status = new KvDeskElidedLabel(this);
     m_status->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Preferred);
-    m_reconnect = new QPushButton(this);
-    m_reconnect->setIcon(acss::createIcon(6, QStringLiteral("Icons/reconnect"), iconSize));
+    m_run = new QPushButton(this);
     m_exposure = new KvDeskExposureControl(this);
     m_frameRate = new QLabel(this);
     m_frameRate->setProperty("caption", true);
@@ -70,7 +69,7 @@ void KvDeskLiveBar::createWidgets()
     layout->addWidget(m_freeze);
     layout->addWidget(m_icon);
     layout->addWidget(m_status, 1);
-    layout->addWidget(m_reconnect);
+    layout->addWidget(m_run);
     layout->addSpacing(groupSpacing - margin);
     layout->addWidget(m_exposure);
     layout->addSpacing(groupSpacing - margin);
@@ -82,7 +81,7 @@ void KvDeskLiveBar::connectSignals()
     connect(m_document, SIGNAL(signalImageChanged()), this, SLOT(slotSourceChanged()));
     connect(m_document->kernelImage(), SIGNAL(signalFrozenChanged(bool)), this, SLOT(slotUpdate()));
     connect(m_actions->action(KvDeskActions::Freeze), SIGNAL(toggled(bool)), this, SLOT(slotFreeze(bool)));
-    connect(m_reconnect, SIGNAL(clicked()), this, SLOT(slotReconnect()));
+    connect(m_run, SIGNAL(clicked()), this, SLOT(slotStartOrStop()));
     connect(m_exposure, SIGNAL(signalExposureChosen(double)), this, SLOT(slotExposureChosen(double)));
     connect(&m_rateTimer, SIGNAL(timeout()), this, SLOT(slotUpdateRate()));
     connect(acss::QtAdvancedStylesheet::getInstance(), SIGNAL(currentThemeChanged(QString)), this,
@@ -136,6 +135,23 @@ QString KvDeskLiveBar::statusIcon(const ZtFrameSource &source) const
                                                  : QStringLiteral("Icons/live");
 }
 
+void KvDeskLiveBar::updateRunButton(const ZtFrameSource &source)
+{
+    const ZtFrameSource::State state = source.state();
+    const bool isRunning = state == ZtFrameSource::Running;
+    m_run->setIcon(acss::createIcon(
+        6, isRunning ? QStringLiteral("Icons/stop") : QStringLiteral("Icons/reconnect"), iconSize));
+    // Stopping is the rare case, and the space is needed for the exposure.
+    if (isRunning)
+        m_run->setText(QString());
+    else
+        m_run->setText(state == ZtFrameSource::Lost ? tr("&Reconnect") : tr("&Start"));
+    m_run->setMaximumWidth(isRunning ? buttonSize.width() : QWIDGETSIZE_MAX);
+    m_run->setToolTip(isRunning ? tr("Stop the live image; other programs can use the camera then")
+                                : QString());
+    m_run->setAccessibleName(m_run->toolTip());
+}
+
 void KvDeskLiveBar::slotUpdate()
 {
     const ZtFrameSource *const source = liveSource();
@@ -145,8 +161,7 @@ void KvDeskLiveBar::slotUpdate()
         return;
     m_status->setText(statusText(*source));
     m_icon->setPixmap(acss::createPixmap(6, statusIcon(*source), iconSize));
-    m_reconnect->setVisible(source->state() != ZtFrameSource::Running);
-    m_reconnect->setText(source->state() == ZtFrameSource::Lost ? tr("&Reconnect") : tr("&Start"));
+    updateRunButton(*source);
     slotUpdateExposure();
     slotUpdateRate();
 }
@@ -186,8 +201,13 @@ void KvDeskLiveBar::slotExposureChosen(double aMilliseconds)
         source->setExposure(aMilliseconds);
 }
 
-void KvDeskLiveBar::slotReconnect()
+void KvDeskLiveBar::slotStartOrStop()
 {
-    if (ZtFrameSource *const source = liveSource())
+    ZtFrameSource *const source = liveSource();
+    if (!source)
+        return;
+    if (source->state() == ZtFrameSource::Running)
+        source->stop();
+    else
         source->start();
 }

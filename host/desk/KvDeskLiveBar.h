@@ -15,7 +15,8 @@ class ZtMeasuringDocument;
 
 /**
  * A row above a live image: what it shows and how it is doing, freeze, exposure and frame rate; a button that
- * connects again when the source was lost. Not there as long as the image is not live.
+ * stops the source, which frees a camera for other programs, and starts it again, as after a loss. Not there
+ * as long as the image is not live.
  */
 class KvDeskLiveBar : public QFrame
 {
@@ -28,10 +29,7 @@ public:
     KvDeskExposureControl *exposure() const { return m_exposure; }
     QLabel *frameRate() const { return m_frameRate; }
     QToolButton *freezeButton() const { return m_freeze; }
-    QPushButton *reconnectButton() const { return m_reconnect; }
-
-public slots:
-    void slotReconnect();
+    QPushButton *runButton() const { return m_run; }
 
 private slots:
     void slotSourceChanged();
@@ -40,6 +38,7 @@ private slots:
     void slotUpdateRate();
     void slotFreeze(bool aFrozen);
     void slotExposureChosen(double aMilliseconds);
+    void slotStartOrStop();
 
 private:
     void createWidgets();
@@ -47,12 +46,13 @@ private:
     ZtFrameSource *liveSource() const; ///< null while the image is not live
     QString statusText(const ZtFrameSource &source) const;
     QString statusIcon(const ZtFrameSource &source) const;
+    void updateRunButton(const ZtFrameSource &source);
 
     KvDeskActions *m_actions;
     ZtMeasuringDocument *m_document;
     QLabel *m_icon = nullptr;
     KvDeskElidedLabel *m_status = nullptr;
-    QPushButton *m_reconnect = nullptr;
+    QPushButton *m_run = nullptr; ///< stops, starts or connects again, whichever is due
     KvDeskExposureControl *m_exposure = nullptr;
     QLabel *m_frameRate = nullptr;
     QToolButton *m_freeze = nullptr;

@@ -489,17 +489,29 @@ void KvDeskMainWindow::slotOpenFiles(const QStringList &aPaths)
 {
     QStringList files;
     for (const QString &path : aPaths) {
-        if (openWithTool(path))
-            continue;
-        const ZtFrameSourceInfo info = ZtFrameSourceCatalogue::infoOfPath(path);
-        if (info.kind == ZtFrameSourceInfo::ImageFolder)
-            showFolder(path);
-        else if (info.kind == ZtFrameSourceInfo::VideoFile)
-            m_sources->open(info);
-        else
+        if (!openWithTool(path) && !openAsSource(path))
             files.append(path);
     }
     m_files->openFiles(files);
+}
+
+void KvDeskMainWindow::openPath(const QString &path)
+{
+    if (!openWithTool(path) && !openAsSource(path))
+        m_files->openFile(path);
+}
+
+// False for what is no folder and no video.
+bool KvDeskMainWindow::openAsSource(const QString &path)
+{
+    const ZtFrameSourceInfo info = ZtFrameSourceCatalogue::infoOfPath(path);
+    if (info.kind == ZtFrameSourceInfo::ImageFolder)
+        showFolder(path);
+    else if (info.kind == ZtFrameSourceInfo::VideoFile)
+        m_sources->open(info);
+    else
+        return false;
+    return true;
 }
 
 void KvDeskMainWindow::slotStateChanged()

@@ -67,6 +67,9 @@ public:
     KvDeskStatusBar *deskStatusBar() const { return m_statusBar; }
     QMenu *recentMenu() const { return m_recentMenu; }
 
+    /** Opens a file, a folder or a video as if it was dropped, and says so when it cannot be opened. */
+    void openPath(const QString &path);
+
     /** Activates the tools that were active last time; the first time, the first tool. Called after tools
      * came. */
     void restoreTools();
@@ -119,6 +122,7 @@ private:
     QStringList activeTools() const;
     void showFolder(const QString &path);
     bool openWithTool(const QString &path);
+    bool openAsSource(const QString &path);
     bool closeOtherWindows();
 
     KvDeskActions *m_actions;

@@ -44,8 +44,8 @@ void openFiles(const KvDeskCommandLine &commandLine, KvDeskMainWindow *window)
         files->openImage(commandLine.image());
     if (!commandLine.table().isEmpty())
         files->importTable(commandLine.table());
-    if (!commandLine.files().isEmpty())
-        window->slotOpenFiles(commandLine.files());
+    for (const QString &file : commandLine.files())
+        window->openPath(file);
 }
 
 int run(const KvDeskCommandLine &commandLine)

@@ -6,6 +6,9 @@
 #include "measuring/ZtFrameMailbox.h"
 #include "measuring/ZtWorkerThread.h"
 
+#include <QMutex>
+#include <QMutexLocker>
+
 // GLib has a member of this name.
 #undef signals
 #include <arv.h>
@@ -35,6 +38,9 @@ ZtAravisSource::~ZtAravisSource()
 
 QVector<ZtFrameSourceInfo> ZtAravisSource::devices()
 {
+    // The library has one list for all threads: nobody may look anew while it is read.
+    static QMutex listing;
+    const QMutexLocker lock(&listing);
     arv_update_device_list();
     QVector<ZtFrameSourceInfo> found;
     for (unsigned int i = 0; i < arv_get_n_devices(); ++i)

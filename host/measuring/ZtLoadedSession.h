@@ -24,5 +24,5 @@ struct ZT_MEASURING_EXPORT ZtLoadedSession
      */
     bool read(const QString &path, ZtFault *fault, ZtProgress *progress = nullptr);
     /** Reads the image of a session that is there already. */
-    void readImage();
+    void readImage(ZtProgress *progress = nullptr);
 };

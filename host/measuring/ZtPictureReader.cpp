@@ -51,9 +51,9 @@ ZtOfferedPixelSize pixelSizeOf(const QImage &image, const QByteArray &format)
                                              QString::fromLatin1(format).toUpper());
 }
 
-bool readWithQt(QFile *file, qint64 pixelLimit, ZtPicture *picture, ZtFault *fault)
+bool readWithQt(QFile *file, qint64 pixelLimit, ZtPicture *picture, ZtFault *fault, ZtProgress *progress)
 {
-    ZtLimitedDevice device(file, headerLimit);
+    ZtLimitedDevice device(file, headerLimit, progress);
     QImageReader reader(&device);
     // A wrong file suffix must not keep a good picture from being read.
     reader.setDecideFormatFromContent(true);
@@ -67,6 +67,11 @@ bool readWithQt(QFile *file, qint64 pixelLimit, ZtPicture *picture, ZtFault *fau
     if (!reader.read(&picture->image))
         return fail(ZtStillImageSource::tr("The picture cannot be decoded (%1)").arg(reader.errorString()),
                     fault);
+    // The only decoder that leaves out what is missing without a word; others read more than they need.
+    if (format == "bmp" && device.isExceeded())
+        return fail(ZtStillImageSource::tr("The picture cannot be decoded (%1)")
+                        .arg(ZtStillImageSource::tr("the file is too short for its picture")),
+                    fault);
     picture->pixelSize = pixelSizeOf(picture->image, format);
     if (picture->image.format() == QImage::Format_Grayscale16) {
         picture->greyBits = ZtDeepGrey::significantBits(picture->image);
@@ -77,7 +82,8 @@ bool readWithQt(QFile *file, qint64 pixelLimit, ZtPicture *picture, ZtFault *fau
 
 } // namespace
 
-bool ZtPictureReader::read(const QString &path, qint64 pixelLimit, ZtPicture *picture, ZtFault *fault)
+bool ZtPictureReader::read(const QString &path, qint64 pixelLimit, ZtPicture *picture, ZtFault *fault,
+                           ZtProgress *progress)
 {
     *fault = ZtFault();
     fault->file = path;
@@ -91,9 +97,10 @@ bool ZtPictureReader::read(const QString &path, qint64 pixelLimit, ZtPicture *pi
         return fail(ZtStillImageSource::tr("The picture cannot be decoded (%1)")
                         .arg(ZtStillImageSource::tr("the file is empty")),
                     fault);
-    if (ZtTiffReader::isTiff(file.peek(ZtTiffReader::headerSize)))
-        return ZtTiffReader::read(&file, pixelLimit, picture, fault);
-    return readWithQt(&file, pixelLimit, picture, fault);
+    if (!ZtTiffReader::isTiff(file.peek(ZtTiffReader::headerSize)))
+        return readWithQt(&file, pixelLimit, picture, fault, progress);
+    ZtLimitedDevice device(&file, file.size(), progress);
+    return ZtTiffReader::read(&device, pixelLimit, picture, fault);
 }
 
 bool ZtPictureReader::isUsableSize(qint64 width, qint64 height, qint64 pixelLimit, ZtFault *fault)

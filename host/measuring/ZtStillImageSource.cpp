@@ -7,10 +7,10 @@
 #include <QFileInfo>
 
 std::unique_ptr<ZtStillImageSource> ZtStillImageSource::load(const QString &path, ZtFault *fault,
-                                                             qint64 pixelLimit)
+                                                             qint64 pixelLimit, ZtProgress *progress)
 {
     ZtPicture picture;
-    if (!ZtPictureReader::read(path, pixelLimit, &picture, fault))
+    if (!ZtPictureReader::read(path, pixelLimit, &picture, fault, progress))
         return nullptr;
     return std::unique_ptr<ZtStillImageSource>(
         new ZtStillImageSource(QFileInfo(path).absoluteFilePath(), picture));

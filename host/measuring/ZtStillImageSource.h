@@ -8,6 +8,7 @@
 
 #include <memory>
 
+class ZtProgress;
 struct ZtFault;
 
 /** A picture file as a frame source. */
@@ -21,7 +22,8 @@ public:
     /** Loads a TIFF or a picture of any format that Qt decodes, turned upright; null with a fault when it
      * cannot be used. */
     static std::unique_ptr<ZtStillImageSource> load(const QString &path, ZtFault *fault,
-                                                    qint64 pixelLimit = maximumPixels);
+                                                    qint64 pixelLimit = maximumPixels,
+                                                    ZtProgress *progress = nullptr);
 
     QImage frame() const override { return m_picture.image; }
     QString displayName() const override;

@@ -33,6 +33,8 @@ public:
         if (isReal())
             run({QStringLiteral("windowfocus"), QString::number(window->winId())});
         QVERIFY(QTest::qWaitForWindowActive(window));
+        // A window counts as active as soon as one that belongs to it is.
+        QTRY_VERIFY(QGuiApplication::focusWindow() == window->windowHandle());
     }
 
     void click(QWidget *widget) { click(widget, widget->rect().center()); }

@@ -2,6 +2,7 @@
 #include "support/StatReportTest.h"
 
 #include "measuring/ZtLimitedDevice.h"
+#include "measuring/ZtProgress.h"
 
 #include <QBuffer>
 
@@ -15,6 +16,8 @@ private slots:
     void limitCanGrow();
     void seeks();
     void cannotBeWritten();
+    void tellsHowMuchWasRead();
+    void failsWhenItIsNotWantedAnyMore();
 
 private:
     QBuffer m_buffer;
@@ -34,7 +37,9 @@ void ZtLimitedDeviceTest::endsAtItsLimit()
     QCOMPARE(device.size(), 4LL);
     QCOMPARE(device.read(3), QByteArray("012"));
     QVERIFY(!device.atEnd());
+    QVERIFY(!device.isExceeded());
     QCOMPARE(device.read(3), QByteArray("3"));
+    QVERIFY(device.isExceeded());
     QVERIFY(device.atEnd());
     QCOMPARE(device.read(3), QByteArray());
 }
@@ -73,6 +78,28 @@ void ZtLimitedDeviceTest::cannotBeWritten()
     QVERIFY(device.isOpen());
     QVERIFY(!device.isSequential());
     QVERIFY(!device.isWritable());
+}
+
+void ZtLimitedDeviceTest::tellsHowMuchWasRead()
+{
+    ZtProgress progress;
+    ZtLimitedDevice device(&m_buffer, 8, &progress);
+    QCOMPARE(device.read(3), QByteArray("012"));
+    // Of the whole: the limit may grow.
+    QCOMPARE(progress.fraction(), 0.3);
+    QCOMPARE(device.readAll(), QByteArray("34567"));
+    QCOMPARE(progress.fraction(), 0.8);
+}
+
+void ZtLimitedDeviceTest::failsWhenItIsNotWantedAnyMore()
+{
+    ZtProgress progress;
+    ZtLimitedDevice device(&m_buffer, 10, &progress);
+    QCOMPARE(device.read(2), QByteArray("01"));
+    QVERIFY(progress.cancel());
+    char byte = 0;
+    QCOMPARE(device.read(&byte, 1), -1LL);
+    QCOMPARE(progress.fraction(), 0.2);
 }
 
 STATREPORT_TEST_MAIN(ZtLimitedDeviceTest)

@@ -3,6 +3,7 @@
 #include "support/UnprivilegedUser.h"
 
 #include "measuring/ZtFault.h"
+#include "measuring/ZtProgress.h"
 #include "measuring/ZtStillImageSource.h"
 
 #include <QDir>
@@ -10,6 +11,7 @@
 #include <QImage>
 #include <QImageReader>
 #include <QImageWriter>
+#include <QRandomGenerator>
 
 #include <cmath>
 
@@ -37,6 +39,18 @@ QString writePicture(const QString &name, int dotsPerMetreX, int dotsPerMetreY, 
     return path;
 }
 
+// No format makes it smaller than what is read at once.
+QString noise(const QString &suffix)
+{
+    QImage image(400, 300, QImage::Format_RGB32);
+    QRandomGenerator random(1);
+    random.fillRange(reinterpret_cast<quint32 *>(image.bits()), image.width() * image.height());
+    const QString path = StatReportTest::temporaryPath(QStringLiteral("noise.") + suffix);
+    if (!image.save(path))
+        qCritical("cannot save %s", qPrintable(path));
+    return path;
+}
+
 bool isSupported(const QByteArray &format)
 {
     return QImageReader::supportedImageFormats().contains(format) &&
@@ -58,6 +72,10 @@ private slots:
     void refuses();
     void refusesUnreadableFiles();
     void refusesHugePicturesBeforeDecoding();
+    void tellsHowFarItIs_data();
+    void tellsHowFarItIs();
+    void stopsWhenItIsCancelled_data();
+    void stopsWhenItIsCancelled();
     void offersDifferentSizesPerDirection();
     void namesWhoStatesThePixelSize();
     void showsDeepGreyByItsBits();
@@ -274,6 +292,44 @@ void ZtStillImageSourceTest::isNotLive()
     QCOMPARE(source->droppedFrames(), 0ULL);
     QVERIFY(!source->exposureRange());
     QCOMPARE(source->exposure(), 0.0);
+}
+
+void ZtStillImageSourceTest::tellsHowFarItIs_data()
+{
+    QTest::addColumn<QByteArray>("format");
+    for (const char *format : {"png", "bmp", "jpg", "tif"})
+        QTest::newRow(format) << QByteArray(format);
+}
+
+void ZtStillImageSourceTest::tellsHowFarItIs()
+{
+    QFETCH(QByteArray, format);
+    if (!isSupported(format))
+        QSKIP("no such format here");
+    const QString path = noise(QString::fromLatin1(format));
+    ZtProgress progress;
+    ZtFault fault;
+    QVERIFY(ZtStillImageSource::load(path, &fault, ZtStillImageSource::maximumPixels, &progress));
+    QVERIFY2(progress.fraction() > 0.9, qPrintable(QString::number(progress.fraction())));
+}
+
+void ZtStillImageSourceTest::stopsWhenItIsCancelled_data()
+{
+    tellsHowFarItIs_data();
+}
+
+void ZtStillImageSourceTest::stopsWhenItIsCancelled()
+{
+    QFETCH(QByteArray, format);
+    if (!isSupported(format))
+        QSKIP("no such format here");
+    const QString path = noise(QString::fromLatin1(format));
+    ZtProgress progress;
+    QVERIFY(progress.cancel());
+    ZtFault fault;
+    QVERIFY(!ZtStillImageSource::load(path, &fault, ZtStillImageSource::maximumPixels, &progress));
+    QVERIFY(!fault.isNull());
+    QCOMPARE(progress.fraction(), 0.0);
 }
 
 STATREPORT_TEST_MAIN(ZtStillImageSourceTest)
