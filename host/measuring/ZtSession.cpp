@@ -27,6 +27,7 @@ class Text
 // How much of the time passes until the bytes are there, and until it is known that they are JSON.
 constexpr double readShare = 0.05;
 constexpr double checkShare = 0.3;
+constexpr double sessionShare = 0.85; // the rest is for who makes objects of it
 
 // How much of the time passes until what is to be written is JSON.
 constexpr double jsonShare = 0.4;
@@ -79,6 +80,15 @@ bool readBytes(const QString &path, QByteArray *bytes, ZtFault *fault, ZtProgres
 
 } // namespace
 
+ZtSessionTable ZtSessionTable::ofType(const std::shared_ptr<const ZtImportedType> &type)
+{
+    ZtSessionTable table{type, {}};
+    table.rows.reserve(type->rowCount());
+    for (int row = 0; row < type->rowCount(); ++row)
+        table.rows.append({row + 1, row, type->rowName(row), {}});
+    return table;
+}
+
 bool ZtSession::load(const QString &path, ZtSession *session, ZtFault *fault, ZtProgress *progress)
 {
     *fault = ZtFault();
@@ -105,7 +115,7 @@ bool ZtSession::parse(const QByteArray &bytes, const QString &path, ZtSession *s
         return failParse(json, fault);
     if (json.kind() != ZtJsonReader::Object)
         return fail(Text::tr("The file is not a session"), fault);
-    ZtProgress::setPart(progress, checkShare, 1.0);
+    ZtProgress::setPart(progress, checkShare, sessionShare);
     ZtSessionReader reader(&json, path, progress);
     if (reader.read(session))
         return true;
