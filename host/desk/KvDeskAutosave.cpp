@@ -5,7 +5,6 @@
 #include "KvDeskSession.h"
 #include "KvDeskStatus.h"
 #include "common/ZtAppStatus.h"
-#include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "measuring/ZtProgress.h"
@@ -69,13 +68,6 @@ KvDeskAutosave::KvDeskAutosave(KvDeskSession *session, const QString &folder, QO
     connect(&m_timer, SIGNAL(timeout()), this, SLOT(slotWrite()));
     connect(session, SIGNAL(signalChanged()), this, SLOT(slotChanged()));
     connect(session, SIGNAL(signalStateChanged()), this, SLOT(slotStateChanged()));
-    connect(session, SIGNAL(signalReplaced()), this, SLOT(slotReplaced()));
-    const ZtSignalCenter *const center = ZtSignalCenter::getInstance();
-    connect(center, SIGNAL(signalObjectCreated(int,int,const ZtKernelObjectData*)), this,
-                           SLOT(slotObjectTouched(int,int,const ZtKernelObjectData*)));
-    connect(center, SIGNAL(signalObjectChanged(int,int,const ZtKernelObjectData*)), this,
-                           SLOT(slotObjectTouched(int,int,const ZtKernelObjectData*)));
-    connect(center, SIGNAL(signalObjectRemoved(int,int)), this, SLOT(slotObjectRemoved(int,int)));
     if (session->isModified())
         slotChanged();
 }
@@ -134,39 +126,10 @@ bool KvDeskAutosave::claim()
     return false;
 }
 
-void KvDeskAutosave::slotReplaced()
-{
-    m_tables.clear();
-}
-
-void KvDeskAutosave::slotObjectTouched(int aType, int aId, const ZtKernelObjectData *aObject)
-{
-    Q_UNUSED(aObject)
-    slotObjectRemoved(aType, aId);
-}
-
-void KvDeskAutosave::slotObjectRemoved(int aType, int aId)
-{
-    Q_UNUSED(aId)
-    m_tables.remove(aType);
-}
-
-// Tables may have a million rows, and hardly ever change.
-ZtSessionTable KvDeskAutosave::table(int importedType)
-{
-    auto found = m_tables.find(importedType);
-    if (found == m_tables.end())
-        found = m_tables.insert(importedType, m_session->document()->toSessionTable(importedType));
-    return *found;
-}
-
 std::shared_ptr<KvDeskAutosave::Job> KvDeskAutosave::makeJob()
 {
     const auto job = std::make_shared<Job>();
-    const ZtMeasuringDocument *const document = m_session->document();
-    job->session = document->toSessionWithoutTables();
-    for (const int type : document->importedTypes())
-        job->session.tables.append(table(type));
+    job->session = m_session->document()->toSession();
     job->file = m_file;
     job->header.sessionPath = m_session->path();
     job->header.sessionStamp = m_session->fileStamp();

@@ -4,7 +4,6 @@
 #include "measuring/ZtSession.h"
 
 #include <QElapsedTimer>
-#include <QHash>
 #include <QLockFile>
 #include <QObject>
 #include <QPointer>
@@ -14,7 +13,6 @@
 #include <memory>
 
 class KvDeskSession;
-class ZtKernelObjectData;
 class ZtWorkerThread;
 
 /**
@@ -52,9 +50,6 @@ signals:
 private slots:
     void slotChanged();
     void slotStateChanged();
-    void slotReplaced();
-    void slotObjectTouched(int aType, int aId, const ZtKernelObjectData *aObject);
-    void slotObjectRemoved(int aType, int aId);
     void slotWrite();
     void slotFinished();
 
@@ -63,7 +58,6 @@ private:
 
     bool claim();
     std::shared_ptr<Job> makeJob();
-    ZtSessionTable table(int importedType);
     int interval() const;
     void removeCopy();
     void report(const QString &reason);
@@ -76,8 +70,7 @@ private:
     int m_delayMs = standardDelayMs;
     qint64 m_snapshotMs = 0; ///< how long the last copy held the interface up
     qint64 m_writeMs = 0;
-    QHash<int, ZtSessionTable> m_tables; ///< of imported types that did not change since the last copy
-    quint64 m_copiedChange = 0;          ///< KvDeskSession::changeCount() of the last copy
+    quint64 m_copiedChange = 0; ///< KvDeskSession::changeCount() of the last copy
     bool m_isEnded = false;
     bool m_isFaultReported = false;
     std::shared_ptr<Job> m_job;

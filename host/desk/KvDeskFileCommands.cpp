@@ -15,6 +15,7 @@
 #include "measuring/ZtLoadedSession.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "measuring/ZtProgress.h"
+#include "measuring/ZtReadyObjects.h"
 #include "measuring/ZtTableImport.h"
 
 #include <QDir>
@@ -77,6 +78,21 @@ struct Reading
     Result result;
     ZtFault fault;
     bool isRead = false;
+};
+
+// A table with all of its objects.
+struct LoadedTable
+{
+    ZtImportedTable table;
+    std::vector<ZtReadyObjects> objects;
+
+    bool read(const QString &path, ZtFault *fault, ZtProgress *progress)
+    {
+        if (!ZtTableImport::readFile(path, ZtTableImportOptions(), &table, fault, progress))
+            return false;
+        objects = ZtReadyObjects::ofTable(table, progress);
+        return true;
+    }
 };
 
 } // namespace
@@ -248,11 +264,10 @@ bool KvDeskFileCommands::importTable(const QString &path)
 {
     const QString source = QStringLiteral("KvDeskFileCommands::importTable");
     const QString failure = tr("The table \"%1\" was not imported.").arg(fileName(path));
-    const auto reading = std::make_shared<Reading<ZtImportedTable>>();
+    const auto reading = std::make_shared<Reading<LoadedTable>>();
     ZtFault fault;
     const auto work = [reading, path](ZtProgress *progress) {
-        reading->isRead = ZtTableImport::readFile(path, ZtTableImportOptions(), &reading->result,
-                                                  &reading->fault, progress);
+        reading->isRead = reading->result.read(path, &reading->fault, progress);
     };
     if (!run(tr("Importing \"%1\"").arg(fileName(path)), work, &fault))
         return tellFault(failure, fault, source);
@@ -260,15 +275,15 @@ bool KvDeskFileCommands::importTable(const QString &path)
         return tellFault(failure, reading->fault, source);
     {
         const KvDeskWaitCursor wait;
-        m_session->addTable(reading->result);
+        m_session->addTable(&reading->result.objects);
     }
-    for (const QString &note : qAsConst(reading->result.notes))
+    const ZtImportedTable &table = reading->result.table;
+    for (const QString &note : table.notes)
         KvDeskStatus::log(ZtAppStatus::Warning, tr("%1: %2", "file, remark").arg(fileName(path), note),
                           source);
-    KvDeskStatus::log(
-        ZtAppStatus::Information,
-        tr("Table imported: %1 (objects: %2)").arg(fileName(path)).arg(reading->result.objectCount()),
-        source);
+    KvDeskStatus::log(ZtAppStatus::Information,
+                      tr("Table imported: %1 (objects: %2)").arg(fileName(path)).arg(table.objectCount()),
+                      source);
     return true;
 }
 

@@ -89,8 +89,5 @@ bool KvDeskRecoveryFile::read(const QString &file, ZtLoadedSession *loaded, ZtFa
         return false;
     }
     source.readLine(longestHeader);
-    if (!ZtSession::parse(source.readAll(), file, &loaded->session, fault, progress))
-        return false;
-    loaded->readImage();
-    return true;
+    return loaded->parse(source.readAll(), file, fault, progress);
 }

@@ -7,6 +7,7 @@
 #include "measuring/ZtImportedTable.h"
 #include "measuring/ZtLoadedSession.h"
 #include "measuring/ZtMeasuringDocument.h"
+#include "measuring/ZtReadyObjects.h"
 #include "measuring/ZtTableImport.h"
 
 #include <QFileInfo>
@@ -154,13 +155,14 @@ bool KvDeskSession::importTable(const QString &path, ZtFault *fault, QStringList
     if (!ZtTableImport::readFile(path, ZtTableImportOptions(), &table, fault))
         return false;
     *notes = table.notes;
-    addTable(table);
+    std::vector<ZtReadyObjects> ready = ZtReadyObjects::ofTable(table);
+    addTable(&ready);
     return true;
 }
 
-void KvDeskSession::addTable(const ZtImportedTable &table)
+void KvDeskSession::addTable(std::vector<ZtReadyObjects> *ready)
 {
-    m_document->addTable(table);
+    m_document->addTable(ready);
     slotMarkModified();
 }
 

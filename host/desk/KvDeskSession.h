@@ -8,15 +8,14 @@
 #include <QStringList>
 
 #include <memory>
-
-#include <memory>
+#include <vector>
 
 class ZtFrameSource;
 class ZtCalibration;
 class ZtMeasuringDocument;
+class ZtReadyObjects;
 class ZtStillImageSource;
 struct ZtFault;
-struct ZtImportedTable;
 struct ZtLoadedSession;
 
 /**
@@ -68,7 +67,7 @@ public:
     /** The same with what was read already; \a stamp is that of the file before it was read. */
     void setSession(ZtLoadedSession *loaded, const QString &path, const KvDeskFileStamp &stamp);
     void showImage(std::unique_ptr<ZtStillImageSource> image);
-    void addTable(const ZtImportedTable &table);
+    void addTable(std::vector<ZtReadyObjects> *ready);
     /** As setSession(), but with changes that \a path, which may be empty, has not got. */
     void restore(ZtLoadedSession *loaded, const QString &path, const KvDeskFileStamp &stamp);
     /** The session as it was at \a changeCount was written to \a path. */

@@ -81,13 +81,14 @@ void ZtKernelData::registerType(int type, std::unique_ptr<ZtGsManipulator> manip
     m_descriptors[type] = std::move(descriptor);
 }
 
-void ZtKernelData::unregisterType(int type)
+std::unique_ptr<ZtGsManipulator> ZtKernelData::unregisterType(int type)
 {
     ++m_revision;
     const ZtObjectMap objects = m_objects.take(type);
     qDeleteAll(objects);
-    m_manipulators.erase(type);
     m_descriptors.erase(type);
+    auto node = m_manipulators.extract(type);
+    return node.empty() ? nullptr : std::move(node.mapped());
 }
 
 int ZtKernelData::addObject(int type, std::unique_ptr<ZtKernelObjectData> object, int id)
@@ -137,6 +138,20 @@ void ZtKernelData::notifyObjectChanged(int type, int id) const
     const ZtKernelObjectData *const changed = object(type, id);
     if (changed != nullptr && m_blockers == 0)
         emit ZtSignalCenter::getInstance()->signalObjectChanged(type, id, changed);
+}
+
+void ZtKernelData::setObjects(int type, ZtObjectMap objects)
+{
+    ++m_revision;
+    qDeleteAll(m_objects.take(type));
+    if (!objects.isEmpty())
+        m_objects.insert(type, std::move(objects));
+}
+
+ZtObjectMap ZtKernelData::takeObjects(int type)
+{
+    ++m_revision;
+    return m_objects.take(type);
 }
 
 void ZtKernelData::clearObjects()

@@ -50,8 +50,9 @@ public:
     /** Makes a type known, replacing what was registered under its id. Either pointer may be null. */
     void registerType(int type, std::unique_ptr<ZtGsManipulator> manipulator,
                       std::unique_ptr<ZtKernelObjectDataDescr> descriptor);
-    /** Removes a type with all its objects, silently. */
-    void unregisterType(int type);
+    /** Removes a type with all its objects, silently. The manipulator may be kept for a moment when it is
+     * better freed later. */
+    std::unique_ptr<ZtGsManipulator> unregisterType(int type);
 
     /**
      * Adds an object and emits its creation; returns its id. With \a id 0 it is one more than the type's
@@ -65,6 +66,14 @@ public:
     void notifyObjectChanged(int type, int id) const;
     /** Removes all objects of all types, emitting a removal for each. Types stay registered. */
     void clearObjects();
+
+    /**
+     * Adds many objects of a type at once, silently, in the place of those that it had; takes them all. Costs
+     * the same for any number of them, as long as nobody shares the map.
+     */
+    void setObjects(int type, ZtObjectMap objects);
+    /** Removes all objects of a type, silently, and gives them to the caller. Their names stay. */
+    ZtObjectMap takeObjects(int type);
 
     /** Another number after every change of objects, announced or not; the change counts before anybody hears
      * of it. For whoever keeps what was computed of many objects. */

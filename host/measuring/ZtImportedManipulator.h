@@ -10,7 +10,9 @@
 class ZT_MEASURING_EXPORT ZtImportedManipulator : public ZtMeasuringManipulator
 {
 public:
+    /** \a typeId may be 0 as long as the kernel does not know the type. */
     ZtImportedManipulator(int typeId, std::shared_ptr<const ZtImportedType> type);
+    using ZtMeasuringManipulator::setObjectTypeId;
 
     int typeFlags(int reserved) const override;
     QString objectTypeName(int id) const override;

@@ -9,13 +9,18 @@
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtImportedManipulator.h"
 #include "measuring/ZtImportedObjectData.h"
+#include "measuring/ZtImportedTable.h"
 #include "measuring/ZtKernelImage.h"
 #include "measuring/ZtLoadedSession.h"
 #include "measuring/ZtObjectsPainter.h"
+#include "measuring/ZtReadyObjects.h"
 #include "measuring/ZtSession.h"
 #include "measuring/ZtStillImageSource.h"
 #include "measuring/ZtTableImport.h"
 #include "measuring/ZtUnitSettings.h"
+#include "measuring/ZtWorkerThread.h"
+
+#include <algorithm>
 
 namespace {
 
@@ -31,20 +36,39 @@ const ZtImportedManipulator *importedManipulator(int typeId)
 
 void hideValues(int typeId, int id, const QVector<int> &positions)
 {
+    if (positions.isEmpty())
+        return;
     auto *manipulator = static_cast<ZtMeasuringManipulator *>(kernel()->getGsManipulator(typeId));
     auto *object = static_cast<ZtMeasuredObjectData *>(kernel()->object(typeId, id));
     for (const int position : positions)
         manipulator->setValueShown(object, position, false);
 }
 
+// The first object of each type that has any. No copy of the maps: the next change would copy all objects.
+QVector<QPair<int, int>> firstObjects()
+{
+    QVector<QPair<int, int>> first;
+    const QMap<int, ZtObjectMap> &all = kernel()->objects();
+    for (auto it = all.constBegin(); it != all.constEnd(); ++it) {
+        if (!it->isEmpty())
+            first.append({it.key(), it->firstKey()});
+    }
+    return first;
+}
+
 // One announcement per type stands for all of its objects: receivers refresh everything.
 void announceTypes()
 {
-    const QMap<int, ZtObjectMap> all = kernel()->objects();
-    for (auto it = all.constBegin(); it != all.constEnd(); ++it) {
-        if (!it->isEmpty())
-            emit ZtSignalCenter::getInstance()->signalObjectCreated(it.key(), it->firstKey(), it->first());
+    for (const QPair<int, int> &object : firstObjects()) {
+        if (const ZtKernelObjectData *const data = kernel()->object(object.first, object.second))
+            emit ZtSignalCenter::getInstance()->signalObjectCreated(object.first, object.second, data);
     }
+}
+
+ZtSessionRow toSessionRow(const ZtImportedManipulator &manipulator, int id, const ZtKernelObjectData *data)
+{
+    const auto *object = static_cast<const ZtImportedObjectData *>(data);
+    return {id, object->row(), manipulator.ownName(id), object->hiddenValues()};
 }
 
 ZtSessionObject toSessionObject(const ZtDrawnType &type, int id, const ZtKernelObjectData *data)
@@ -62,6 +86,32 @@ ZtSessionObject toSessionObject(const ZtDrawnType &type, int id, const ZtKernelO
 
 } // namespace
 
+/// What is left of imported tables, for another thread to free: with a million rows that takes a while.
+struct ZtMeasuringDocument::Remains
+{
+    QVector<ZtObjectMap> objects;
+    std::vector<std::unique_ptr<ZtGsManipulator>> manipulators;
+    QHash<int, ZtSessionTable> tables;
+
+    ~Remains() { free(); }
+
+    void free()
+    {
+        for (const ZtObjectMap &map : qAsConst(objects))
+            qDeleteAll(map);
+        objects.clear();
+        manipulators.clear();
+        tables.clear();
+    }
+
+    bool isLarge() const
+    {
+        constexpr int many = 10000;
+        return std::any_of(objects.begin(), objects.end(),
+                           [](const ZtObjectMap &map) { return map.size() >= many; });
+    }
+};
+
 ZtMeasuringDocument::ZtMeasuringDocument(QObject *parent)
     : QObject(parent)
     , m_calibration(std::make_shared<ZtCalibration>())
@@ -73,6 +123,17 @@ ZtMeasuringDocument::ZtMeasuringDocument(QObject *parent)
     registerTypes();
     kernel()->setKernelImage(m_kernelImage.get());
     kernel()->setObjectPainter(m_objectsPainter.get());
+    connectSignals();
+}
+
+void ZtMeasuringDocument::connectSignals()
+{
+    const ZtSignalCenter *const center = ZtSignalCenter::getInstance();
+    connect(center, SIGNAL(signalObjectCreated(int,int,const ZtKernelObjectData*)), this,
+                           SLOT(slotObjectTouched(int,int,const ZtKernelObjectData*)));
+    connect(center, SIGNAL(signalObjectChanged(int,int,const ZtKernelObjectData*)), this,
+                           SLOT(slotObjectTouched(int,int,const ZtKernelObjectData*)));
+    connect(center, SIGNAL(signalObjectRemoved(int,int)), this, SLOT(slotObjectRemoved(int,int)));
 }
 
 ZtMeasuringDocument::~ZtMeasuringDocument()
@@ -81,7 +142,8 @@ ZtMeasuringDocument::~ZtMeasuringDocument()
         kernel()->setKernelImage(nullptr);
     if (kernel()->objectPainter() == m_objectsPainter.get())
         kernel()->setObjectPainter(nullptr);
-    removeImportedTypes();
+    Remains remains;
+    removeImportedTypes(&remains);
     for (const ZtDrawnType &type : ZtDrawnType::all())
         kernel()->unregisterType(type.id);
 }
@@ -101,32 +163,39 @@ void ZtMeasuringDocument::retranslate()
 
 void ZtMeasuringDocument::clear()
 {
-    removeObjects();
-    removeImportedTypes();
+    const auto remains = std::make_shared<Remains>();
+    removeObjects(remains.get());
+    removeImportedTypes(remains.get());
     setFrameSource(nullptr);
     setCalibration(ZtCalibration());
+    if (remains->isLarge())
+        ZtWorkerThread::retire(ZtWorkerThread::begin([remains]() { remains->free(); }));
 }
 
-void ZtMeasuringDocument::removeObjects()
+void ZtMeasuringDocument::removeObjects(Remains *remains)
 {
-    QVector<QPair<int, int>> first;
-    const QMap<int, ZtObjectMap> &all = kernel()->objects();
-    for (auto it = all.constBegin(); it != all.constEnd(); ++it) {
-        if (!it->isEmpty())
-            first.append({it.key(), it->firstKey()});
+    const QVector<QPair<int, int>> first = firstObjects();
+    for (const QPair<int, int> &object : first) {
+        const ZtObjectMap objects = kernel()->takeObjects(object.first);
+        if (m_importedTypes.contains(object.first)) {
+            remains->objects.append(objects);
+            continue;
+        }
+        qDeleteAll(objects);
+        if (ZtGsManipulator *const manipulator = kernel()->getGsManipulator(object.first))
+            manipulator->clearObjectNames();
     }
-    {
-        const ZtKernelData::SignalBlocker blocker;
-        kernel()->clearObjects();
-    }
-    for (const QPair<int, int> &object : qAsConst(first))
+    m_tables.swap(remains->tables);
+    for (const QPair<int, int> &object : first)
         emit ZtSignalCenter::getInstance()->signalObjectRemoved(object.first, object.second);
 }
 
-void ZtMeasuringDocument::removeImportedTypes()
+void ZtMeasuringDocument::removeImportedTypes(Remains *remains)
 {
-    for (const int id : qAsConst(m_importedTypes))
-        kernel()->unregisterType(id);
+    for (const int id : qAsConst(m_importedTypes)) {
+        remains->objects.append(kernel()->takeObjects(id));
+        remains->manipulators.push_back(kernel()->unregisterType(id));
+    }
     m_importedTypes.clear();
 }
 
@@ -201,7 +270,8 @@ bool ZtMeasuringDocument::importTable(const QString &path, const ZtTableImportOp
         return false;
     if (notes)
         *notes = table.notes;
-    addTable(table);
+    std::vector<ZtReadyObjects> ready = ZtReadyObjects::ofTable(table);
+    addTable(&ready);
     return true;
 }
 
@@ -213,13 +283,17 @@ bool ZtMeasuringDocument::importTable(QIODevice *device, const QString &fileName
         return false;
     if (notes)
         *notes = table.notes;
-    addTable(table);
+    std::vector<ZtReadyObjects> ready = ZtReadyObjects::ofTable(table);
+    addTable(&ready);
     return true;
 }
 
-void ZtMeasuringDocument::addTable(const ZtImportedTable &table)
+void ZtMeasuringDocument::addTable(std::vector<ZtReadyObjects> *ready)
 {
-    m_importedTypes += ZtTableImport::apply(table);
+    const QVector<int> ids = ZtTableImport::apply(ready);
+    for (int i = 0; i < ids.size(); ++i)
+        m_tables.insert(ids.at(i), (*ready)[static_cast<std::size_t>(i)].table());
+    m_importedTypes += ids;
 }
 
 std::optional<ZtUnit> ZtMeasuringDocument::importedUnit(const QString &typeName,
@@ -238,14 +312,6 @@ std::optional<ZtUnit> ZtMeasuringDocument::importedUnit(const QString &typeName,
 
 ZtSession ZtMeasuringDocument::toSession() const
 {
-    ZtSession session = toSessionWithoutTables();
-    for (const int id : m_importedTypes)
-        session.tables.append(toSessionTable(id));
-    return session;
-}
-
-ZtSession ZtMeasuringDocument::toSessionWithoutTables() const
-{
     ZtSession session;
     session.imagePath = m_imagePath;
     session.calibration = *m_calibration;
@@ -254,21 +320,46 @@ ZtSession ZtMeasuringDocument::toSessionWithoutTables() const
         for (auto it = objects.constBegin(); it != objects.constEnd(); ++it)
             session.objects.append(toSessionObject(type, it.key(), it.value()));
     }
+    for (const int id : m_importedTypes)
+        session.tables.append(toSessionTable(id));
     return session;
 }
 
 ZtSessionTable ZtMeasuringDocument::toSessionTable(int importedType) const
 {
+    const auto known = m_tables.constFind(importedType);
+    if (known != m_tables.constEnd())
+        return *known;
     const ZtImportedManipulator *manipulator = importedManipulator(importedType);
     ZtSessionTable table;
     table.type = manipulator->sharedType();
     const ZtObjectMap objects = kernel()->objects().value(importedType);
     table.rows.reserve(objects.size());
-    for (auto it = objects.constBegin(); it != objects.constEnd(); ++it) {
-        const auto *object = static_cast<const ZtImportedObjectData *>(it.value());
-        table.rows.append({it.key(), object->row(), manipulator->ownName(it.key()), object->hiddenValues()});
-    }
+    for (auto it = objects.constBegin(); it != objects.constEnd(); ++it)
+        table.rows.append(toSessionRow(*manipulator, it.key(), it.value()));
+    m_tables.insert(importedType, table);
     return table;
+}
+
+void ZtMeasuringDocument::slotObjectTouched(int aType, int aId, const ZtKernelObjectData *aObject)
+{
+    const auto found = m_tables.find(aType);
+    if (found == m_tables.end())
+        return;
+    QVector<ZtSessionRow> &rows = found->rows;
+    const auto isBefore = [](const ZtSessionRow &row, int id) { return row.id < id; };
+    const auto row = std::lower_bound(rows.begin(), rows.end(), aId, isBefore);
+    const bool isKnown = row != rows.end() && row->id == aId;
+    if (isKnown && kernel()->objects().value(aType).size() == rows.size())
+        *row = toSessionRow(*importedManipulator(aType), aId, aObject);
+    else
+        m_tables.erase(found);
+}
+
+void ZtMeasuringDocument::slotObjectRemoved(int aType, int aId)
+{
+    Q_UNUSED(aId)
+    m_tables.remove(aType);
 }
 
 bool ZtMeasuringDocument::saveSession(const QString &path, ZtFault *fault) const
@@ -295,16 +386,16 @@ void ZtMeasuringDocument::setSession(ZtLoadedSession *loaded)
     if (loaded->image)
         showImage(std::move(loaded->image));
     m_imagePath = loaded->session.imagePath;
-    apply(loaded->session);
+    apply(loaded);
 }
 
-void ZtMeasuringDocument::apply(const ZtSession &session)
+void ZtMeasuringDocument::apply(ZtLoadedSession *loaded)
 {
-    setCalibration(session.calibration);
+    setCalibration(loaded->session.calibration);
     {
         const ZtKernelData::SignalBlocker blocker;
-        addSessionObjects(session);
-        addSessionTables(session);
+        addSessionObjects(loaded->session);
+        addSessionTables(loaded);
     }
     announceTypes();
 }
@@ -319,18 +410,13 @@ void ZtMeasuringDocument::addSessionObjects(const ZtSession &session)
     }
 }
 
-void ZtMeasuringDocument::addSessionTables(const ZtSession &session)
+void ZtMeasuringDocument::addSessionTables(ZtLoadedSession *loaded)
 {
-    for (const ZtSessionTable &table : session.tables) {
-        const int typeId =
-            ZtTableImport::registerType(table.type, m_importedTypes.isEmpty() ? 0 : m_importedTypes.last());
-        m_importedTypes.append(typeId);
-        for (const ZtSessionRow &row : table.rows) {
-            kernel()->addObject(typeId, std::make_unique<ZtImportedObjectData>(row.row), row.id);
-            ZtGsManipulator *manipulator = kernel()->getGsManipulator(typeId);
-            manipulator->setObjectName(row.id,
-                                       row.name.isEmpty() ? manipulator->getObjectName(row.id) : row.name);
-            hideValues(typeId, row.id, row.hiddenValues);
-        }
+    std::vector<ZtReadyObjects> ready = std::move(loaded->tableObjects);
+    if (ready.size() != static_cast<std::size_t>(loaded->session.tables.size()))
+        ready = ZtReadyObjects::ofSession(loaded->session);
+    for (ZtReadyObjects &objects : ready) {
+        m_importedTypes.append(objects.handOver(m_importedTypes.isEmpty() ? 0 : m_importedTypes.last()));
+        m_tables.insert(m_importedTypes.last(), objects.table());
     }
 }

@@ -4,25 +4,27 @@
 #include "measuring/ZtCalibration.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtMeasuringGlobal.h"
+#include "measuring/ZtSession.h"
 #include "measuring/ZtTableImportOptions.h"
 #include "measuring/ZtUnit.h"
 
+#include <QHash>
 #include <QObject>
 #include <QPolygonF>
 #include <QVector>
 
 #include <memory>
 #include <optional>
+#include <vector>
 
 class QIODevice;
 class ZtFrameSource;
 class ZtKernelImage;
+class ZtKernelObjectData;
 class ZtObjectsPainter;
+class ZtReadyObjects;
 class ZtStillImageSource;
-struct ZtImportedTable;
 struct ZtLoadedSession;
-struct ZtSession;
-struct ZtSessionTable;
 
 /**
  * What a measuring application works on: the image, its calibration, and the objects in ZtKernelData.
@@ -82,8 +84,8 @@ public:
                      QStringList *notes = nullptr);
     bool importTable(QIODevice *device, const QString &fileName, const ZtTableImportOptions &options,
                      ZtFault *fault, QStringList *notes = nullptr);
-    /** Adds the objects of a table that was read already. */
-    void addTable(const ZtImportedTable &table);
+    /** Adds the objects of a table that was read already, which costs the same for any number of rows. */
+    void addTable(std::vector<ZtReadyObjects> *ready);
     /** Ids of the types that tables brought, in ascending order. */
     const QVector<int> &importedTypes() const { return m_importedTypes; }
 
@@ -96,14 +98,13 @@ public:
     /** Replaces everything by a session's contents. An image that is missing can be ignored; its path is
      * kept. */
     bool loadSession(const QString &path, ZtFault *fault, MissingImage missingImage = MissingImage::IsFault);
-    /** Replaces everything by a session that was read already; takes its image. */
+    /** Replaces everything by a session that was read already; takes its image and the objects of its tables,
+     * which costs the same for any number of rows. What was there before is freed by another thread. */
     void setSession(ZtLoadedSession *loaded);
     bool saveSession(const QString &path, ZtFault *fault) const;
-    /** Everything that a session file holds, as it is now. */
+    /** Everything that a session file holds, as it is now. The rows of tables are shared, and remembered
+     * until some come or go: so this is quick even for large ones. */
     ZtSession toSession() const;
-    /** The same without the imported tables, and the table of one of importedTypes(). */
-    ZtSession toSessionWithoutTables() const;
-    ZtSessionTable toSessionTable(int importedType) const;
 
     /** Fetches the names of the built-in types again after the language changed. */
     void retranslate();
@@ -112,15 +113,23 @@ signals:
     void signalImageChanged();
     void signalCalibrationChanged();
 
+private slots:
+    void slotObjectTouched(int aType, int aId, const ZtKernelObjectData *aObject);
+    void slotObjectRemoved(int aType, int aId);
+
 private:
+    struct Remains;
+
+    void connectSignals();
     void registerTypes();
-    void removeObjects();
-    void removeImportedTypes();
+    void removeObjects(Remains *remains);
+    void removeImportedTypes(Remains *remains);
     void useSource(std::unique_ptr<ZtFrameSource> source, const QString &imagePath,
                    const ZtCalibration &offered);
-    void apply(const ZtSession &session);
+    void apply(ZtLoadedSession *loaded);
     void addSessionObjects(const ZtSession &session);
-    void addSessionTables(const ZtSession &session);
+    void addSessionTables(ZtLoadedSession *loaded);
+    ZtSessionTable toSessionTable(int importedType) const;
 
     std::shared_ptr<ZtCalibration> m_calibration;
     std::unique_ptr<ZtKernelImage> m_kernelImage;
@@ -129,4 +138,5 @@ private:
     QString m_imagePath;
     ZtCalibration m_offered;
     QVector<int> m_importedTypes;
+    mutable QHash<int, ZtSessionTable> m_tables; ///< of imported types of which no objects came or went
 };

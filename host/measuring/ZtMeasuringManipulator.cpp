@@ -4,6 +4,9 @@
 #include "kernel/ZtKernelData.h"
 #include "measuring/ZtMeasuredObjectData.h"
 
+#include <array>
+#include <charconv>
+
 ZtMeasuringManipulator::ZtMeasuringManipulator(int typeId, const QStringList &valueNames)
     : m_typeId(typeId)
 {
@@ -44,9 +47,19 @@ QStringList ZtMeasuringManipulator::valueSet(int id) const
 
 QString ZtMeasuringManipulator::ownName(int id) const
 {
-    const QString name = getObjectName(id);
-    const QString standard = objectTypeName(id) + QLatin1Char(' ') + QString::number(id);
-    return name == standard ? QString() : name;
+    return ownName(getObjectName(id), objectTypeName(id), id);
+}
+
+// Asked for every row of a table: makes no text of its own.
+QString ZtMeasuringManipulator::ownName(const QString &name, const QString &typeName, int id)
+{
+    const int start = typeName.size() + 1;
+    if (name.size() <= start || name.at(start - 1) != QLatin1Char(' ') || !name.startsWith(typeName))
+        return name;
+    std::array<char, 16> digits{};
+    const auto end = std::to_chars(digits.data(), digits.data() + digits.size(), id).ptr;
+    const QLatin1String number(digits.data(), static_cast<int>(end - digits.data()));
+    return QStringView(name).mid(start) == number ? QString() : name;
 }
 
 void ZtMeasuringManipulator::setValueShown(ZtMeasuredObjectData *object, int position, bool shown)

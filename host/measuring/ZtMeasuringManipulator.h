@@ -25,6 +25,8 @@ public:
 
     /** The name that the user or a table gave an object; empty for the one that it has by itself. */
     QString ownName(int id) const;
+    /** The same of a \a name that an object has: empty when it is the type's name, a blank and the id. */
+    static QString ownName(const QString &name, const QString &typeName, int id);
 
     /** Shows or hides a value of one object; announcing the change is up to the caller. */
     void setValueShown(ZtMeasuredObjectData *object, int position, bool shown);
@@ -32,6 +34,7 @@ public:
 
 protected:
     ZtMeasuringManipulator(int typeId, const QStringList &valueNames);
+    void setObjectTypeId(int typeId) { m_typeId = typeId; }
     void changeValueNames(const QStringList &valueNames);
 
 private:

@@ -2,11 +2,11 @@
 #include "measuring/ZtSafeFile.h"
 
 #include "measuring/ZtFault.h"
+#include "measuring/ZtPartFile.h"
 #include "measuring/ZtProgress.h"
 
 #include <QFile>
 #include <QFileInfo>
-#include <QSaveFile>
 
 #ifdef Q_OS_WIN
 #include <io.h>
@@ -58,7 +58,7 @@ void syncFolder(const QString &folder)
 
 } // namespace
 
-bool ZtSafeFile::writeBytes(QSaveFile *file, const QByteArray &bytes, ZtProgress *progress)
+bool ZtSafeFile::writeBytes(QFile *file, const QByteArray &bytes, ZtProgress *progress)
 {
     for (int at = 0; at < bytes.size(); at += portion) {
         const int count = qMin(portion, bytes.size() - at);
@@ -76,17 +76,17 @@ bool ZtSafeFile::write(const QString &path, const QByteArray &bytes, ZtFault *fa
     fault->file = path;
     if (isWriteProtected(path))
         return fail(tr("The file is write-protected"), fault);
-    QSaveFile file(path);
-    bool isWritten = file.open(QIODevice::WriteOnly) && writeBytes(&file, bytes, progress);
+    ZtPartFile part(path);
+    bool isWritten = part.open() && writeBytes(part.file(), bytes, progress);
     if (isWritten) {
-        syncFile(file.handle());
-        isWritten = (!progress || progress->commit()) && file.commit();
+        syncFile(part.file()->handle());
+        isWritten = (!progress || progress->commit()) && part.commit();
     }
-    if (isWritten)
-        syncFolder(QFileInfo(path).absolutePath());
-    else if (ZtProgress::isCancelled(progress))
+    if (ZtProgress::isCancelled(progress))
         return fail(tr("Writing was cancelled"), fault);
-    else
-        return fail(tr("The file cannot be written (%1)").arg(file.errorString()), fault);
+    if (!isWritten)
+        return fail(tr("The file cannot be written (%1)").arg(part.errorString()), fault);
+    syncFolder(QFileInfo(path).absolutePath());
+    ZtPartFile::removeStale(path);
     return true;
 }

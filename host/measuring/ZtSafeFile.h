@@ -6,7 +6,7 @@
 #include <QCoreApplication>
 
 class QByteArray;
-class QSaveFile;
+class QFile;
 class ZtProgress;
 struct ZtFault;
 
@@ -20,11 +20,12 @@ class ZT_MEASURING_EXPORT ZtSafeFile
 public:
     /**
      * Replaces the file as a whole or leaves it as it was. A file that the user may not write stays, even
-     * where the folder would allow to replace it.
+     * where the folder would allow to replace it. What was left beside it by a program that was killed while
+     * it wrote is removed.
      */
     static bool write(const QString &path, const QByteArray &bytes, ZtFault *fault,
                       ZtProgress *progress = nullptr);
 
 private:
-    static bool writeBytes(QSaveFile *file, const QByteArray &bytes, ZtProgress *progress);
+    static bool writeBytes(QFile *file, const QByteArray &bytes, ZtProgress *progress);
 };

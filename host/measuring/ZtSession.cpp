@@ -3,6 +3,7 @@
 
 #include "measuring/ZtBoundedRead.h"
 #include "measuring/ZtFault.h"
+#include "measuring/ZtJsonReader.h"
 #include "measuring/ZtProgress.h"
 #include "measuring/ZtSafeFile.h"
 #include "measuring/ZtSessionReader.h"
@@ -11,7 +12,9 @@
 #include <QCoreApplication>
 #include <QFile>
 #include <QFileInfo>
-#include <QJsonDocument>
+
+#include <algorithm>
+#include <string_view>
 
 namespace {
 
@@ -21,8 +24,12 @@ class Text
     Q_DECLARE_TR_FUNCTIONS(ZtSession)
 };
 
-// How much of the time passes until the bytes are there, and until they are JSON.
+// How much of the time passes until the bytes are there, and until it is known that they are JSON.
 constexpr double readShare = 0.05;
+constexpr double checkShare = 0.3;
+constexpr double sessionShare = 0.85; // the rest is for who makes objects of it
+
+// How much of the time passes until what is to be written is JSON.
 constexpr double jsonShare = 0.4;
 
 bool fail(const QString &message, ZtFault *fault)
@@ -31,12 +38,18 @@ bool fail(const QString &message, ZtFault *fault)
     return false;
 }
 
-bool failParse(const QByteArray &bytes, const QJsonParseError &error, ZtFault *fault)
+bool failParse(const ZtJsonReader &json, ZtFault *fault)
 {
-    fault->line = static_cast<int>(bytes.left(error.offset).count('\n')) + 1;
+    const QJsonParseError &error = json.error();
+    fault->line = json.lineOf(error.offset);
     if (error.error == QJsonParseError::DeepNesting)
         return fail(Text::tr("The file is nested too deeply"), fault);
     return fail(Text::tr("The file is not valid JSON (%1)").arg(error.errorString()), fault);
+}
+
+bool isBlank(std::string_view bytes)
+{
+    return bytes.find_first_not_of(" \t\n\v\f\r") == std::string_view::npos;
 }
 
 bool failCancelled(ZtFault *fault)
@@ -67,6 +80,15 @@ bool readBytes(const QString &path, QByteArray *bytes, ZtFault *fault, ZtProgres
 
 } // namespace
 
+ZtSessionTable ZtSessionTable::ofType(const std::shared_ptr<const ZtImportedType> &type)
+{
+    ZtSessionTable table{type, {}};
+    table.rows.reserve(type->rowCount());
+    for (int row = 0; row < type->rowCount(); ++row)
+        table.rows.append({row + 1, row, type->rowName(row), {}});
+    return table;
+}
+
 bool ZtSession::load(const QString &path, ZtSession *session, ZtFault *fault, ZtProgress *progress)
 {
     *fault = ZtFault();
@@ -81,19 +103,21 @@ bool ZtSession::parse(const QByteArray &bytes, const QString &path, ZtSession *s
 {
     *fault = ZtFault();
     fault->file = path;
-    if (bytes.trimmed().isEmpty())
+    const std::string_view text(bytes.constData(), static_cast<std::size_t>(bytes.size()));
+    if (isBlank(text))
         return fail(Text::tr("The file is empty"), fault);
-    QJsonParseError error;
-    const QJsonDocument document = QJsonDocument::fromJson(bytes, &error);
-    if (error.error != QJsonParseError::NoError)
-        return failParse(bytes, error, fault);
-    if (!document.isObject())
-        return fail(Text::tr("The file is not a session"), fault);
+    ZtJsonReader json(text);
+    ZtProgress::setPart(progress, readShare, checkShare);
+    const bool isJson = json.check(progress);
     if (ZtProgress::isCancelled(progress))
         return failCancelled(fault);
-    ZtProgress::setPart(progress, jsonShare, 1.0);
-    ZtSessionReader reader(path, progress);
-    if (reader.read(document.object(), session))
+    if (!isJson)
+        return failParse(json, fault);
+    if (json.kind() != ZtJsonReader::Object)
+        return fail(Text::tr("The file is not a session"), fault);
+    ZtProgress::setPart(progress, checkShare, sessionShare);
+    ZtSessionReader reader(&json, path, progress);
+    if (reader.read(session))
         return true;
     *fault = reader.fault();
     fault->file = path;

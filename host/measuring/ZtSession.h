@@ -33,11 +33,16 @@ struct ZtSessionRow
     QVector<int> hiddenValues;
 };
 
+Q_DECLARE_TYPEINFO(ZtSessionRow, Q_MOVABLE_TYPE);
+
 /** The objects of one imported type. */
-struct ZtSessionTable
+struct ZT_MEASURING_EXPORT ZtSessionTable
 {
     std::shared_ptr<const ZtImportedType> type;
-    QVector<ZtSessionRow> rows;
+    QVector<ZtSessionRow> rows; ///< in the order of their ids
+
+    /** All rows of a type, which count from 1. */
+    static ZtSessionTable ofType(const std::shared_ptr<const ZtImportedType> &type);
 };
 
 /**

@@ -8,8 +8,9 @@
 #include "measuring/ZtClassIndexTableReader.h"
 #include "measuring/ZtCsvReader.h"
 #include "measuring/ZtImportedManipulator.h"
-#include "measuring/ZtImportedObjectData.h"
+#include "measuring/ZtImportedTable.h"
 #include "measuring/ZtProgress.h"
+#include "measuring/ZtReadyObjects.h"
 #include "measuring/ZtTableDialect.h"
 #include "measuring/ZtTableNumber.h"
 #include "measuring/ZtTextDecoder.h"
@@ -92,19 +93,6 @@ bool readText(std::string_view text, const ZtTableImportOptions &options, ZtImpo
     return false;
 }
 
-void addObjects(int typeId, const ZtImportedType &type)
-{
-    ZtKernelData *kernel = ZtKernelData::getInstance();
-    ZtGsManipulator *manipulator = kernel->getGsManipulator(typeId);
-    const ZtKernelData::SignalBlocker blocker;
-    for (int row = 0; row < type.rowCount(); ++row) {
-        const int id = kernel->addObject(typeId, std::make_unique<ZtImportedObjectData>(row), row + 1);
-        // Reports ask for the names again and again: also those that could be made up are stored.
-        const QString name = type.rowName(row).isEmpty() ? manipulator->getObjectName(id) : type.rowName(row);
-        manipulator->setObjectName(id, name);
-    }
-}
-
 } // namespace
 
 bool ZtTableImport::readFile(const QString &path, const ZtTableImportOptions &options, ZtImportedTable *table,
@@ -161,23 +149,30 @@ bool ZtTableImport::parse(const QByteArray &bytes, const QString &fileName,
     return isRead;
 }
 
-int ZtTableImport::registerType(const std::shared_ptr<const ZtImportedType> &type, int afterId)
+int ZtTableImport::registerType(std::unique_ptr<ZtImportedManipulator> manipulator, int afterId)
 {
     ZtKernelData *kernel = ZtKernelData::getInstance();
     int id = qMax(firstTypeId, afterId + 1);
     while (kernel->getGsManipulator(id) || kernel->getDataDescriptor(id))
         ++id;
-    kernel->registerType(id, std::make_unique<ZtImportedManipulator>(id, type),
-                         std::make_unique<ZtKernelObjectDataDescr>(id, type->name()));
+    manipulator->setObjectTypeId(id);
+    auto descriptor = std::make_unique<ZtKernelObjectDataDescr>(id, manipulator->type().name());
+    kernel->registerType(id, std::move(manipulator), std::move(descriptor));
     return id;
 }
 
 QVector<int> ZtTableImport::apply(const ZtImportedTable &table)
 {
+    std::vector<ZtReadyObjects> ready = ZtReadyObjects::ofTable(table);
+    return apply(&ready);
+}
+
+QVector<int> ZtTableImport::apply(std::vector<ZtReadyObjects> *ready, int afterId)
+{
     QVector<int> ids;
-    for (const auto &type : table.types) {
-        ids.append(registerType(type, ids.isEmpty() ? 0 : ids.last()));
-        addObjects(ids.last(), *type);
+    for (ZtReadyObjects &objects : *ready) {
+        ids.append(objects.handOver(afterId));
+        afterId = ids.last();
     }
     for (const int id : qAsConst(ids)) {
         if (const ZtKernelObjectData *first = ZtKernelData::getInstance()->object(id, 1))

@@ -6,9 +6,14 @@
 #include "measuring/ZtMeasuringGlobal.h"
 #include "measuring/ZtTableImportOptions.h"
 
+#include <memory>
+#include <vector>
+
 class QByteArray;
 class QIODevice;
+class ZtImportedManipulator;
 class ZtProgress;
+class ZtReadyObjects;
 
 /**
  * Reads tables of measurements: one value per row, one object per row, or results as ImageJ writes them.
@@ -39,11 +44,14 @@ public:
      * objects. \return the ids of the new types
      */
     static QVector<int> apply(const ZtImportedTable &table);
+    /** The same with objects that were made already. */
+    static QVector<int> apply(std::vector<ZtReadyObjects> *ready, int afterId = 0);
 
     /**
-     * Makes one type known without any objects.
-     * \param afterId the new id is greater than this one
+     * Makes one type known without any objects, silently.
+     * \param manipulator has no type id yet
+     * \param afterId     the new id is greater than this one
      * \return its id
      */
-    static int registerType(const std::shared_ptr<const ZtImportedType> &type, int afterId = 0);
+    static int registerType(std::unique_ptr<ZtImportedManipulator> manipulator, int afterId = 0);
 };

@@ -84,6 +84,8 @@ private slots:
     void editsAreAnnounced();
     void clearingAnnouncesEveryRemoval();
     void clearingLeavesWhatReceiversAdd();
+    void setsAndTakesManyObjects();
+    void unregisteringGivesTheManipulator();
     void blockersNest();
     void keepsTheImage();
 
@@ -289,6 +291,37 @@ void ZtKernelDataTest::clearingLeavesWhatReceiversAdd()
         m_kernel->clearObjects();
     }
     QCOMPARE(m_kernel->objects().keys(), QList<int>{2});
+}
+
+void ZtKernelDataTest::setsAndTakesManyObjects()
+{
+    registerFakeType(1);
+    add(1);
+    SignalRecorder recorder;
+    m_kernel->setObjects(1, {{3, new CountedObject}, {5, new CountedObject}});
+    QCOMPARE(m_kernel->objects().value(1).keys(), (QList<int>{3, 5}));
+    QCOMPARE(CountedObject::living, 2);
+    QCOMPARE(add(1), 6);
+    recorder.taken();
+    const ZtObjectMap taken = m_kernel->takeObjects(1);
+    QCOMPARE(taken.size(), 3);
+    QVERIFY(!m_kernel->objects().contains(1));
+    QVERIFY(m_kernel->takeObjects(1).isEmpty());
+    m_kernel->setObjects(1, ZtObjectMap());
+    QVERIFY(!m_kernel->objects().contains(1));
+    QCOMPARE(CountedObject::living, 3);
+    qDeleteAll(taken);
+    QCOMPARE(recorder.taken(), QStringList());
+}
+
+void ZtKernelDataTest::unregisteringGivesTheManipulator()
+{
+    registerFakeType(1);
+    const ZtGsManipulator *const manipulator = m_kernel->getGsManipulator(1);
+    const std::unique_ptr<ZtGsManipulator> taken = m_kernel->unregisterType(1);
+    QCOMPARE(taken.get(), manipulator);
+    QVERIFY(!m_kernel->getGsManipulator(1));
+    QVERIFY(!m_kernel->unregisterType(1));
 }
 
 void ZtKernelDataTest::blockersNest()

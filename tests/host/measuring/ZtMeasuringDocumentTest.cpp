@@ -9,7 +9,10 @@
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtDrawnObjectData.h"
 #include "measuring/ZtDrawnType.h"
+#include "measuring/ZtImportedObjectData.h"
+#include "measuring/ZtImportedTable.h"
 #include "measuring/ZtKernelImage.h"
+#include "measuring/ZtLoadedSession.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "measuring/ZtMeasuringManipulator.h"
 #include "measuring/ZtStillImageSource.h"
@@ -100,6 +103,8 @@ private slots:
     void tellsUnitsOfTables();
     void clears();
     void savesAndLoads();
+    void remembersTheRowsOfTables();
+    void largeTablesComeAndGoAtOnce();
     void loadsAMissingImage();
     void changesNothingWhenLoadingFails_data();
     void changesNothingWhenLoadingFails();
@@ -356,6 +361,80 @@ void ZtMeasuringDocumentTest::savesAndLoads()
     const QString again = temporaryPath(text("again.json"));
     QVERIFY(document.saveSession(again, &fault));
     QCOMPARE(readAll(again), readAll(path));
+}
+
+void ZtMeasuringDocumentTest::remembersTheRowsOfTables()
+{
+    ZtMeasuringDocument document;
+    ZtFault fault;
+    QByteArray bytes = "size\n1\n2\n3\n4\n";
+    QBuffer buffer(&bytes);
+    QVERIFY(buffer.open(QIODevice::ReadOnly));
+    QVERIFY(document.importTable(&buffer, text("t.csv"), ZtTableImportOptions(), &fault));
+    const int type = document.importedTypes().first();
+    const auto rows = [&document]() {
+        QStringList result;
+        for (const ZtSessionRow &row : document.toSession().tables.first().rows)
+            result.append(QStringLiteral("%1/%2/%3/%4")
+                              .arg(row.id)
+                              .arg(row.row)
+                              .arg(row.name)
+                              .arg(row.hiddenValues.size()));
+        return result;
+    };
+    QCOMPARE(rows(), (QStringList{text("1/0//0"), text("2/1//0"), text("3/2//0"), text("4/3//0")}));
+    ZtKernelData *const kernel = ZtKernelData::getInstance();
+    auto *const manipulator = static_cast<ZtMeasuringManipulator *>(kernel->getGsManipulator(type));
+    // One that was taken before stays as it was.
+    const ZtSession before = document.toSession();
+    manipulator->setObjectName(2, text("nut"));
+    manipulator->setValueShown(static_cast<ZtMeasuredObjectData *>(kernel->object(type, 3)), 0, false);
+    kernel->notifyObjectChanged(type, 2);
+    kernel->notifyObjectChanged(type, 3);
+    QCOMPARE(rows(), (QStringList{text("1/0//0"), text("2/1/nut/0"), text("3/2//1"), text("4/3//0")}));
+    QCOMPARE(before.tables.first().rows.at(1).name, QString());
+    kernel->removeObject(type, 1);
+    QCOMPARE(rows(), (QStringList{text("2/1/nut/0"), text("3/2//1"), text("4/3//0")}));
+    kernel->addObject(type, std::make_unique<ZtImportedObjectData>(0), 1);
+    QCOMPARE(rows(), (QStringList{text("1/0//0"), text("2/1/nut/0"), text("3/2//1"), text("4/3//0")}));
+    kernel->removeObject(type, 4);
+    kernel->removeObject(type, 3);
+    kernel->removeObject(type, 2);
+    kernel->removeObject(type, 1);
+    QCOMPARE(rows(), QStringList());
+    document.clear();
+    QVERIFY(document.toSession().tables.isEmpty());
+}
+
+void ZtMeasuringDocumentTest::largeTablesComeAndGoAtOnce()
+{
+    constexpr int rows = 300000;
+    ZtMeasuringDocument document;
+    ZtImportedTable table;
+    ZtFault fault;
+    QVERIFY(ZtTableImport::parse("size\n" + QByteArray("1\n").repeated(rows), text("t.csv"),
+                                 ZtTableImportOptions(), &table, &fault));
+    std::vector<ZtReadyObjects> ready = ZtReadyObjects::ofTable(table);
+    ZtSession session;
+    session.tables.append(ZtSessionTable::ofType(table.types.first()));
+    ZtLoadedSession loaded;
+    QVERIFY(loaded.parse(session.toJson(text("/s.json")), text("/s.json"), &fault));
+    QElapsedTimer clock;
+    const auto isQuick = [&clock]() { return clock.restart() < 100; };
+    clock.start();
+    document.addTable(&ready);
+    QVERIFY(isQuick());
+    const ZtSession saved = document.toSession();
+    QVERIFY(isQuick());
+    document.setSession(&loaded);
+    QVERIFY(isQuick());
+    QCOMPARE(saved.tables.first().rows.size(), rows);
+    QCOMPARE(document.importedTypes().size(), 1);
+    QCOMPARE(ZtKernelData::getInstance()->objects().value(document.importedTypes().first()).size(), rows);
+    clock.restart();
+    document.clear();
+    QVERIFY(isQuick());
+    QVERIFY(ZtKernelData::getInstance()->objects().isEmpty());
 }
 
 void ZtMeasuringDocumentTest::loadsAMissingImage()

@@ -6,14 +6,17 @@
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtImportedTypeBuilder.h"
+#include "measuring/ZtProgress.h"
 #include "measuring/ZtSession.h"
 #include "measuring/ZtTableImport.h"
+#include "measuring/ZtWorkerThread.h"
 
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
 
 #include <limits>
+#include <thread>
 
 namespace {
 
@@ -123,6 +126,14 @@ private slots:
     void readsTheLeast();
     void refuses_data();
     void refuses();
+    void readsMembersInAnyOrder();
+    void readsEscapedKeys();
+    void lastOfEqualKeysCounts();
+    void readsMixedKeysOfCells();
+    void refusesWhatJsonForbids_data();
+    void refusesWhatJsonForbids();
+    void tellsTheLine();
+    void cancelsWhileItReads();
     void writesTheNewestVersion();
     void readsTheFirstVersion();
     void refusesDeepNesting_data();
@@ -244,6 +255,103 @@ void ZtSessionTest::readsTheLeast()
     QVERIFY(session.objects.isEmpty() && session.tables.isEmpty());
     QCOMPARE(parsed(file("\"image\":\"/else/a.png\"")).imagePath, text("/else/a.png"));
     QVERIFY(parsed("\xEF\xBB\xBF" + file("\"future\":{}")).objects.isEmpty());
+}
+
+void ZtSessionTest::readsMembersInAnyOrder()
+{
+    const ZtSession session =
+        parsed("{\"tables\":[{\"rows\":[[3,\"r\",[\"1\",null]]],\"values\":[{\"unit\":\"mm\",\"name\":\"a\"},"
+               "{\"name\":\"b\"}],\"future\":[1,{}],\"name\":\"A\"}],\"version\":1,"
+               "\"objects\":[{\"points\":[[0,0],[1,1]],\"future\":{\"id\":9},\"id\":5,\"type\":\"line\"}],"
+               "\"format\":\"statreport-session\"}");
+    QCOMPARE(cells(session), QStringList(text("A/3/r a=1 mm (1000)")));
+    QCOMPARE(session.objects.size(), 1);
+    QCOMPARE(session.objects.first().id, 5);
+}
+
+void ZtSessionTest::readsEscapedKeys()
+{
+    const ZtSession session =
+        parsed(table("\"r\\u006fws\":[[1,\"\\u00e4\\ud834\\udd1e\",{\"\\u0031\":\"\\u0032.5\"}]]"));
+    QCOMPARE(cells(session), QStringList(text("A/1/\xC3\xA4\xF0\x9D\x84\x9E b=2.5 (2.5)")));
+}
+
+void ZtSessionTest::lastOfEqualKeysCounts()
+{
+    const ZtSession session =
+        parsed(table("\"rows\":\"none\",\"rows\":[[1,null,{\"0\":\"x\",\"1\":\"7\",\"0\":\"2\"}]]"));
+    QCOMPARE(cells(session), (QStringList{text("A/1/ a=2 mm (2000)"), text("A/1/ b=7 (7)")}));
+    QCOMPARE(
+        parsed(file("\"micrometresPerPixel\":0,\"micrometresPerPixel\":2")).calibration.micrometresPerPixel(),
+        2.0);
+}
+
+void ZtSessionTest::readsMixedKeysOfCells()
+{
+    const ZtSession session = parsed(table("\"rows\":[[1,null,{\"1\":[\"7\",\"\"],\"0\":[\"2\",\"cm\"]}]]"));
+    QCOMPARE(cells(session), (QStringList{text("A/1/ a=2 cm (20000)"), text("A/1/ b=7 (7)")}));
+}
+
+void ZtSessionTest::refusesWhatJsonForbids_data()
+{
+    QTest::addColumn<QByteArray>("bytes");
+    QTest::newRow("garbage") << file("\"objects\":[]") + "x";
+    QTest::newRow("two sessions") << file("\"objects\":[]") + file("\"objects\":[]");
+    QTest::newRow("number alone") << QByteArray("1");
+    QTest::newRow("too large") << file("\"micrometresPerPixel\":1e400");
+    QTest::newRow("in what nobody reads") << file("\"future\":[1,]");
+    QTest::newRow("control character") << file("\"image\":\"a\nb\"");
+    QTest::newRow("no UTF-8") << file("\"image\":\"\xE4\"");
+    QTest::newRow("half a pair") << file("\"image\":\"\\ud834\"");
+    QTest::newRow("behind a newer version")
+        << QByteArray("{\"format\":\"statreport-session\",\"version\":99,");
+}
+
+void ZtSessionTest::refusesWhatJsonForbids()
+{
+    QFETCH(QByteArray, bytes);
+    ZtSession session;
+    ZtFault fault;
+    QVERIFY(!ZtSession::parse(bytes, text("s.json"), &session, &fault));
+    QVERIFY2(fault.text().startsWith(text("s.json:")), qPrintable(fault.text()));
+    QVERIFY2(fault.message.startsWith(text("The file is not valid JSON (")), qPrintable(fault.text()));
+}
+
+void ZtSessionTest::tellsTheLine()
+{
+    ZtSession session;
+    ZtFault fault;
+    QVERIFY(!ZtSession::parse("{\n\"format\": \"statreport-session\",\n\n\"version\": 1 2}", text("s.json"),
+                              &session, &fault));
+    QCOMPARE(fault.line, 4);
+}
+
+// Far from the end of what it does, in the middle of one list.
+void ZtSessionTest::cancelsWhileItReads()
+{
+    QByteArray rows;
+    for (int i = 1; i <= 200000; ++i)
+        rows += (i > 1 ? "," : "") + QByteArray("[") + QByteArray::number(i) + ",null,[\"1.5\",\"2\"]]";
+    const QByteArray bytes = table("\"rows\":[" + rows + "]");
+    for (const double share : {0.1, 0.5}) {
+        ZtProgress progress;
+        double seen = 0.0;
+        const auto canceller = ZtWorkerThread::begin([&progress, &seen, share]() {
+            QElapsedTimer clock;
+            clock.start();
+            while (progress.fraction() < share && clock.elapsed() < 30000)
+                std::this_thread::yield();
+            seen = progress.fraction();
+            progress.cancel();
+        });
+        ZtSession session;
+        ZtFault fault;
+        QVERIFY(!ZtSession::parse(bytes, text("s.json"), &session, &fault, &progress));
+        QVERIFY(canceller->wait(30000));
+        QVERIFY(fault.message == text("Reading was cancelled"));
+        QVERIFY(seen < 0.8);
+        QVERIFY(session.tables.isEmpty());
+    }
 }
 
 void ZtSessionTest::writesTheNewestVersion()
