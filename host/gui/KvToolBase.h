@@ -34,11 +34,11 @@ public:
                bool activated);
     ~KvToolBase() override;
 
-    QString title() const { return m_title; }
-    QString name() const { return objectName(); }
+    QString title() const { return m_title; }     ///< translated, as given
+    QString name() const { return objectName(); } ///< untranslated, as given
 
-    QToolButton *getToolButton() const;
-    void setToolIcon(const QIcon &icon);
+    QToolButton *getToolButton() const;  ///< null once it was deleted
+    void setToolIcon(const QIcon &icon); ///< the icon of the button
 
     /** Title row and, below it, the tool's widget. */
     QWidget *panel() const;
@@ -47,20 +47,20 @@ public:
      * away.
      */
     void setGuiWidget(QWidget *widget);
-    QWidget *guiWidget() const;
+    QWidget *guiWidget() const; ///< null when there is none
 
     /** Whether the panel offers the reset button; it does at first. */
     void setResetVisible(bool visible);
-    bool isResetVisible() const;
-    QToolButton *getResetButton() const;
+    bool isResetVisible() const;         ///< also while the panel is hidden
+    QToolButton *getResetButton() const; ///< null once it was deleted
 
     /**
      * Lets the user have the tool or not. A tool that is not enabled is not active; one that is enabled
      * becomes active with \a activate and stays as it is without.
      */
     void setEnabled(bool enabled, bool activate);
-    bool isEnabled() const;
-    bool isActivated() const;
+    bool isEnabled() const;   ///< whether the user may have the tool
+    bool isActivated() const; ///< whether the button is checked
 
 signals:
     void toolActivated(bool anActivated); ///< the button was checked or unchecked, by the user or by code
