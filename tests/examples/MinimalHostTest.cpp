@@ -30,6 +30,40 @@ Run runHost(const QStringList &arguments)
             QString::fromLocal8Bit(host.readAllStandardError())};
 }
 
+/// The code blocks of a guide, each as its lines without indentation.
+QVector<QStringList> codeBlocks(const QString &markdown)
+{
+    static const QRegularExpression pattern(QStringLiteral("```cpp\n(.*?)```"),
+                                            QRegularExpression::DotMatchesEverythingOption);
+    QVector<QStringList> blocks;
+    QRegularExpressionMatchIterator it = pattern.globalMatch(markdown);
+    while (it.hasNext()) {
+        QStringList lines;
+        for (const QString &line : it.next().captured(1).split(QLatin1Char('\n'), Qt::SkipEmptyParts))
+            lines.append(line.trimmed());
+        blocks.append(lines);
+    }
+    return blocks;
+}
+
+QString textOf(const QString &path)
+{
+    QFile file(path);
+    return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
+}
+
+QStringList linesOfTheExample()
+{
+    QStringList lines;
+    for (const char *name : {"main.cpp", "ScratchImage.h", "ScratchManipulator.h"}) {
+        const QString text =
+            textOf(StatReportTest::sourcePath(QStringLiteral("examples/minimalhost/") + QLatin1String(name)));
+        for (const QString &line : text.split(QLatin1Char('\n')))
+            lines.append(line.trimmed());
+    }
+    return lines;
+}
+
 } // namespace
 
 /** The example program of the host SDK, run as its users run it. */
@@ -41,6 +75,7 @@ private slots:
     void findsTheToolOfThePlugin();
     void failsWithoutPlugins();
     void passesOverOtherFiles();
+    void isWhatTheGuideShows();
 };
 
 void MinimalHostTest::findsTheToolOfThePlugin_data()
@@ -81,6 +116,23 @@ void MinimalHostTest::passesOverOtherFiles()
     const Run run = runHost({QStringLiteral("--check"), folder});
     QVERIFY2(run.errors.startsWith(QLatin1String("notes.txt: ")), qPrintable(run.errors));
     QCOMPARE(run.exitCode, 1);
+}
+
+void MinimalHostTest::isWhatTheGuideShows()
+{
+    const QVector<QStringList> blocks = codeBlocks(textOf(sourcePath(QStringLiteral("docs/host-sdk.md"))));
+    QStringList example = linesOfTheExample();
+    example.append(QStringLiteral("...")); // stands for what an excerpt leaves out
+    int shown = 0;
+    for (const QStringList &block : blocks) {
+        // Of hosts that open files of tools; the example has no files.
+        if (block.join(QLatin1Char(' ')).contains(QLatin1String("opensFile")))
+            continue;
+        for (const QString &line : block)
+            QVERIFY2(example.contains(line), qPrintable(line));
+        ++shown;
+    }
+    QVERIFY(shown >= 6);
 }
 
 STATREPORT_TEST_MAIN(MinimalHostTest)
