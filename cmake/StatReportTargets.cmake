@@ -29,6 +29,8 @@ function(statreport_host_library name)
   target_include_directories(${name} PUBLIC $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/host>)
   target_link_libraries(${name} PUBLIC ${ARG_PUBLIC} PRIVATE ${ARG_PRIVATE})
   set_target_properties(${name} PROPERTIES VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR})
+  # The name that the installed package gives it, for examples that are built here and there.
+  add_library(StatReport::${name} ALIAS ${name})
   statreport_common_flags(${name})
 endfunction()
 

@@ -26,10 +26,10 @@ class ZT_COMMON_EXPORT ZtStatusLog : public QObject
 {
     Q_OBJECT
 public:
-    static ZtStatusLog *getInstance();
+    static ZtStatusLog *getInstance(); ///< made at the first call
 
-    const QVector<ZtStatusEntry> &entries() const { return m_entries; }
-    void clear();
+    const QVector<ZtStatusEntry> &entries() const { return m_entries; } ///< oldest first
+    void clear();                                                       ///< emits signalCleared()
 
     /** The log keeps the newest \a count entries (1 at least; 10000 at first). */
     void setCapacity(int count);
@@ -57,15 +57,17 @@ private:
 class ZT_COMMON_EXPORT ZtAppStatus
 {
 public:
+    /** How grave a status is. */
     enum Category { NoCategory = 0, Information = 1, Warning = 2, Error = 3 };
+    /** Where a status is best shown. */
     enum Destination { AnyDestination = 0, LogFile = 1, StatusBar = 2, MessageBox = 3, StatusPanel = 4 };
 
-    explicit ZtAppStatus(int category = NoCategory, int code = 0);
+    explicit ZtAppStatus(int category = NoCategory, int code = 0); ///< logs nothing yet
 
-    int category() const { return m_category; }
-    int code() const { return m_code; }
-    int preferredDestination() const { return m_destination; }
-    QString message() const { return m_message; }
+    int category() const { return m_category; }                ///< Category, or the caller's own
+    int code() const { return m_code; }                        ///< of the caller, 0 for none
+    int preferredDestination() const { return m_destination; } ///< Destination
+    QString message() const { return m_message; }              ///< translated, of the last status logged
 
     /** Where the caller would like the user to see the status; the host may show it elsewhere too. */
     void setPreferredDestination(int destination) { m_destination = destination; }

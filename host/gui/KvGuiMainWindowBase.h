@@ -14,6 +14,7 @@ class ZT_GUI_EXPORT KvGuiMainWindowBase : public QMainWindow
 {
     Q_OBJECT
 public:
+    /** A window without tools and central widget. */
     explicit KvGuiMainWindowBase(QWidget *parent = nullptr, Qt::WindowFlags flags = Qt::WindowFlags());
     ~KvGuiMainWindowBase() override;
 

@@ -35,11 +35,11 @@ public:
                bool activated);
     ~KvToolBase() override;
 
-    QString title() const { return m_title; }
-    QString name() const { return objectName(); }
+    QString title() const { return m_title; }     ///< translated, as given
+    QString name() const { return objectName(); } ///< untranslated, as given
 
-    QToolButton *getToolButton() const;
-    void setToolIcon(const QIcon &icon);
+    QToolButton *getToolButton() const;  ///< null once it was deleted
+    void setToolIcon(const QIcon &icon); ///< the icon of the button
 
     /** Title row and, below it, the tool's widget. */
     QWidget *panel() const;
@@ -48,28 +48,28 @@ public:
      * away.
      */
     void setGuiWidget(QWidget *widget);
-    QWidget *guiWidget() const;
+    QWidget *guiWidget() const; ///< null when there is none
 
     /** Whether the panel offers the reset button; it does at first. */
     void setResetVisible(bool visible);
-    bool isResetVisible() const;
-    QToolButton *getResetButton() const;
+    bool isResetVisible() const;         ///< also while the panel is hidden
+    QToolButton *getResetButton() const; ///< null once it was deleted
 
     /**
      * Lets the user have the tool or not. A tool that is not enabled is not active; one that is enabled
      * becomes active with \a activate and stays as it is without.
      */
     void setEnabled(bool enabled, bool activate);
-    bool isEnabled() const;
-    bool isActivated() const;
+    bool isEnabled() const;   ///< whether the user may have the tool
+    bool isActivated() const; ///< whether the button is checked
 
     /**
      * Kinds of files that the tool opens when the user gives one to the program, by a double click or a drop:
      * suffixes without a dot, compared without regard to case. None at first.
      */
     void setFileSuffixes(const QStringList &suffixes) { m_fileSuffixes = suffixes; }
-    QStringList fileSuffixes() const { return m_fileSuffixes; }
-    bool opensFile(const QString &path) const;
+    QStringList fileSuffixes() const { return m_fileSuffixes; } ///< as they were set
+    bool opensFile(const QString &path) const;                  ///< whether the file is of the tool's kinds
     /** Has the tool open a file (fileGiven()); it becomes active. A tool that is not enabled does nothing. */
     void openFile(const QString &path);
 

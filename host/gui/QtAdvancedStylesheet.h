@@ -30,7 +30,7 @@ class ZT_GUI_EXPORT QtAdvancedStylesheet : public QObject
 {
     Q_OBJECT
 public:
-    static QtAdvancedStylesheet *getInstance();
+    static QtAdvancedStylesheet *getInstance(); ///< made at the first call
 
     /** "Dark" and "Light". */
     QStringList themes() const;

@@ -8,15 +8,15 @@
 #include <QString>
 
 /**
- * Finds the characters that no installed font can draw. Such characters vanish from a page without a word, so whoever
- * makes a report asks first. Texts are collected, then checked at once.
+ * Finds the characters that no installed font can draw. Such characters vanish from a page without a word, so
+ * whoever makes a report asks first. Texts are collected, then checked at once.
  */
 class ZT_GUI_EXPORT ZtFontCoverage
 {
 public:
-    explicit ZtFontCoverage(const QFont &font);
+    explicit ZtFontCoverage(const QFont &font); ///< the font that the texts are drawn with
 
-    void addText(const QString &text);
+    void addText(const QString &text); ///< remembers the characters, each once
     /** The characters of all texts that neither the font nor any substitute has, by code point. */
     QString missingCharacters() const;
 

@@ -37,16 +37,17 @@ class ZT_KERNEL_EXPORT ZtAppSettings : public QObject
 {
     Q_OBJECT
 public:
-    static ZtAppSettings *getInstance();
+    static ZtAppSettings *getInstance(); ///< made at the first call
 
-    static void beginGroup(const QString &group);
-    static void beginGroupAbsolute(const QString &group);
-    static void endGroup();
+    static void beginGroup(const QString &group);         ///< relative to what is open
+    static void beginGroupAbsolute(const QString &group); ///< at the root of the file
+    static void endGroup(); ///< closes the innermost group; warns when none is open
 
+    /** The value in the open group, or \a defaultValue. Numbers and flags may come back as their texts. */
     static QVariant value(const QString &key, const QVariant &defaultValue = QVariant());
     /** Stores a value; a real change is announced by signalValuesModified() once no group is open. */
     static void setValue(const QString &key, const QVariant &value);
-    static bool contains(const QString &key);
+    static bool contains(const QString &key); ///< whether the open group has a value
     /** Keys of the values that lie directly in the open group, sorted. */
     static QStringList childKeys();
     /** Removes a value and the group of the same name; an empty \a key empties the open group. */
@@ -57,9 +58,9 @@ public:
     /** The same for any locale; "English" for a language without a translation. */
     static QString getLanguageName(const QLocale &locale);
 
-    static QString getProgramName();
-    static QString getProgramVersion();
-    static QString getVendor();
+    static QString getProgramName();    ///< for reports and windows
+    static QString getProgramVersion(); ///< as text, e.g. "1.2.0"
+    static QString getVendor();         ///< who makes the program
     /** What the three getters above answer; empty texts fall back to QCoreApplication's. */
     static void setProgramInfo(const QString &name, const QString &version, const QString &vendor);
 
@@ -71,13 +72,13 @@ public:
      * the user's configuration folder.
      */
     void setStoragePath(const QString &path);
-    QString storagePath() const { return m_path; }
+    QString storagePath() const { return m_path; } ///< empty while in memory only
     /** Writes pending changes to the file; false when it cannot be written (the changes stay pending). */
     bool sync();
 
     /** Profile names, sorted; the default profile has an empty name and is always there. */
     QStringList profiles() const;
-    QString currentProfile() const;
+    QString currentProfile() const; ///< empty for the default profile
     /**
      * Switches to a profile, which need not have values yet; emits signalProfileChanged() on a change. Groups
      * that are open stay in the profile they were opened in.
@@ -87,7 +88,7 @@ public:
 signals:
     /** Keys without their groups, each once per group, and their new values (invalid for a removed one). */
     void signalValuesModified(QStringList aKeys, QList<QVariant> aVals);
-    void signalProfileChanged();
+    void signalProfileChanged(); ///< any value may be another one now
 
 private slots:
     void slotAboutToQuit();

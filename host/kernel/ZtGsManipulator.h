@@ -29,7 +29,7 @@ public:
 
     virtual ~ZtGsManipulator();
 
-    virtual int objectTypeId() const = 0;
+    virtual int objectTypeId() const = 0; ///< the id it is registered under
     /** Flags of the type. \a reserved is 0. */
     virtual int typeFlags(int reserved) const = 0;
     /** Display name of the type, translated. \a id allows names that differ per object. */
@@ -59,12 +59,12 @@ public:
     QString getObjectName(int id) const;
     /** Gives object \a id a name of its own; an empty \a name takes it away. */
     void setObjectName(int id, const QString &name);
-    void clearObjectNames() { m_objectNames.clear(); }
+    void clearObjectNames() { m_objectNames.clear(); } ///< all back to the type's name and the id
 
 protected:
     ZtGsManipulator() = default;
-    explicit ZtGsManipulator(const QStringList &valueNames);
-    void setValueNames(const QStringList &valueNames) { m_valueNames = valueNames; }
+    explicit ZtGsManipulator(const QStringList &valueNames);                         ///< in their fixed order
+    void setValueNames(const QStringList &valueNames) { m_valueNames = valueNames; } ///< see getValueNames()
 
 private:
     Q_DISABLE_COPY(ZtGsManipulator)

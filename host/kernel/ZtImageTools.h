@@ -12,7 +12,7 @@ class ZtImage;
 class ZT_KERNEL_EXPORT ZtImageTools
 {
 public:
-    static ZtImageTools *getInstance();
+    static ZtImageTools *getInstance(); ///< made at the first call
 
     /**
      * Draws the objects of ZtKernelData onto \a image, as the application shows them. On large pictures lines

@@ -26,11 +26,11 @@ using ZtObjectMap = QMap<int, ZtKernelObjectData *>;
 class ZT_KERNEL_EXPORT ZtKernelData
 {
 public:
-    static ZtKernelData *getInstance();
+    static ZtKernelData *getInstance(); ///< made at the first call
 
     /** All objects: object type id, then object id. */
     const QMap<int, ZtObjectMap> &objects() const { return m_objects; }
-    ZtKernelObjectData *object(int type, int id) const;
+    ZtKernelObjectData *object(int type, int id) const; ///< null when there is none
 
     /** The manipulator of an object type, or null. */
     ZtGsManipulator *getGsManipulator(int type) const;

@@ -9,11 +9,11 @@
 class ZT_KERNEL_EXPORT ZtKernelObjectDataDescr
 {
 public:
-    ZtKernelObjectDataDescr(int type, const QString &key);
+    ZtKernelObjectDataDescr(int type, const QString &key); ///< see the two getters
     virtual ~ZtKernelObjectDataDescr();
 
-    int objectType() const { return m_type; }
-    QString key() const { return m_key; }
+    int objectType() const { return m_type; } ///< the id that the type is registered under
+    QString key() const { return m_key; }     ///< untranslated, never changed once files have it
 
 private:
     int m_type;

@@ -10,6 +10,7 @@
 class ZT_KERNEL_EXPORT ZtMediaInfo
 {
 public:
+    /** What a file holds. */
     enum MediaType { UnknownMedia = -1, Image = 0, Video = 1 };
 
     /**

@@ -14,10 +14,12 @@ class ZT_KERNEL_EXPORT ZtSignalCenter : public QObject
 {
     Q_OBJECT
 public:
-    static ZtSignalCenter *getInstance();
+    static ZtSignalCenter *getInstance(); ///< made at the first call
 
 signals:
+    /** An object was added to ZtKernelData, where it is by now. */
     void signalObjectCreated(const int aType, const int aIndex, const ZtKernelObjectData *aObject);
+    /** An object was edited (ZtKernelData::notifyObjectChanged()). */
     void signalObjectChanged(int aType, int aIndex, const ZtKernelObjectData *aObject);
     /** The object is already gone from ZtKernelData. */
     void signalObjectRemoved(const int aType, const int aIndex);

@@ -11,7 +11,7 @@ class ZT_KERNEL_EXPORT iZTKernelImage : public QObject
 {
     Q_OBJECT
 public:
-    explicit iZTKernelImage(QObject *parent = nullptr);
+    explicit iZTKernelImage(QObject *parent = nullptr); ///< no frame of its own
     ~iZTKernelImage() override;
 
     /**
