@@ -117,6 +117,9 @@ constexpr Definition definitions[] = {
      QT_TRANSLATE_NOOP("KvDeskActions", "Change between the dark and the light theme"), "theme", "F8", false},
     {KvDeskActions::Settings, QT_TRANSLATE_NOOP("KvDeskActions", "S&ettings..."),
      QT_TRANSLATE_NOOP("KvDeskActions", "Settings"), "settings", "Ctrl+,", false},
+    {KvDeskActions::StartPage, QT_TRANSLATE_NOOP("KvDeskActions", "&Start page"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Show the first steps, the examples and the recent sessions"), nullptr,
+     nullptr, false},
     {KvDeskActions::About, QT_TRANSLATE_NOOP("KvDeskActions", "&About Measuring Desk"),
      QT_TRANSLATE_NOOP("KvDeskActions", "About Measuring Desk"), "about", nullptr, false},
 };

@@ -16,8 +16,8 @@
 #include "measuring/ZtMeasuringDocument.h"
 #include "measuring/ZtObjectsPainter.h"
 
+#include <QApplication>
 #include <QGraphicsScene>
-#include <QGuiApplication>
 #include <QLabel>
 #include <QMouseEvent>
 #include <QScrollBar>
@@ -188,11 +188,39 @@ void KvDeskImageView::slotThemeChanged()
     m_overlay->slotLabelsChanged();
 }
 
+bool KvDeskImageView::isAnythingOpen() const
+{
+    return !m_frame.isNull() || places().index().size() > 0;
+}
+
+void KvDeskImageView::updateStart()
+{
+    const bool isShown = m_isStartWanted || !isAnythingOpen();
+    // Whoever loses the keyboard with the page gets it back here.
+    if (!isShown && m_emptyState->isAncestorOf(QApplication::focusWidget()))
+        setFocus();
+    m_emptyState->setVisible(isShown);
+}
+
+void KvDeskImageView::slotShowStart()
+{
+    m_isStartWanted = true;
+    updateStart();
+    m_emptyState->setFocus();
+}
+
+void KvDeskImageView::slotHideStart()
+{
+    m_isStartWanted = false;
+    updateStart();
+}
+
 void KvDeskImageView::refreshContent()
 {
     const QRectF objects = places().index().bounds();
-    m_emptyState->setVisible(m_frame.isNull() && places().index().size() == 0);
+    updateStart();
     const QRectF content = m_frame.isNull() ? objects : KvDeskObjectIndex::united(m_frame.sceneRect(), objects);
+    emit signalContentChanged();
     if (content == m_content && !m_isFitted)
         return;
     m_content = content;
