@@ -197,23 +197,31 @@ def template(nodes, header="", footer="", page_numbers=True):
             "footer": section(footer, bool(footer)), "pageNumbering": section("", page_numbers), "nodes": nodes}
 
 
+def gap(points):
+    return f'<p style="margin-top:0px; margin-bottom:0px; font-size:{points}pt;">&nbsp;</p>'
+
+
 def title_block(title, subtitle):
     return text_block(
         paragraph(title, "font-size:26pt; font-weight:600; margin-bottom:2px;"),
-        paragraph(subtitle, f"font-size:13pt; color:{ACCENT}; margin-bottom:0px;"),
-        paragraph("", "margin-bottom:0px;"))
+        paragraph(subtitle, f"font-size:13pt; color:{ACCENT}; margin-bottom:0px;"), gap(6))
 
 
-def heading(text):
-    return text_block(paragraph("", "margin-bottom:0px; font-size:6pt;"),
-                      paragraph(text, "font-size:15pt; font-weight:600; margin-bottom:4px;"))
+def heading(title, *paragraphs):
+    """A title with what belongs below it: both are on the same page."""
+    return text_block(gap(8), paragraph(title, "font-size:15pt; font-weight:600; margin-bottom:6px;"), *paragraphs)
+
+
+def remarks(title, lines):
+    """Room to write by hand or on the screen."""
+    return heading(title, *[paragraph("\u2026" * 62, f"color:{GREY}; margin-bottom:12px;") for _ in range(lines)])
 
 
 def fields(*rows):
     """What a report is about: names in grey, and values beside them, to be filled in where they are dots."""
     lines = "".join(f'<tr><td width="170" style="padding:3px 12px 3px 0px; color:{GREY};">{name}</td>'
                     f'<td style="padding:3px 0px;">{value}</td></tr>' for name, value in rows)
-    return text_block(f'<table cellspacing="0" cellpadding="0" width="100%">{lines}</table>', paragraph(""))
+    return text_block(f'<table cellspacing="0" cellpadding="0" width="100%">{lines}</table>', gap(8))
 
 
 def signatures(*roles):
@@ -221,8 +229,7 @@ def signatures(*roles):
     cells = '<td width="6%"></td>'.join(
         f'<td width="{(100 - 6 * (len(roles) - 1)) // len(roles)}%" style="{line} padding-top:4px; color:{GREY};">'
         f"{role}</td>" for role in roles)
-    return text_block(paragraph("", "margin-bottom:60px;"),
-                      f'<table cellspacing="0" cellpadding="0" width="100%"><tr>{cells}</tr></table>')
+    return text_block(gap(26), f'<table cellspacing="0" cellpadding="0" width="100%"><tr>{cells}</tr></table>')
 
 
 def running_head(text):
@@ -247,27 +254,33 @@ def laboratory_templates(foot):
             title_block("Measurement protocol", "Image, statistics and every single value"),
             fields(("Sample", BLANK), ("Order", BLANK), ("Operator", BLANK), ("Instrument", BLANK),
                    ("Printed", PRINTED)),
-            heading("1 \u2002 Procedure"),
-            text_block(text("Describe here how the sample was prepared, which lens and which light were used, and how "
-                            "the image was calibrated. The objects that were measured are drawn on the image below.")),
-            heading("2 \u2002 Image"), camera_image(80, True),
-            heading("3 \u2002 Statistics"), statistics_table(widthPercent=100),
-            heading("4 \u2002 Measured values"), measurements_table()],
+            heading(
+                "1 \u2002 Procedure",
+                text("Describe here how the sample was prepared, which lens and which light were used, and how "
+                     "the image was calibrated. The objects that were measured are drawn on the image."), gap(6)),
+            camera_image(56, True),
+            heading(
+                "2 \u2002 Results",
+                text("Statistics of each kind of value. The table after it lists every single value, in the order in "
+                     "which it was measured."), gap(6)),
+            statistics_table(widthPercent=100), text_block(gap(12)), measurements_table()],
             running_head("Measurement protocol \u00b7 ${CREATION_DATE_ISO}"), foot),
         "counting": template([
             title_block("Counting report", "Objects counted on the image, by class"),
             fields(("Sample", BLANK), ("Counted by", BLANK), ("Printed", PRINTED)),
-            camera_image(70, True),
-            heading("Counts"), measurements_table(columns="Object Name;Value", widthPercent=50),
-            heading("Shares"), chart("Counters", widthPercent=70)],
+            camera_image(56, True),
+            heading("Counts and shares"),
+            measurements_table(columns="Object Name;Value Name;Value", widthPercent=75),
+            text_block(gap(6)), chart("Counters", widthPercent=56)],
             "", foot),
         "trend": template([
             title_block("Trend report", "Measured values in their order, and their spread"),
             fields(("Series", BLANK), ("Printed", PRINTED)),
-            heading("Values in the order of measurement"), chart("Trend", groupBy=1, widthPercent=100),
-            heading("Spread"), chart("MinMedMaxBox", groupBy=1, widthPercent=100),
+            chart("Trend", groupBy=1, widthPercent=100),
             heading("Statistics"), statistics_table(widthPercent=100),
-            heading("Image"), camera_image(80, True)],
+            remarks("Assessment", 4),
+            chart("MinMedMaxBox", groupBy=1, widthPercent=100),
+            heading("Image"), camera_image(75, True)],
             running_head("Trend report \u00b7 ${CREATION_DATE_ISO}"), foot),
         "certificate": template([
             text_block(f'<p><img width="66" src="{emblem()}" /></p>'),
@@ -277,8 +290,8 @@ def laboratory_templates(foot):
                    ("Measured with", "${PROGRAM_NAME}, version ${PROGRAM_VERSION}"),
                    ("Software by", "${PROGRAM_VENDOR}")),
             text_block(text("The object named above was measured on a calibrated image. The results below apply to this "
-                            "object only, in the state in which it was received.")),
-            camera_image(45, True), heading("Results"), statistics_table(widthPercent=100),
+                            "object only, in the state in which it was received."), gap(6)),
+            camera_image(38, True), heading("Results"), statistics_table(widthPercent=100),
             signatures("Place and date", "Measured by", "Approved by")],
             "", running_head("This certificate may be copied only as a whole. \u2003 " + ISSUER)),
     }
