@@ -263,7 +263,7 @@ def laboratory_templates(foot):
                 "2 \u2002 Results",
                 text("Statistics of each kind of value. The table after it lists every single value, in the order in "
                      "which it was measured."), gap(6)),
-            statistics_table(widthPercent=100), text_block(gap(12)), measurements_table()],
+            statistics_table(widthPercent=100), measurements_table()],
             running_head("Measurement protocol \u00b7 ${CREATION_DATE_ISO}"), foot),
         "counting": template([
             title_block("Counting report", "Objects counted on the image, by class"),

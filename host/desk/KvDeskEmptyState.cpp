@@ -2,11 +2,14 @@
 #include "KvDeskEmptyState.h"
 
 #include "KvDeskActionButton.h"
+#include "gui/QtAdvancedStylesheet.h"
 
 #include <QAction>
 #include <QEvent>
 #include <QHBoxLayout>
 #include <QLabel>
+#include <QPaintEvent>
+#include <QPainter>
 #include <QScrollArea>
 #include <QVBoxLayout>
 
@@ -71,8 +74,8 @@ void KvDeskEmptyState::setContent(QWidget *content)
     m_scrollArea->viewport()->setAutoFillBackground(false);
     content->setAutoFillBackground(false);
     m_scrollArea->setGeometry(rect());
-    // What lies below it need not be empty.
-    setAutoFillBackground(true);
+    // What is hidden below it is not meant.
+    setAttribute(Qt::WA_NoMousePropagation);
 }
 
 bool KvDeskEmptyState::eventFilter(QObject *watched, QEvent *event)
@@ -80,6 +83,14 @@ bool KvDeskEmptyState::eventFilter(QObject *watched, QEvent *event)
     if (watched == parent() && event->type() == QEvent::Resize)
         setGeometry(parentWidget()->rect());
     return QWidget::eventFilter(watched, event);
+}
+
+// What lies below a page need not be empty.
+void KvDeskEmptyState::paintEvent(QPaintEvent *event)
+{
+    if (hasContent())
+        QPainter(this).fillRect(event->rect(),
+                                acss::QtAdvancedStylesheet::getInstance()->color(QStringLiteral("window")));
 }
 
 void KvDeskEmptyState::resizeEvent(QResizeEvent *event)

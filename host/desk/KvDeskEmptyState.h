@@ -22,9 +22,11 @@ public:
     void addAction(QAction *action, bool isPrimary);
     /** Shows a whole page in place of text and buttons, and scrolls it where there is too little room. */
     void setContent(QWidget *content);
+    bool hasContent() const { return m_scrollArea != nullptr; }
 
 protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
+    void paintEvent(QPaintEvent *event) override;
     void resizeEvent(QResizeEvent *event) override;
 
 private:

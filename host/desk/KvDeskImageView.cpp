@@ -200,6 +200,7 @@ void KvDeskImageView::updateStart()
     if (!isShown && m_emptyState->isAncestorOf(QApplication::focusWidget()))
         setFocus();
     m_emptyState->setVisible(isShown);
+    placeRulers();
 }
 
 void KvDeskImageView::slotShowStart()
@@ -600,9 +601,10 @@ void KvDeskImageView::placeRulers()
     m_topRuler->setGeometry(side, 0, qMax(0, width() - side), side);
     m_leftRuler->setGeometry(0, side, side, qMax(0, height() - side));
     m_rulerCorner->setGeometry(0, 0, side, side);
+    const bool isPageShown = m_emptyState->hasContent() && !m_emptyState->isHidden();
     const QList<QWidget *> rulers{m_topRuler, m_leftRuler, m_rulerCorner};
     for (QWidget *const ruler : rulers)
-        ruler->setVisible(m_areRulersVisible);
+        ruler->setVisible(m_areRulersVisible && !isPageShown);
     slotUpdateRulers();
 }
 

@@ -4,6 +4,7 @@
 #include "KvDeskEmptyState.h"
 #include "KvDeskObjectEditor.h"
 #include "KvDeskPanelHeader.h"
+#include "KvDeskReason.h"
 #include "KvDeskSelectionStatistics.h"
 #include "KvDeskTableView.h"
 #include "KvDeskValueCommands.h"
@@ -202,7 +203,7 @@ void KvDeskValueTable::updateEmptyStates()
     m_emptyState->setVisible(isEmpty);
     m_noMatchState->setVisible(!isEmpty && m_sorted->rowCount() == 0);
     m_view->horizontalHeader()->setVisible(!isEmpty);
-    m_filter->setEnabled(!isEmpty || m_sorted->isFiltered());
+    KvDeskReason::setPossible(m_filter, !isEmpty || m_sorted->isFiltered(), tr("There are no measured values yet"));
     header()->setNote(note());
 }
 
