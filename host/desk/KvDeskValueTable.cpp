@@ -91,7 +91,7 @@ void KvDeskValueTable::createFilter()
 void KvDeskValueTable::createEmptyStates()
 {
     m_emptyState = new KvDeskEmptyState(
-        tr("Measured values appear here once a session is opened or a table is imported"),
+        tr("Measured values appear here once something is measured or imported"),
         m_view->viewport());
     m_noMatchState = new KvDeskEmptyState(tr("No measured value matches the filter"), m_view->viewport());
     auto *const clear = new QAction(tr("Clear the filter"), this);

@@ -19,6 +19,7 @@
 #include "support/FileDialogAnswerer.h"
 
 #include <QAction>
+#include <QButtonGroup>
 #include <QDir>
 #include <QFile>
 #include <QMessageBox>
@@ -34,14 +35,14 @@ class Screenshots
 {
 public:
     Screenshots(const QString &examples, const QString &theme, const QString &folder)
-        : m_examples(examples)
+        : m_examples(QDir(examples).absolutePath())
         , m_theme(theme)
         , m_folder(folder)
     {
         ZtAppSettings::getInstance()->setStoragePath(QString());
         KvDeskTheme::store(theme);
-        KvDeskGallerySettings::setSnapshotsFolder(examples + QStringLiteral("/pictures"));
-        KvDeskFirstTemplates::offer(examples + QStringLiteral("/templates"));
+        KvDeskGallerySettings::setSnapshotsFolder(m_examples + QStringLiteral("/pictures"));
+        KvDeskFirstTemplates::offer(m_examples + QStringLiteral("/templates"));
         m_desk = std::make_unique<RunningDesk>();
         m_desk->window()->resize(1280, 800);
     }
@@ -80,6 +81,9 @@ private:
         window->resize(800, 520);
         take(window, QStringLiteral("desk-start-small"));
         window->resize(1280, 800);
+        // Before there are objects: then nothing asks to be saved.
+        window->sources()->open(ZtFrameSourceCatalogue::infoOfPath(m_examples + QStringLiteral("/pictures")));
+        take(window, QStringLiteral("desk-live"));
         for (const char *const name : {"coin", "cells", "fibres", "demo"}) {
             files()->openCopy(session(name));
             take(window, QStringLiteral("desk-%1").arg(QLatin1String(name)));
@@ -96,9 +100,6 @@ private:
         action(KvDeskActions::ShowGallery)->trigger();
         action(KvDeskActions::ShowLog)->trigger();
         action(KvDeskActions::SelectTool)->trigger();
-        window->sources()->open(ZtFrameSourceCatalogue::infoOfPath(m_examples + QStringLiteral("/pictures")));
-        take(window, QStringLiteral("desk-live"));
-        files()->openCopy(session("demo"));
         take(m_desk->window()->toolColumn(), QStringLiteral("panel-report"));
     }
 
@@ -117,12 +118,11 @@ private:
         for (QWidget *const widget : QApplication::topLevelWidgets()) {
             if (!widget->inherits("KvDeskCalibrationDialog"))
                 continue;
-            auto *const ways = widget->findChild<QComboBox *>();
-            for (int i = 0; ways && i < ways->count(); ++i) {
-                ways->setCurrentIndex(i);
-                take(widget, QStringLiteral("dialog-calibration-%1").arg(i + 1));
+            int count = 0;
+            for (QAbstractButton *const way : widget->findChild<QButtonGroup *>()->buttons()) {
+                way->click();
+                take(widget, QStringLiteral("dialog-calibration-%1").arg(++count));
             }
-            take(m_desk->window(), QStringLiteral("desk-calibration"));
             widget->close();
         }
     }
@@ -167,15 +167,19 @@ private:
 
     void takeStatistics()
     {
+        files()->openCopy(session("fibres"));
         m_desk->button("theStatisticsButton")->click();
         QWidget *const window = m_desk->statisticsWindow();
         window->resize(1280, 800);
-        int count = 0;
-        for (QWidget *const button : window->findChildren<QWidget *>()) {
-            if (!button->inherits("KvStatisticsToolIconButton"))
-                continue;
-            QTest::mouseClick(button, Qt::LeftButton);
-            take(window, QStringLiteral("statistics-%1").arg(++count));
+        // Collected first: showing another chart deletes what belonged to the one before.
+        QList<QWidget *> buttons;
+        for (QWidget *const widget : window->findChildren<QWidget *>()) {
+            if (widget->inherits("KvStatisticsToolIconButton"))
+                buttons.append(widget);
+        }
+        for (int i = 0; i < buttons.size(); ++i) {
+            QTest::mouseClick(buttons.at(i), Qt::LeftButton);
+            take(window, QStringLiteral("statistics-%1").arg(i + 1));
         }
         window->close();
     }
