@@ -73,6 +73,7 @@ void KvDeskEmptyState::setContent(QWidget *content)
     m_scrollArea->setWidget(content);
     m_scrollArea->viewport()->setAutoFillBackground(false);
     content->setAutoFillBackground(false);
+    setFocusProxy(content);
     m_scrollArea->setGeometry(rect());
     // What is hidden below it is not meant.
     setAttribute(Qt::WA_NoMousePropagation);

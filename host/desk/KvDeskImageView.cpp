@@ -16,8 +16,8 @@
 #include "measuring/ZtMeasuringDocument.h"
 #include "measuring/ZtObjectsPainter.h"
 
-#include <QApplication>
 #include <QGraphicsScene>
+#include <QGuiApplication>
 #include <QLabel>
 #include <QMouseEvent>
 #include <QScrollBar>
@@ -197,7 +197,7 @@ void KvDeskImageView::updateStart()
 {
     const bool isShown = m_isStartWanted || !isAnythingOpen();
     // Whoever loses the keyboard with the page gets it back here.
-    if (!isShown && m_emptyState->isAncestorOf(QApplication::focusWidget()))
+    if (!isShown && m_emptyState->isAncestorOf(window()->focusWidget()))
         setFocus();
     m_emptyState->setVisible(isShown);
     placeRulers();

@@ -119,7 +119,8 @@ KvDeskMainWindow::KvDeskMainWindow(ZtMeasuringDocument *document, QWidget *paren
     m_imageView->setDocument(document);
     restoreWindow();
     slotStateChanged();
-    m_imageView->setFocus();
+    // Tab goes to its buttons, and the image takes the keyboard when there is one.
+    m_startPage->setFocus();
 }
 
 KvDeskMainWindow::~KvDeskMainWindow() = default;

@@ -177,8 +177,13 @@ void KvDeskStartPageTest::shownWhileNothingIsOpen()
 {
     openWindow();
     QVERIFY(!m_window->startPage()->backButton()->isVisible());
+    m_window->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+    QVERIFY(m_window->startPage()->isAncestorOf(QApplication::focusWidget()));
     QVERIFY(m_window->files()->openImage(DeskFiles::image(QStringLiteral("a.png"))));
     QTRY_VERIFY(!state()->isVisible());
+    QVERIFY(m_window->imageView()->hasFocus());
     m_window->actions()->action(KvDeskActions::NewSession)->trigger();
     QTRY_VERIFY(state()->isVisible());
 }
@@ -208,6 +213,12 @@ void KvDeskStartPageTest::shownOverTheImage()
     QVERIFY(m_window->startPage()->backButton()->isVisible());
     m_window->startPage()->backButton()->click();
     QVERIFY(!state()->isVisible());
+    m_window->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    m_window->actions()->action(KvDeskActions::StartPage)->trigger();
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
+    QVERIFY(!state()->isVisible());
+    QVERIFY(m_window->imageView()->hasFocus());
     m_window->actions()->action(KvDeskActions::StartPage)->trigger();
     m_window->startPage()->exampleButtons().first()->setFocus();
     QTest::keyClick(m_window->startPage()->exampleButtons().first(), Qt::Key_Escape);
