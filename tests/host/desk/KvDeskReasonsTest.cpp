@@ -31,6 +31,7 @@ private slots:
 
     void everyState_data();
     void everyState();
+    void reasonsComeAndGo();
 
 private:
     enum State { Nothing, ImageOnly, NothingSelected, OneSelected, Live };
@@ -40,11 +41,15 @@ private:
     void lookAt(const QAction *action);
     void lookAt(const QWidget *widget);
     void lookAtDialogs();
+    void lookAtCommands();
+    void note(const QString &what, bool isEnabled, const QString &toolTip, const QString &name);
 
     std::unique_ptr<ZtMeasuringDocument> m_document;
     std::unique_ptr<KvDeskMainWindow> m_window;
     QStringList m_silent; ///< what cannot be used and says nothing
     int m_disabled = 0;
+    QMap<QString, QString> m_enabledTips; ///< of all states so far
+    QMap<QString, QString> m_disabledTips;
 };
 
 namespace {
@@ -109,27 +114,47 @@ void KvDeskReasonsTest::enter(State state)
                  state == NothingSelected || state == OneSelected);
 }
 
-void KvDeskReasonsTest::lookAt(const QAction *action)
+void KvDeskReasonsTest::note(const QString &what, bool isEnabled, const QString &toolTip, const QString &name)
 {
-    if (action->isEnabled() || action->isSeparator() || action->text().isEmpty())
+    (isEnabled ? m_enabledTips : m_disabledTips).insert(what, toolTip);
+    if (isEnabled)
         return;
     ++m_disabled;
-    // An entry that stands for none, such as "None yet", is a reason itself.
+    if (!saysMore(toolTip, name))
+        m_silent.append(what);
+}
+
+void KvDeskReasonsTest::lookAt(const QAction *action)
+{
+    // An entry that stands for none is a reason itself.
     const QStringList remarks{QStringLiteral("None yet"), QStringLiteral("Looking for cameras..."),
                               QStringLiteral("No camera is connected")};
-    if (!remarks.contains(action->text()) && !saysMore(action->toolTip(), action->text()))
-        m_silent.append(QStringLiteral("action ") + action->text());
+    if (!action->isSeparator() && !action->text().isEmpty() && !remarks.contains(action->text()))
+        note(QStringLiteral("action ") + action->text(), action->isEnabled(), action->toolTip(),
+             action->text());
 }
 
 void KvDeskReasonsTest::lookAt(const QWidget *widget)
 {
-    if (widget->isEnabled() || !widget->testAttribute(Qt::WA_ForceDisabled) || widget->isHidden())
+    if (widget->isHidden() || (!widget->isEnabled() && !widget->testAttribute(Qt::WA_ForceDisabled)))
         return;
-    ++m_disabled;
     const auto *const button = qobject_cast<const QAbstractButton *>(widget);
-    if (!saysMore(widget->toolTip(), button ? button->text() : QString()))
-        m_silent.append(QStringLiteral("%1 %2").arg(QLatin1String(widget->metaObject()->className()),
-                                                    button ? button->text() : widget->accessibleName()));
+    const QString name = button ? button->text() : widget->accessibleName();
+    const QString owner = QLatin1String(widget->parentWidget()->metaObject()->className());
+    note(owner + QLatin1Char('/') + QLatin1String(widget->metaObject()->className()) + QLatin1Char(' ') +
+             name,
+         widget->isEnabled(), widget->toolTip(), button ? name : QString());
+}
+
+// The command of the program knows what it says while it is possible.
+void KvDeskReasonsTest::lookAtCommands()
+{
+    const KvDeskActions *const actions = m_window->actions();
+    for (int i = 0; i < KvDeskActions::Count; ++i) {
+        const auto id = static_cast<KvDeskActions::Id>(i);
+        if (!actions->action(id)->isEnabled() && actions->action(id)->toolTip() == actions->toolTip(id))
+            m_silent.append(actions->toolTip(id));
+    }
 }
 
 void KvDeskReasonsTest::look(QWidget *window)
@@ -171,8 +196,22 @@ void KvDeskReasonsTest::everyState()
     enter(static_cast<State>(state));
     look(m_window.get());
     lookAtDialogs();
+    lookAtCommands();
     QVERIFY2(m_silent.isEmpty(), qPrintable(m_silent.join(QLatin1Char('\n'))));
     QVERIFY(m_disabled >= 3);
+}
+
+// What was possible in one state and was not in another said so.
+void KvDeskReasonsTest::reasonsComeAndGo()
+{
+    int compared = 0;
+    for (auto it = m_disabledTips.cbegin(); it != m_disabledTips.cend(); ++it) {
+        if (!m_enabledTips.contains(it.key()))
+            continue;
+        ++compared;
+        QVERIFY2(it.value() != m_enabledTips.value(it.key()), qPrintable(it.key()));
+    }
+    QVERIFY(compared >= 10);
 }
 
 STATREPORT_TEST_MAIN(KvDeskReasonsTest)
