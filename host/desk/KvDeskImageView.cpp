@@ -220,7 +220,8 @@ void KvDeskImageView::refreshContent()
 {
     const QRectF objects = places().index().bounds();
     updateStart();
-    const QRectF content = m_frame.isNull() ? objects : KvDeskObjectIndex::united(m_frame.sceneRect(), objects);
+    const QRectF content =
+        m_frame.isNull() ? objects : KvDeskObjectIndex::united(m_frame.sceneRect(), objects);
     emit signalContentChanged();
     if (content == m_content && !m_isFitted)
         return;

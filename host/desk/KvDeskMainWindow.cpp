@@ -335,9 +335,9 @@ void KvDeskMainWindow::connectActions()
     onTrigger(A::StartPage, m_imageView, SLOT(slotShowStart()));
     onTrigger(A::About, this, SLOT(slotAbout()));
     connect(m_actions->action(A::ShowLabels), SIGNAL(toggled(bool)), m_imageView,
-                                              SLOT(slotSetLabelsVisible(bool)));
+                                                     SLOT(slotSetLabelsVisible(bool)));
     connect(m_actions->action(A::ShowRulers), SIGNAL(toggled(bool)), m_imageView,
-                                              SLOT(slotSetRulersVisible(bool)));
+                                                     SLOT(slotSetRulersVisible(bool)));
     connect(m_actions->action(A::ShowValues), SIGNAL(toggled(bool)), m_valueTable, SLOT(setVisible(bool)));
     connect(m_actions->action(A::ShowGallery), SIGNAL(toggled(bool)), m_gallery, SLOT(setVisible(bool)));
     connect(m_actions->action(A::ShowLog), SIGNAL(toggled(bool)), m_statusLog, SLOT(setVisible(bool)));
@@ -513,8 +513,7 @@ void KvDeskMainWindow::slotStateChanged()
 
 void KvDeskMainWindow::slotImageStateChanged()
 {
-    m_statusBar->setImage(m_imageView->frame().image().size(),
-                          m_session->document()->calibration());
+    m_statusBar->setImage(m_imageView->frame().image().size(), m_session->document()->calibration());
     m_statusBar->slotZoomChanged(m_imageView->zoom());
 }
 

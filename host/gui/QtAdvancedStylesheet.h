@@ -23,9 +23,9 @@ namespace acss {
  * "accent-disabled", "on-accent-disabled".
  *
  * Widgets opt into a look of their own by dynamic properties set to true: "danger" (buttons that delete),
- * "iconOnly" (push buttons of 32 pixels), "link" (push buttons in lists), "groupTitle", "caption", "emptyState"
- * and "stepNumber" (labels), "panel" (frames, tables, status bars), "card" and "separator" (frames); and a push
- * button by the object name "accentButton".
+ * "iconOnly" (push buttons of 32 pixels), "link" (push buttons in lists), "groupTitle", "caption",
+ * "emptyState" and "stepNumber" (labels), "panel" (frames, tables, status bars), "card" and "separator"
+ * (frames); and a push button by the object name "accentButton".
  */
 class ZT_GUI_EXPORT QtAdvancedStylesheet : public QObject
 {
