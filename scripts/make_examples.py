@@ -1,7 +1,7 @@
 #!/usr/bin/env python3
 # SPDX-License-Identifier: MIT
-"""Makes everything below examples/: a picture of a made-up punched plate, the session with what was measured on it,
-tables of made-up measurements, and report templates. The same on every run; needs only Python's own library."""
+"""Makes everything below examples/: pictures of made-up things, sessions with what was measured on them, tables of
+made-up measurements, and report templates. The same on every run; needs only Python's own library."""
 
 import base64
 import csv
@@ -9,106 +9,88 @@ import json
 import math
 import pathlib
 import random
-import struct
-import zlib
+import sys
+
+sys.dont_write_bytecode = True  # leaves nothing in the sources
+
+import example_pictures as pictures
+from example_pictures import coverage, png
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent / "examples"
-WIDTH, HEIGHT = 960, 720
 MICROMETRES_PER_PIXEL = 12.5
-
-
-def png(width, height, channels, pixels):
-    """PNG file bytes of 8-bit samples, row after row; 1 channel is grey, 4 are red, green, blue, alpha."""
-    stride = width * channels
-    raw = b"".join(b"\0" + bytes(pixels[y * stride:(y + 1) * stride]) for y in range(height))
-
-    def chunk(name, data):
-        body = name + data
-        return struct.pack(">I", len(data)) + body + struct.pack(">I", zlib.crc32(body))
-
-    header = struct.pack(">IIBBBBB", width, height, 8, {1: 0, 4: 6}[channels], 0, 0, 0)
-    return (b"\x89PNG\r\n\x1a\n" + chunk(b"IHDR", header) + chunk(b"IDAT", zlib.compress(raw, 9))
-            + chunk(b"IEND", b""))
-
-
-def plate_features():
-    """Holes (centre, radius) and slots (left, top, width, height) of the plate, in pixels."""
-    rng = random.Random(20260101)
-    holes = []
-    for row in range(3):
-        for column in range(5):
-            holes.append((130 + column * 165 + rng.uniform(-3, 3), 120 + row * 150 + rng.uniform(-3, 3),
-                          34 + rng.uniform(-2.5, 2.5)))
-    slots = []
-    for column in range(6):
-        slots.append((80 + column * 140 + rng.uniform(-3, 3), 560 + rng.uniform(-3, 3),
-                      88 + rng.uniform(-3, 3), 36 + rng.uniform(-2, 2)))
-    return holes, slots
-
-
-def coverage(distance):
-    """How much of a pixel lies inside of an edge at a signed distance (negative inside)."""
-    return min(1.0, max(0.0, 0.5 - distance))
-
-
-def draw_plate(holes, slots):
-    rng = random.Random(7)
-    pixels = bytearray(WIDTH * HEIGHT)
-    for y in range(HEIGHT):
-        shade = 168 + 22 * math.sin(y / 230.0)
-        for x in range(WIDTH):
-            grain = 5 * math.sin((x * 0.9 + 11 * math.sin(y * 0.05)) * 0.7)
-            pixels[y * WIDTH + x] = int(min(255, max(0, shade + grain + rng.uniform(-7, 7))))
-
-    def darken(x, y, inside):
-        index = y * WIDTH + x
-        pixels[index] = int(pixels[index] * (1 - inside) + (26 + rng.uniform(-5, 5)) * inside)
-
-    for cx, cy, radius in holes:
-        for y in range(int(cy - radius - 2), int(cy + radius + 3)):
-            for x in range(int(cx - radius - 2), int(cx + radius + 3)):
-                inside = coverage(math.hypot(x - cx, y - cy) - radius)
-                if inside:
-                    darken(x, y, inside)
-    for left, top, width, height in slots:
-        for y in range(int(top) - 1, int(top + height) + 2):
-            for x in range(int(left) - 1, int(left + width) + 2):
-                inside = (coverage(left - x) * coverage(x - left - width)
-                          * coverage(top - y) * coverage(y - top - height))
-                if inside:
-                    darken(x, y, inside)
-    return png(WIDTH, HEIGHT, 1, pixels)
 
 
 def rounded(*numbers):
     return [round(number, 2) for number in numbers]
 
 
-def session(holes, slots):
-    objects = []
+class Session:
+    """What was measured on a picture."""
 
-    def add(kind, points, **more):
+    def __init__(self, picture, micrometres_per_pixel):
+        self.content = {"format": "statreport-session", "version": 1, "image": f"../pictures/{picture}.png",
+                        "micrometresPerPixel": micrometres_per_pixel, "objects": [], "tables": []}
+
+    def add(self, kind, points, **more):
+        objects = self.content["objects"]
         number = sum(1 for entry in objects if entry["type"] == kind) + 1
-        objects.append({"type": kind, "id": number, "points": points, **more})
+        objects.append({"type": kind, "id": number, "points": [rounded(*point) for point in points], **more})
 
+
+def plate_session(holes, slots):
+    made = Session("plate", MICROMETRES_PER_PIXEL)
+    add = made.add
     for left, top, width, height in slots:
-        add("rectangle", [rounded(left, top), rounded(left + width, top + height)])
+        add("rectangle", [(left, top), (left + width, top + height)])
     for first, second in zip(holes[0:4], holes[1:5]):
-        add("line", [rounded(*first[:2]), rounded(*second[:2])])
+        add("line", [first[:2], second[:2]])
     for index in (0, 4):
         cx, cy, radius = holes[index]
-        add("arc", [rounded(cx + radius, cy), rounded(cx, cy - radius), rounded(cx - radius, cy)])
-    add("polygon", [rounded(*holes[i][:2]) for i in (0, 4, 14, 10)], name="Hole field")
-    add("polyline", [rounded(*holes[i][:2]) for i in (0, 6, 12)], name="Diagonal")
+        add("arc", [(cx + radius, cy), (cx, cy - radius), (cx - radius, cy)])
+    add("polygon", [holes[i][:2] for i in (0, 4, 14, 10)], name="Hole field")
+    add("polyline", [holes[i][:2] for i in (0, 6, 12)], name="Diagonal")
     for upper, lower in ((0, 5), (5, 10)):
-        add("parallelDistance", [rounded(*holes[upper][:2]), rounded(*holes[upper + 4][:2]),
-                                 rounded(*holes[lower][:2])])
-    add("counter", [rounded(*hole[:2]) for hole in holes], name="Holes")
-    add("counter", [rounded(slot[0] + slot[2] / 2, slot[1] + slot[3] / 2) for slot in slots], name="Slots")
+        add("parallelDistance", [holes[upper][:2], holes[upper + 4][:2],
+                                 holes[lower][:2]])
+    add("counter", [hole[:2] for hole in holes], name="Holes")
+    add("counter", [(slot[0] + slot[2] / 2, slot[1] + slot[3] / 2) for slot in slots], name="Slots")
     for cx, cy, radius in holes:
-        add("circle", [rounded(cx, cy), rounded(cx + radius, cy)])
-    return {"format": "statreport-session", "version": 1, "image": "../pictures/plate.png",
-            "micrometresPerPixel": MICROMETRES_PER_PIXEL, "objects": objects, "tables": []}
+        add("circle", [(cx, cy), (cx + radius, cy)])
+    return made.content
+
+
+def coin_session():
+    """Calibrated, and nothing measured yet: that is left to the user."""
+    return Session("coin", 1000 / pictures.COIN_PIXELS_PER_MILLIMETRE).content
+
+
+def cells_session(cells):
+    made = Session("cells", 0.8)
+    for kind in pictures.CELL_KINDS:
+        made.add("counter", [cell[1:3] for cell in cells if cell[0] == kind], name=kind)
+    return made.content
+
+
+def fibres_session(fibres):
+    """The widths of fibres where they are seen: of thin ones by lines, of thick ones by parallel distances."""
+    made = Session("fibres", 0.6)
+    for depth, fibre in enumerate(fibres):
+        for along in range(-330, 331, 66):
+            places = [fibre.edges(along), fibre.edges(along + 14)]
+            if not all(is_seen(point, fibres[depth + 1:]) for pair in places for point in pair):
+                continue
+            if fibre.width < 28:
+                made.add("line", places[0])
+            else:
+                made.add("parallelDistance", [places[0][0], places[1][0], places[0][1]])
+    return made.content
+
+
+def is_seen(point, fibres_above):
+    margin = 10
+    if not (margin < point[0] < pictures.WIDTH - margin and margin < point[1] < pictures.HEIGHT - margin):
+        return False
+    return all(abs(across) > half + 3 for _, across, half in (fibre.local(*point) for fibre in fibres_above))
 
 
 def write_tables():
@@ -179,6 +161,9 @@ def statistics_table(**settings):
     return chart("Statistics Table", **{"alignment": 4, "groupBy": 1, "columns": "Average;Sigma;Min;Max", **settings})
 
 
+ACCENT, GREY = "#00659D", "#5b5f63"
+
+
 def image(data_url, width_percent):
     return {"name": "Image View", "config": {"imgPath": "", "alignment": "1", "widthPercent": str(width_percent),
                                              "rotationAngles": "0", "imgData": data_url.split(", ")[1]}}
@@ -212,6 +197,106 @@ def template(nodes, header="", footer="", page_numbers=True):
             "footer": section(footer, bool(footer)), "pageNumbering": section("", page_numbers), "nodes": nodes}
 
 
+def gap(points):
+    return f'<p style="margin-top:0px; margin-bottom:0px; font-size:{points}pt;">&nbsp;</p>'
+
+
+def title_block(title, subtitle):
+    return text_block(
+        paragraph(title, "font-size:26pt; font-weight:600; margin-bottom:2px;"),
+        paragraph(subtitle, f"font-size:13pt; color:{ACCENT}; margin-bottom:0px;"), gap(6))
+
+
+def heading(title, *paragraphs):
+    """A title with what belongs below it: both are on the same page."""
+    return text_block(gap(8), paragraph(title, "font-size:15pt; font-weight:600; margin-bottom:6px;"), *paragraphs)
+
+
+def remarks(title, lines):
+    """Room to write by hand or on the screen."""
+    return heading(title, *[paragraph("\u2026" * 62, f"color:{GREY}; margin-bottom:12px;") for _ in range(lines)])
+
+
+def fields(*rows):
+    """What a report is about: names in grey, and values beside them, to be filled in where they are dots."""
+    lines = "".join(f'<tr><td width="170" style="padding:3px 12px 3px 0px; color:{GREY};">{name}</td>'
+                    f'<td style="padding:3px 0px;">{value}</td></tr>' for name, value in rows)
+    return text_block(f'<table cellspacing="0" cellpadding="0" width="100%">{lines}</table>', gap(8))
+
+
+def signatures(*roles):
+    line = "border-top-width:1px; border-top-style:solid; border-top-color:#141414;"
+    cells = '<td width="6%"></td>'.join(
+        f'<td width="{(100 - 6 * (len(roles) - 1)) // len(roles)}%" style="{line} padding-top:4px; color:{GREY};">'
+        f"{role}</td>" for role in roles)
+    return text_block(gap(26), f'<table cellspacing="0" cellpadding="0" width="100%"><tr>{cells}</tr></table>')
+
+
+def running_head(text):
+    return f'<p style="margin-left:114px; margin-right:114px; font-size:9pt; color:{GREY};">{text}</p>'
+
+
+PRINTED = "${CREATION_DATE_TEXT}, ${CREATION_TIME}"
+ISSUER = "${PROGRAM_NAME} ${PROGRAM_VERSION}, ${PROGRAM_VENDOR}"
+BLANK = "\u2026" * 16
+
+
+def laboratory_templates(foot):
+    """Reports for a laboratory to start from."""
+    text = paragraph
+    return {
+        "summary": template([
+            title_block("Measurement summary", "One page: the image and its statistics"),
+            fields(("Sample", BLANK), ("Printed", PRINTED)),
+            camera_image(70, True), heading("Statistics"), statistics_table(widthPercent=100)],
+            "", foot, False),
+        "protocol": template([
+            title_block("Measurement protocol", "Image, statistics and every single value"),
+            fields(("Sample", BLANK), ("Order", BLANK), ("Operator", BLANK), ("Instrument", BLANK),
+                   ("Printed", PRINTED)),
+            heading(
+                "1 \u2002 Procedure",
+                text("Describe here how the sample was prepared, which lens and which light were used, and how "
+                     "the image was calibrated. The objects that were measured are drawn on the image."), gap(6)),
+            camera_image(56, True),
+            heading(
+                "2 \u2002 Results",
+                text("Statistics of each kind of value. The table after it lists every single value, in the order in "
+                     "which it was measured."), gap(6)),
+            statistics_table(widthPercent=100), measurements_table()],
+            running_head("Measurement protocol \u00b7 ${CREATION_DATE_ISO}"), foot),
+        "counting": template([
+            title_block("Counting report", "Objects counted on the image, by class"),
+            fields(("Sample", BLANK), ("Counted by", BLANK), ("Printed", PRINTED)),
+            camera_image(56, True),
+            heading("Counts and shares"),
+            measurements_table(columns="Object Name;Value Name;Value", widthPercent=75),
+            text_block(gap(6)), chart("Counters", widthPercent=56)],
+            "", foot),
+        "trend": template([
+            title_block("Trend report", "Measured values in their order, and their spread"),
+            fields(("Series", BLANK), ("Printed", PRINTED)),
+            chart("Trend", groupBy=1, widthPercent=100),
+            heading("Statistics"), statistics_table(widthPercent=100),
+            remarks("Assessment", 4),
+            chart("MinMedMaxBox", groupBy=1, widthPercent=100),
+            heading("Image"), camera_image(75, True)],
+            running_head("Trend report \u00b7 ${CREATION_DATE_ISO}"), foot),
+        "certificate": template([
+            text_block(f'<p><img width="66" src="{emblem()}" /></p>'),
+            title_block("Certificate of measurement", "No. \u2026\u2026\u2026\u2026 \u2002 of ${CREATION_DATE_ISO}"),
+            fields(("Customer", BLANK), ("Object", BLANK), ("Serial number", BLANK),
+                   ("Date of issue", "${CREATION_DATE_TEXT}"), ("Time of issue", "${CREATION_TIME}"),
+                   ("Measured with", "${PROGRAM_NAME}, version ${PROGRAM_VERSION}"),
+                   ("Software by", "${PROGRAM_VENDOR}")),
+            text_block(text("The object named above was measured on a calibrated image. The results below apply to this "
+                            "object only, in the state in which it was received."), gap(6)),
+            camera_image(38, True), heading("Results"), statistics_table(widthPercent=100),
+            signatures("Place and date", "Measured by", "Approved by")],
+            "", running_head("This certificate may be copied only as a whole. \u2003 " + ISSUER)),
+    }
+
+
 def write_templates():
     head = ('<p style="margin-left:114px; margin-right:114px; font-size:9pt; color:#5b5f63;">'
             "Inspection report \u00b7 ${CREATION_DATE_ISO}</p>")
@@ -238,6 +323,7 @@ def write_templates():
         "every-block": template(every_block("Light"), head, foot),
         "every-block-dark": template(every_block("Dark"), head, foot),
     }
+    templates.update(laboratory_templates(foot))
     for name, content in templates.items():
         write_json(ROOT / "templates" / f"{name}.rtp", content)
 
@@ -246,12 +332,20 @@ def write_json(path, content):
     path.write_text(json.dumps(content, indent=4, sort_keys=True, ensure_ascii=False) + "\n", encoding="utf-8")
 
 
+def write_sessions():
+    plate, cells, fibres = pictures.plate_features(), pictures.cells(), pictures.fibres()
+    for name, session, drawn in (("plate", plate_session(*plate), pictures.draw_plate(*plate)),
+                                 ("coin", coin_session(), pictures.draw_coin()),
+                                 ("cells", cells_session(cells), pictures.draw_cells(cells)),
+                                 ("fibres", fibres_session(fibres), pictures.draw_fibres(fibres))):
+        (ROOT / "pictures" / f"{name}.png").write_bytes(drawn)
+        write_json(ROOT / "sessions" / f"{'demo' if name == 'plate' else name}.json", session)
+
+
 def main():
     for folder in ("pictures", "sessions", "tables", "templates"):
         (ROOT / folder).mkdir(parents=True, exist_ok=True)
-    holes, slots = plate_features()
-    (ROOT / "pictures" / "plate.png").write_bytes(draw_plate(holes, slots))
-    write_json(ROOT / "sessions" / "demo.json", session(holes, slots))
+    write_sessions()
     write_tables()
     write_templates()
 

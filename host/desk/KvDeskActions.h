@@ -57,6 +57,7 @@ public:
         ShowGallery,
         ToggleTheme,
         Settings,
+        StartPage,
         About,
         Count
     };

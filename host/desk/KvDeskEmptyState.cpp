@@ -1,11 +1,16 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskEmptyState.h"
 
+#include "KvDeskActionButton.h"
+#include "gui/QtAdvancedStylesheet.h"
+
 #include <QAction>
 #include <QEvent>
 #include <QHBoxLayout>
 #include <QLabel>
-#include <QPushButton>
+#include <QPaintEvent>
+#include <QPainter>
+#include <QScrollArea>
 #include <QVBoxLayout>
 
 namespace {
@@ -52,12 +57,26 @@ QString KvDeskEmptyState::text() const
 
 void KvDeskEmptyState::addAction(QAction *action, bool isPrimary)
 {
-    auto *const button = new QPushButton(action->iconText(), this);
-    button->setToolTip(action->toolTip());
-    button->setAccessibleName(button->text());
+    auto *const button = new KvDeskActionButton(action, this);
     button->setDefault(isPrimary);
-    connect(button, SIGNAL(clicked()), action, SLOT(trigger()));
     m_buttons->insertWidget(m_buttons->count() - 1, button);
+}
+
+void KvDeskEmptyState::setContent(QWidget *content)
+{
+    m_label->hide();
+    m_scrollArea = new QScrollArea(this);
+    m_scrollArea->setFrameShape(QFrame::NoFrame);
+    m_scrollArea->setWidgetResizable(true);
+    m_scrollArea->setAlignment(Qt::AlignHCenter);
+    m_scrollArea->setFocusPolicy(Qt::NoFocus);
+    m_scrollArea->setWidget(content);
+    m_scrollArea->viewport()->setAutoFillBackground(false);
+    content->setAutoFillBackground(false);
+    setFocusProxy(content);
+    m_scrollArea->setGeometry(rect());
+    // What is hidden below it is not meant.
+    setAttribute(Qt::WA_NoMousePropagation);
 }
 
 bool KvDeskEmptyState::eventFilter(QObject *watched, QEvent *event)
@@ -65,4 +84,19 @@ bool KvDeskEmptyState::eventFilter(QObject *watched, QEvent *event)
     if (watched == parent() && event->type() == QEvent::Resize)
         setGeometry(parentWidget()->rect());
     return QWidget::eventFilter(watched, event);
+}
+
+// What lies below a page need not be empty.
+void KvDeskEmptyState::paintEvent(QPaintEvent *event)
+{
+    if (hasContent())
+        QPainter(this).fillRect(event->rect(),
+                                acss::QtAdvancedStylesheet::getInstance()->color(QStringLiteral("window")));
+}
+
+void KvDeskEmptyState::resizeEvent(QResizeEvent *event)
+{
+    QWidget::resizeEvent(event);
+    if (m_scrollArea)
+        m_scrollArea->setGeometry(rect());
 }

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskExportDialog.h"
 
+#include "KvDeskReason.h"
 #include "kernel/ZtAppSettings.h"
 
 #include <QCheckBox>
@@ -119,15 +120,14 @@ ZtTableExport::Layout KvDeskExportDialog::chosenLayout() const
 void KvDeskExportDialog::slotUpdate()
 {
     const bool isCsv = chosenLayout() != ZtTableExport::Json;
-    m_numbers->setEnabled(isCsv);
-    m_mark->setEnabled(isCsv);
-    m_guard->setEnabled(isCsv);
+    const QList<QWidget *> choices{m_numbers, m_mark, m_guard};
+    for (QWidget *const choice : choices)
+        KvDeskReason::setPossible(choice, isCsv, tr("Concerns CSV tables only"));
     const QString notes[] = {tr("For statistics programs. Can be imported here again."),
                              tr("For spreadsheets. Headings name the units."),
                              tr("For programs. Numbers always have a decimal point.")};
     m_note->setText(notes[chosenLayout()]);
-    m_selectionOnly->setEnabled(!m_selection.isEmpty());
-    m_selectionOnly->setToolTip(m_selection.isEmpty() ? tr("No measured object is selected") : QString());
+    KvDeskReason::setPossible(m_selectionOnly, !m_selection.isEmpty(), tr("No measured object is selected"));
 }
 
 ZtTableExport::Options KvDeskExportDialog::options() const

@@ -173,11 +173,38 @@ bool KvDeskFileCommands::run(const QString &text, const std::function<void(ZtPro
 
 bool KvDeskFileCommands::openSession(const QString &path)
 {
-    if (!maybeSave())
+    ZtLoadedSession loaded;
+    KvDeskFileStamp stamp;
+    if (!maybeSave() || !readSession(path, &loaded, &stamp))
         return false;
+    {
+        const KvDeskWaitCursor wait;
+        m_session->setSession(&loaded, path, stamp);
+    }
+    KvDeskRecentFiles::add(path);
+    logOpened(path);
+    return true;
+}
+
+bool KvDeskFileCommands::openCopy(const QString &path)
+{
+    ZtLoadedSession loaded;
+    KvDeskFileStamp stamp;
+    if (!maybeSave() || !readSession(path, &loaded, &stamp))
+        return false;
+    {
+        const KvDeskWaitCursor wait;
+        m_session->setCopy(&loaded);
+    }
+    logOpened(path);
+    return true;
+}
+
+bool KvDeskFileCommands::readSession(const QString &path, ZtLoadedSession *loaded, KvDeskFileStamp *stamp)
+{
     const QString source = QStringLiteral("KvDeskFileCommands::openSession");
     const QString failure = tr("The session \"%1\" was not opened.").arg(fileName(path));
-    const KvDeskFileStamp stamp = KvDeskFileStamp::of(path);
+    *stamp = KvDeskFileStamp::of(path);
     const auto reading = std::make_shared<Reading<ZtLoadedSession>>();
     ZtFault fault;
     const auto work = [reading, path](ZtProgress *progress) {
@@ -190,15 +217,16 @@ bool KvDeskFileCommands::openSession(const QString &path)
     const ZtFault missing{path, 0, 0, QStringLiteral("image"), reading->result.imageFault.text()};
     if (!missing.isNull() && !askToOpenWithoutImage(missing))
         return tellFault(failure, missing, source);
-    {
-        const KvDeskWaitCursor wait;
-        m_session->setSession(&reading->result, path, stamp);
-    }
-    KvDeskRecentFiles::add(path);
+    *loaded = std::move(reading->result);
+    return true;
+}
+
+void KvDeskFileCommands::logOpened(const QString &path)
+{
     KvDeskStatus::log(
         ZtAppStatus::Information,
-        tr("Session opened: %1 (objects: %2)").arg(fileName(path)).arg(m_session->objectCount()), source);
-    return true;
+        tr("Session opened: %1 (objects: %2)").arg(fileName(path)).arg(m_session->objectCount()),
+        QStringLiteral("KvDeskFileCommands::openSession"));
 }
 
 bool KvDeskFileCommands::askToOpenWithoutImage(const ZtFault &fault)

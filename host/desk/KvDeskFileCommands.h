@@ -6,12 +6,14 @@
 
 #include <functional>
 
+class KvDeskFileStamp;
 class KvDeskProgress;
 class KvDeskSession;
 class QFileDialog;
 class ZtProgress;
 struct KvDeskRecoveryFile;
 struct ZtFault;
+struct ZtLoadedSession;
 
 /**
  * Opens and saves files for the user: asks which, asks about unsaved changes, and says what went wrong. What
@@ -36,6 +38,8 @@ public:
      * is left out with a warning; all faults are told at once. */
     void openFiles(const QStringList &paths);
     bool openSession(const QString &path);
+    /** Opens a session as one that has no file yet: the file is never written again. */
+    bool openCopy(const QString &path);
     bool openImage(const QString &path);
     bool importTable(const QString &path);
     /** Asks before it overwrites what another program wrote; offers another place when saving fails. */
@@ -66,6 +70,8 @@ private:
     QString chooseFile(const QString &caption, const QString &filter);
     bool choose(QFileDialog *dialog, QString *path);
     /** False, with a fault, when the work was cancelled or ended by itself. */
+    bool readSession(const QString &path, ZtLoadedSession *loaded, KvDeskFileStamp *stamp);
+    void logOpened(const QString &path);
     bool run(const QString &text, const std::function<void(ZtProgress *)> &work, ZtFault *fault);
     bool askToOpenWithoutImage(const ZtFault &fault);
     OnConflict askToOverwrite();

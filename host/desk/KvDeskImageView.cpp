@@ -188,11 +188,41 @@ void KvDeskImageView::slotThemeChanged()
     m_overlay->slotLabelsChanged();
 }
 
+bool KvDeskImageView::isAnythingOpen() const
+{
+    return !m_frame.isNull() || places().index().size() > 0;
+}
+
+void KvDeskImageView::updateStart()
+{
+    const bool isShown = m_isStartWanted || !isAnythingOpen();
+    // Whoever loses the keyboard with the page gets it back here.
+    if (!isShown && m_emptyState->isAncestorOf(window()->focusWidget()))
+        setFocus();
+    m_emptyState->setVisible(isShown);
+    placeRulers();
+}
+
+void KvDeskImageView::slotShowStart()
+{
+    m_isStartWanted = true;
+    updateStart();
+    m_emptyState->setFocus();
+}
+
+void KvDeskImageView::slotHideStart()
+{
+    m_isStartWanted = false;
+    updateStart();
+}
+
 void KvDeskImageView::refreshContent()
 {
     const QRectF objects = places().index().bounds();
-    m_emptyState->setVisible(m_frame.isNull() && places().index().size() == 0);
-    const QRectF content = m_frame.isNull() ? objects : KvDeskObjectIndex::united(m_frame.sceneRect(), objects);
+    updateStart();
+    const QRectF content =
+        m_frame.isNull() ? objects : KvDeskObjectIndex::united(m_frame.sceneRect(), objects);
+    emit signalContentChanged();
     if (content == m_content && !m_isFitted)
         return;
     m_content = content;
@@ -572,9 +602,10 @@ void KvDeskImageView::placeRulers()
     m_topRuler->setGeometry(side, 0, qMax(0, width() - side), side);
     m_leftRuler->setGeometry(0, side, side, qMax(0, height() - side));
     m_rulerCorner->setGeometry(0, 0, side, side);
+    const bool isPageShown = m_emptyState->hasContent() && !m_emptyState->isHidden();
     const QList<QWidget *> rulers{m_topRuler, m_leftRuler, m_rulerCorner};
     for (QWidget *const ruler : rulers)
-        ruler->setVisible(m_areRulersVisible);
+        ruler->setVisible(m_areRulersVisible && !isPageShown);
     slotUpdateRulers();
 }
 

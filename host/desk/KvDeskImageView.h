@@ -61,6 +61,7 @@ public:
 
     const KvDeskImageFrame &frame() const { return m_frame; }
     KvDeskEmptyState *emptyState() const { return m_emptyState; }
+    bool isAnythingOpen() const;
     KvDeskObjectId selectedObject() const;
 
     /** Pixels of the screen per pixel of the image. */
@@ -100,6 +101,9 @@ public slots:
     void slotSetRulersVisible(bool aVisible);
     void slotSetLabelsVisible(bool aVisible);
     void slotSetScaleBarVisible(bool aVisible); ///< here and on pictures of reports
+    /** Shows what an empty view shows over the image, until another is opened or slotHideStart(). */
+    void slotShowStart();
+    void slotHideStart();
     void slotZoomIn();
     void slotZoomOut();
     void slotZoomFit();
@@ -108,6 +112,7 @@ public slots:
 signals:
     void signalZoomChanged(double aZoom);
     void signalFrameChanged();
+    void signalContentChanged(); ///< there is another image, or other objects are on it
     /** The pointer is over this point of the image, in its pixels. */
     void signalPointerMoved(QPointF aPosition);
     void signalPointerLeft(); ///< the pointer is not over the image
@@ -142,6 +147,7 @@ private:
     void connectSignals();
     void setSelection(KvDeskSelection *selection);
     void refreshContent();
+    void updateStart();
     void updateSceneRect();
     void placeRulers();
     void setRulerPointer(const QPointF *position);
@@ -176,6 +182,7 @@ private:
     KvDeskTool *m_tool = nullptr;
     QRectF m_content; ///< the image and all objects, in scene coordinates
     QPoint m_lastPan;
+    bool m_isStartWanted = false; ///< though something is open
     bool m_isFitted = true;
     bool m_isPanning = false;
     bool m_isSpaceDown = false;

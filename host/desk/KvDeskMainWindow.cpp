@@ -7,6 +7,7 @@
 #include "KvDeskCounterBar.h"
 #include "KvDeskEditCommands.h"
 #include "KvDeskEmptyState.h"
+#include "KvDeskExamples.h"
 #include "KvDeskExportCommand.h"
 #include "KvDeskFileCommands.h"
 #include "KvDeskGallery.h"
@@ -24,6 +25,7 @@
 #include "KvDeskSnapshots.h"
 #include "KvDeskSourceCommands.h"
 #include "KvDeskSourceMenu.h"
+#include "KvDeskStartPage.h"
 #include "KvDeskStatusBar.h"
 #include "KvDeskStatusLog.h"
 #include "KvDeskTheme.h"
@@ -114,12 +116,14 @@ KvDeskMainWindow::KvDeskMainWindow(ZtMeasuringDocument *document, QWidget *paren
     createPanels();
     createMenus();
     createToolBar();
+    createStartPage();
     connectSignals();
     connectActions();
     m_imageView->setDocument(document);
     restoreWindow();
     slotStateChanged();
-    m_imageView->setFocus();
+    // Tab goes to its buttons, and the image takes the keyboard when there is one.
+    m_startPage->setFocus();
 }
 
 KvDeskMainWindow::~KvDeskMainWindow() = default;
@@ -129,8 +133,6 @@ void KvDeskMainWindow::createPanels()
     m_toolColumn = new KvDeskToolColumn(this);
     m_imageView = new KvDeskImageView(this);
     m_imageView->setEditor(m_objectEditor);
-    m_imageView->emptyState()->addAction(m_actions->action(KvDeskActions::OpenImage), true);
-    m_imageView->emptyState()->addAction(m_actions->action(KvDeskActions::OpenSession), false);
     m_toolBox = new KvDeskToolBox(m_actions, m_imageView, this);
     m_toolStrip = new KvDeskToolStrip(m_toolBox, this);
     new KvDeskCounterBar(m_toolBox, m_imageView);
@@ -234,6 +236,8 @@ void KvDeskMainWindow::createMenus()
     view->addSeparator();
     add(view, {A::ToggleTheme});
     QMenu *const help = menuBar()->addMenu(tr("&Help"));
+    add(help, {A::StartPage});
+    help->addSeparator();
     add(help, {A::About});
 }
 
@@ -262,6 +266,20 @@ void KvDeskMainWindow::createToolBar()
     add({A::ShowGallery, A::ShowLog, A::ShowValues});
     bar->addSeparator();
     add({A::ToggleTheme, A::Settings});
+}
+
+void KvDeskMainWindow::createStartPage()
+{
+    m_startPage = new KvDeskStartPage(m_actions, m_sourceMenu, KvDeskExamples::folder());
+    m_imageView->emptyState()->setContent(m_startPage);
+    connect(m_startPage, SIGNAL(signalExampleChosen(QString)), this, SLOT(slotOpenExample(QString)));
+    connect(m_startPage, SIGNAL(signalRecentChosen(QString)), this, SLOT(slotOpenRecent(QString)));
+    connect(m_startPage, SIGNAL(signalLeft()), m_imageView, SLOT(slotHideStart()));
+    connect(m_imageView, SIGNAL(signalContentChanged()), this, SLOT(slotUpdateStartPage()));
+    connect(m_toolBox, SIGNAL(signalToolChanged()), m_imageView, SLOT(slotHideStart()));
+    connect(m_session, SIGNAL(signalReplaced()), m_imageView, SLOT(slotHideStart()));
+    connect(m_session, SIGNAL(signalImageOpened()), m_imageView, SLOT(slotHideStart()));
+    connect(m_session->document(), SIGNAL(signalImageChanged()), m_imageView, SLOT(slotHideStart()));
 }
 
 QToolButton *KvDeskMainWindow::createSourceButton(QWidget *parent)
@@ -317,6 +335,7 @@ void KvDeskMainWindow::connectActions()
     onTrigger(A::ZoomActual, m_imageView, SLOT(slotZoomActual()));
     onTrigger(A::ToggleTheme, this, SLOT(slotToggleTheme()));
     onTrigger(A::Settings, this, SLOT(slotSettings()));
+    onTrigger(A::StartPage, m_imageView, SLOT(slotShowStart()));
     onTrigger(A::About, this, SLOT(slotAbout()));
     connect(m_actions->action(A::ShowLabels), SIGNAL(toggled(bool)), m_imageView,
                                                      SLOT(slotSetLabelsVisible(bool)));
@@ -544,9 +563,23 @@ void KvDeskMainWindow::slotFillRecentMenu()
 
 void KvDeskMainWindow::slotRecentTriggered(QAction *aAction)
 {
-    const QString path = aAction->data().toString();
-    if (!m_files->openSession(path) && !QFileInfo::exists(path))
-        KvDeskRecentFiles::remove(path);
+    slotOpenRecent(aAction->data().toString());
+}
+
+void KvDeskMainWindow::slotOpenRecent(const QString &aPath)
+{
+    if (!m_files->openSession(aPath) && !QFileInfo::exists(aPath))
+        KvDeskRecentFiles::remove(aPath);
+}
+
+void KvDeskMainWindow::slotOpenExample(const QString &aPath)
+{
+    m_files->openCopy(aPath);
+}
+
+void KvDeskMainWindow::slotUpdateStartPage()
+{
+    m_startPage->setAnythingOpen(m_imageView->isAnythingOpen());
 }
 
 void KvDeskMainWindow::slotHideValues()

@@ -22,6 +22,7 @@ class KvDeskSession;
 class KvDeskSnapshots;
 class KvDeskSourceCommands;
 class KvDeskSourceMenu;
+class KvDeskStartPage;
 class KvDeskStatusBar;
 class KvDeskStatusLog;
 class KvDeskToolBox;
@@ -61,6 +62,7 @@ public:
     KvDeskSourceMenu *sourceMenu() const { return m_sourceMenu; }
     KvDeskSourceCommands *sources() const { return m_sources; }
     KvDeskSnapshots *snapshots() const { return m_snapshots; }
+    KvDeskStartPage *startPage() const { return m_startPage; }
     KvDeskStatusLog *statusLog() const { return m_statusLog; }
     KvDeskToolBox *toolBox() const { return m_toolBox; }
     KvDeskToolColumn *toolColumn() const { return m_toolColumn; }
@@ -102,6 +104,9 @@ private slots:
     void slotFilterValues();
     void slotHideGallery();
     void slotShowSnapshot(const QString &aPath);
+    void slotOpenExample(const QString &aPath);
+    void slotOpenRecent(const QString &aPath);
+    void slotUpdateStartPage();
     void slotOpenFromGallery(const QString &aPath);
     void slotToggleTheme();
     void slotSettings();
@@ -113,6 +118,7 @@ private:
     void createPanels();
     void createMenus();
     void createToolBar();
+    void createStartPage();
     QWidget *createImageColumn();
     QToolButton *createSourceButton(QWidget *parent);
     void connectSignals();
@@ -142,6 +148,7 @@ private:
     KvDeskGallery *m_gallery = nullptr;
     KvDeskLiveBar *m_liveBar = nullptr;
     KvDeskSourceMenu *m_sourceMenu = nullptr;
+    KvDeskStartPage *m_startPage = nullptr;
     KvDeskStatusLog *m_statusLog = nullptr;
     KvDeskStatusBar *m_statusBar = nullptr;
     QSplitter *m_imageSplitter = nullptr;

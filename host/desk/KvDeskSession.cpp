@@ -75,6 +75,12 @@ void KvDeskSession::setSession(ZtLoadedSession *loaded, const QString &path, con
     setState(QFileInfo(path).absoluteFilePath(), false);
 }
 
+void KvDeskSession::setCopy(ZtLoadedSession *loaded)
+{
+    replaceBy(loaded, KvDeskFileStamp());
+    setState(QString(), false);
+}
+
 void KvDeskSession::restore(ZtLoadedSession *loaded, const QString &path, const KvDeskFileStamp &stamp)
 {
     replaceBy(loaded, stamp);

@@ -66,6 +66,8 @@ public:
 
     /** The same with what was read already; \a stamp is that of the file before it was read. */
     void setSession(ZtLoadedSession *loaded, const QString &path, const KvDeskFileStamp &stamp);
+    /** As setSession(), but without a file. */
+    void setCopy(ZtLoadedSession *loaded);
     void showImage(std::unique_ptr<ZtStillImageSource> image);
     void addTable(std::vector<ZtReadyObjects> *ready);
     /** As setSession(), but with changes that \a path, which may be empty, has not got. */

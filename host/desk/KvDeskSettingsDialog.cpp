@@ -2,6 +2,7 @@
 #include "KvDeskSettingsDialog.h"
 
 #include "KvDeskLanguages.h"
+#include "KvDeskReason.h"
 #include "KvDeskTheme.h"
 #include "gui/QtAdvancedStylesheet.h"
 #include "kernel/ZtAppSettings.h"
@@ -162,7 +163,8 @@ QVariantList KvDeskSettingsDialog::values() const
 
 void KvDeskSettingsDialog::slotValueChanged()
 {
-    m_buttons->button(QDialogButtonBox::Apply)->setEnabled(values() != m_written);
+    KvDeskReason::setPossible(m_buttons->button(QDialogButtonBox::Apply), values() != m_written,
+                              tr("Nothing was changed yet"));
 }
 
 void KvDeskSettingsDialog::slotApply()

@@ -3,6 +3,7 @@
 
 #include "KvDeskEmptyState.h"
 #include "KvDeskPanelHeader.h"
+#include "KvDeskReason.h"
 #include "KvDeskStatusLogModel.h"
 #include "KvDeskTableView.h"
 #include "common/ZtAppStatus.h"
@@ -57,7 +58,7 @@ void KvDeskStatusLog::slotRowsChanged()
 {
     const bool isEmpty = m_model->rowCount() == 0;
     m_emptyState->setVisible(isEmpty);
-    m_clearButton->setEnabled(!isEmpty);
+    KvDeskReason::setPossible(m_clearButton, !isEmpty, tr("There are no messages"));
     if (m_isAtEnd)
         m_view->scrollToBottom();
 }

@@ -2,6 +2,7 @@
 #include "KvDeskTypedPixelSize.h"
 
 #include "KvDeskNumberBox.h"
+#include "KvDeskReason.h"
 #include "gui/acss.h"
 
 #include <QHBoxLayout>
@@ -83,7 +84,7 @@ void KvDeskTypedPixelSize::slotXChanged(double aValue)
 
 void KvDeskTypedPixelSize::slotLinkToggled(bool aLinked)
 {
-    m_y->setEnabled(!aLinked);
+    KvDeskReason::setPossible(m_y, !aLinked, m_link->toolTip());
     if (aLinked)
         m_y->setValue(m_x->value());
 }

@@ -4,6 +4,7 @@
 #include "KvDeskEmptyState.h"
 #include "KvDeskObjectEditor.h"
 #include "KvDeskPanelHeader.h"
+#include "KvDeskReason.h"
 #include "KvDeskSelectionStatistics.h"
 #include "KvDeskTableView.h"
 #include "KvDeskValueCommands.h"
@@ -90,8 +91,7 @@ void KvDeskValueTable::createFilter()
 void KvDeskValueTable::createEmptyStates()
 {
     m_emptyState = new KvDeskEmptyState(
-        tr("Measured values appear here once a session is opened or a table is imported"),
-        m_view->viewport());
+        tr("Measured values appear here once something is measured or imported"), m_view->viewport());
     m_noMatchState = new KvDeskEmptyState(tr("No measured value matches the filter"), m_view->viewport());
     auto *const clear = new QAction(tr("Clear the filter"), this);
     connect(clear, SIGNAL(triggered()), this, SLOT(slotClearFilter()));
@@ -202,7 +202,8 @@ void KvDeskValueTable::updateEmptyStates()
     m_emptyState->setVisible(isEmpty);
     m_noMatchState->setVisible(!isEmpty && m_sorted->rowCount() == 0);
     m_view->horizontalHeader()->setVisible(!isEmpty);
-    m_filter->setEnabled(!isEmpty || m_sorted->isFiltered());
+    KvDeskReason::setPossible(m_filter, !isEmpty || m_sorted->isFiltered(),
+                              tr("There are no measured values yet"));
     header()->setNote(note());
 }
 

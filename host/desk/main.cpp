@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskCommandLine.h"
 #include "KvDeskFileCommands.h"
+#include "KvDeskFirstTemplates.h"
 #include "KvDeskLanguages.h"
 #include "KvDeskMainWindow.h"
 #include "KvDeskPlugins.h"
@@ -56,6 +57,7 @@ int run(const KvDeskCommandLine &commandLine)
     // At the end these go in the opposite order: plug-ins own windows that belong to the main window.
     ZtMeasuringDocument document;
     KvDeskMainWindow window(&document);
+    KvDeskFirstTemplates::offer(QCoreApplication::applicationDirPath() + QStringLiteral("/Templates"));
     KvDeskPlugins plugins(&window);
     plugins.load(KvDeskPlugins::folders(commandLine.pluginFolders()));
     window.restoreTools();

@@ -45,7 +45,7 @@ constexpr Token tokens[] = {
     {"text-disabled", disabled(0xf0f0f1), disabled(0x141414)},
     {"muted", opaque(0xb4b7ba), opaque(0x5b5f63)},
     {"accent", opaque(0x00659d), opaque(0x00659d)},
-    {"accent-hover", opaque(0x0a7dbd), opaque(0x0a7dbd)},
+    {"accent-hover", opaque(0x0a7cbb), opaque(0x0a7cbb)},
     {"accent-pressed", opaque(0x004f7c), opaque(0x004f7c)},
     {"accent-disabled", disabled(0x00659d), disabled(0x00659d)},
     {"on-accent", opaque(0xffffff), opaque(0xffffff)},
@@ -53,8 +53,9 @@ constexpr Token tokens[] = {
     {"danger", opaque(0xf0b1b5), opaque(0xf0b1b5)},
     {"danger-hover", opaque(0xa61d24), opaque(0xa61d24)},
     {"danger-pressed", opaque(0xe84749), opaque(0xe84749)},
+    {"on-danger-pressed", opaque(0x141414), opaque(0x141414)},
     {"ok", opaque(0x60bd65), opaque(0x226a25)},
-    {"warning", opaque(0xffc107), opaque(0x9a6b00)},
+    {"warning", opaque(0xffc107), opaque(0x936600)},
 };
 
 QString cssColor(const QColor &color)

@@ -18,13 +18,14 @@ namespace acss {
  * only.
  *
  * Colours: "window", "panel", "raised" (fields and cards), "line", "text", "muted", "accent", "accent-hover",
- * "accent-pressed", "on-accent", "danger", "danger-hover", "danger-pressed", "ok", "warning"; made of these
- * for the states of controls: "raised-hover", "raised-pressed", "text-disabled", "accent-disabled",
- * "on-accent-disabled".
+ * "accent-pressed", "on-accent", "danger", "danger-hover", "danger-pressed", "on-danger-pressed", "ok",
+ * "warning"; made of these for the states of controls: "raised-hover", "raised-pressed", "text-disabled",
+ * "accent-disabled", "on-accent-disabled".
  *
  * Widgets opt into a look of their own by dynamic properties set to true: "danger" (buttons that delete),
- * "iconOnly" (push buttons of 32 pixels), "groupTitle", "caption" and "emptyState" (labels), "panel" (frames,
- * tables, status bars), "separator" (frames); and a push button by the object name "accentButton".
+ * "iconOnly" (push buttons of 32 pixels), "link" (push buttons in lists), "groupTitle", "caption",
+ * "emptyState" and "stepNumber" (labels), "panel" (frames, tables, status bars), "card" and "separator"
+ * (frames); and a push button by the object name "accentButton".
  */
 class ZT_GUI_EXPORT QtAdvancedStylesheet : public QObject
 {

@@ -152,14 +152,15 @@ void QtAdvancedStylesheetTest::colors_data()
     row("text", "#f0f0f1", "#141414");
     row("muted", "#b4b7ba", "#5b5f63");
     row("accent", "#00659d", "#00659d");
-    row("accent-hover", "#0a7dbd", "#0a7dbd");
+    row("accent-hover", "#0a7cbb", "#0a7cbb");
     row("accent-pressed", "#004f7c", "#004f7c");
     row("on-accent", "#ffffff", "#ffffff");
     row("danger", "#f0b1b5", "#f0b1b5");
     row("danger-hover", "#a61d24", "#a61d24");
     row("danger-pressed", "#e84749", "#e84749");
+    row("on-danger-pressed", "#141414", "#141414");
     row("ok", "#60bd65", "#226a25");
-    row("warning", "#ffc107", "#9a6b00");
+    row("warning", "#ffc107", "#936600");
     row("text-disabled", "#66f0f0f1", "#66141414");
     row("accent-disabled", "#6600659d", "#6600659d");
     row("on-accent-disabled", "#66ffffff", "#66ffffff");
@@ -190,9 +191,16 @@ void QtAdvancedStylesheetTest::textsAreReadable_data()
             QTest::addRow("%s on %s", text, background)
                 << QString::fromLatin1(text) << QString::fromLatin1(background);
     }
-    for (const char *const background : {"accent", "accent-pressed", "danger-hover"})
+    for (const char *const background : {"accent", "accent-hover", "accent-pressed", "danger-hover"})
         QTest::addRow("on-accent on %s", background)
             << QStringLiteral("on-accent") << QString::fromLatin1(background);
+    for (const char *const text : {"ok", "warning"}) {
+        for (const char *const background : {"window", "panel", "raised"})
+            QTest::addRow("%s on %s", text, background)
+                << QString::fromLatin1(text) << QString::fromLatin1(background);
+    }
+    QTest::addRow("on-danger-pressed on danger-pressed")
+        << QStringLiteral("on-danger-pressed") << QStringLiteral("danger-pressed");
 }
 
 void QtAdvancedStylesheetTest::textsAreReadable()

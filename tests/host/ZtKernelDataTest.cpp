@@ -367,6 +367,10 @@ void ZtKernelDataTest::revisionCountsEveryChange()
         QVERIFY(kernel->removeObject(7, 2) && isChange());
     }
     QVERIFY(!kernel->removeObject(7, 2) && !isChange());
+    const ZtObjectMap objects = kernel->takeObjects(7);
+    QVERIFY(isChange());
+    kernel->setObjects(7, objects);
+    QVERIFY(isChange());
     kernel->unregisterType(7);
     QVERIFY(isChange());
 }

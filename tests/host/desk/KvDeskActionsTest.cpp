@@ -85,6 +85,7 @@ void KvDeskActionsTest::commands_data()
     row(A::ShowGallery, "&Gallery", "Show or hide the gallery (F5)", true, true);
     row(A::ToggleTheme, "&Dark or light theme", "Change between the dark and the light theme (F8)");
     row(A::Settings, "S&ettings...", "Settings (Ctrl+,)");
+    row(A::StartPage, "&Start page", "Show the first steps, the examples and the recent sessions", false);
     row(A::About, "&About Measuring Desk", "About Measuring Desk");
 }
 

@@ -1,0 +1,73 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskStepRow.h"
+
+#include "KvDeskActionButton.h"
+
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QMenu>
+#include <QToolButton>
+#include <QVBoxLayout>
+
+namespace {
+
+constexpr int controlSpacing = 8;
+constexpr int groupSpacing = 16;
+constexpr QSize buttonSize(32, 32);
+
+QLabel *label(const QString &text, const char *look, QWidget *parent)
+{
+    auto *const label = new QLabel(text, parent);
+    label->setProperty(look, true);
+    label->setWordWrap(true);
+    return label;
+}
+
+} // namespace
+
+KvDeskStepRow::KvDeskStepRow(int number, const QString &title, const QString &text, QWidget *parent)
+    : QFrame(parent)
+    , m_layout(new QHBoxLayout(this))
+{
+    setProperty("card", true);
+    auto *const badge = new QLabel(QString::number(number), this);
+    badge->setProperty("stepNumber", true);
+    badge->setAlignment(Qt::AlignCenter);
+    auto *const texts = new QVBoxLayout;
+    texts->setSpacing(4);
+    texts->addWidget(label(title, "groupTitle", this));
+    texts->addWidget(label(text, "caption", this));
+    m_layout->setContentsMargins(groupSpacing, controlSpacing, groupSpacing, controlSpacing);
+    m_layout->setSpacing(controlSpacing);
+    m_layout->addWidget(badge);
+    m_layout->addSpacing(controlSpacing);
+    m_layout->addLayout(texts, 1);
+    m_layout->addSpacing(controlSpacing);
+}
+
+void KvDeskStepRow::addAction(QAction *action, bool isPrimary)
+{
+    auto *const button = new KvDeskActionButton(action, this);
+    button->setDefault(isPrimary);
+    m_layout->addWidget(button);
+}
+
+void KvDeskStepRow::addMenu(QMenu *menu, const QString &toolTip)
+{
+    auto *const button = new QToolButton(this);
+    button->setMenu(menu);
+    button->setPopupMode(QToolButton::InstantPopup);
+    button->setIcon(menu->icon());
+    button->setIconSize(QSize(24, 24));
+    button->setFixedSize(buttonSize);
+    button->setFocusPolicy(Qt::StrongFocus);
+    button->setToolTip(toolTip);
+    button->setAccessibleName(toolTip);
+    m_layout->addWidget(button);
+}
+
+void KvDeskStepRow::setObstacle(const QString &reason)
+{
+    for (KvDeskActionButton *const button : findChildren<KvDeskActionButton *>())
+        button->setObstacle(reason);
+}

@@ -1,0 +1,209 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskActions.h"
+#include "KvDeskExportDialog.h"
+#include "KvDeskFirstTemplates.h"
+#include "KvDeskGallery.h"
+#include "KvDeskGallerySettings.h"
+#include "KvDeskGalleryView.h"
+#include "KvDeskImageView.h"
+#include "KvDeskSelection.h"
+#include "KvDeskSettingsDialog.h"
+#include "KvDeskSourceCommands.h"
+#include "KvDeskTheme.h"
+#include "KvDeskToolColumn.h"
+#include "RunningDesk.h"
+
+#include "kernel/ZtAppSettings.h"
+#include "measuring/ZtDrawnType.h"
+#include "measuring/ZtFrameSourceCatalogue.h"
+#include "support/FileDialogAnswerer.h"
+
+#include <QAction>
+#include <QButtonGroup>
+#include <QDir>
+#include <QFile>
+#include <QMessageBox>
+#include <QTemporaryDir>
+#include <QtTest>
+
+#include <cstdio>
+#include <set>
+
+/** Photographs every window of the Desk and of the plug-in in it, in one theme, into a folder of PNG files.
+ */
+class Screenshots
+{
+public:
+    Screenshots(const QString &examples, const QString &theme, const QString &folder)
+        : m_examples(QDir(examples).absolutePath())
+        , m_theme(theme)
+        , m_folder(folder)
+    {
+        ZtAppSettings::getInstance()->setStoragePath(QString());
+        KvDeskTheme::store(theme);
+        KvDeskGallerySettings::setSnapshotsFolder(m_examples + QStringLiteral("/pictures"));
+        KvDeskFirstTemplates::offer(m_examples + QStringLiteral("/templates"));
+        m_desk = std::make_unique<RunningDesk>();
+        m_desk->window()->resize(1280, 800);
+    }
+
+    void takeAll()
+    {
+        takeDesk();
+        takeDialogs();
+        takeEditor();
+        takeStatistics();
+    }
+
+private:
+    static void settle() { QTest::qWait(400); }
+
+    void take(QWidget *widget, const QString &name) const
+    {
+        settle();
+        const QString path = QStringLiteral("%1/%2-%3.png").arg(m_folder, name, m_theme.toLower());
+        if (!widget->grab().save(path))
+            std::fprintf(stderr, "screenshots: %s cannot be written\n", qPrintable(path));
+        std::printf("%s\n", qPrintable(path));
+    }
+
+    QAction *action(KvDeskActions::Id id) const { return m_desk->window()->actions()->action(id); }
+    KvDeskFileCommands *files() const { return m_desk->window()->files(); }
+    QString session(const char *name) const
+    {
+        return QStringLiteral("%1/sessions/%2.json").arg(m_examples, QLatin1String(name));
+    }
+
+    void takeDesk()
+    {
+        KvDeskMainWindow *const window = m_desk->window();
+        take(window, QStringLiteral("desk-start"));
+        window->resize(800, 520);
+        take(window, QStringLiteral("desk-start-small"));
+        window->resize(1280, 800);
+        // Before there are objects: then nothing asks to be saved.
+        window->sources()->open(ZtFrameSourceCatalogue::infoOfPath(m_examples + QStringLiteral("/pictures")));
+        take(window, QStringLiteral("desk-live"));
+        for (const char *const name : {"coin", "cells", "fibres", "demo"}) {
+            files()->openCopy(session(name));
+            take(window, QStringLiteral("desk-%1").arg(QLatin1String(name)));
+        }
+        window->selection()->select({ZtDrawnType::Line, 2});
+        take(window, QStringLiteral("desk-selected"));
+        action(KvDeskActions::StartPage)->trigger();
+        take(window, QStringLiteral("desk-start-over-image"));
+        action(KvDeskActions::CounterTool)->trigger();
+        take(window, QStringLiteral("desk-counter-tool"));
+        action(KvDeskActions::ShowGallery)->trigger();
+        action(KvDeskActions::ShowLog)->trigger();
+        take(window, QStringLiteral("desk-gallery-and-log"));
+        action(KvDeskActions::ShowGallery)->trigger();
+        action(KvDeskActions::ShowLog)->trigger();
+        action(KvDeskActions::SelectTool)->trigger();
+        take(m_desk->window()->toolColumn(), QStringLiteral("panel-report"));
+    }
+
+    void takeDialogs()
+    {
+        KvDeskSettingsDialog settings(m_desk->window());
+        takeDialog(&settings, "dialog-settings");
+        KvDeskExportDialog table({}, m_desk->window());
+        takeDialog(&table, "dialog-export");
+        QMessageBox question(QMessageBox::Question, QStringLiteral("Unsaved changes"),
+                             QStringLiteral("Save the changes to \"plate.json\"?"),
+                             QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel,
+                             m_desk->window());
+        takeDialog(&question, "dialog-question");
+        action(KvDeskActions::Calibrate)->trigger();
+        for (QWidget *const widget : QApplication::topLevelWidgets()) {
+            if (!widget->inherits("KvDeskCalibrationDialog"))
+                continue;
+            int count = 0;
+            for (QAbstractButton *const way : widget->findChild<QButtonGroup *>()->buttons()) {
+                way->click();
+                take(widget, QStringLiteral("dialog-calibration-%1").arg(++count));
+            }
+            widget->close();
+        }
+    }
+
+    void takeDialog(QDialog *dialog, const char *name) const
+    {
+        dialog->show();
+        take(dialog, QLatin1String(name));
+        dialog->close();
+    }
+
+    void takeEditor()
+    {
+        m_desk->button("theEditorButton")->click();
+        QWidget *const editor = m_desk->editor();
+        editor->resize(1280, 800);
+        take(editor, QStringLiteral("editor-empty"));
+        const FileDialogAnswerer answerer(m_examples + QStringLiteral("/templates/every-block.rtp"));
+        editor->activateWindow();
+        QTest::keyClick(editor, Qt::Key_O, Qt::ControlModifier);
+        take(editor, QStringLiteral("editor-every-block"));
+        takeOptions(editor);
+        editor->close();
+    }
+
+    // Of each type of block the first.
+    void takeOptions(QWidget *editor) const
+    {
+        std::set<QString> seen;
+        const QStringList classes = m_desk->pieceClasses();
+        for (int i = 0; i < classes.size(); ++i) {
+            if (!seen.insert(classes.at(i)).second)
+                continue;
+            QGraphicsProxyWidget *const piece = m_desk->pieces().at(i);
+            m_desk->pages()->centerOn(piece);
+            settle();
+            QTest::mouseClick(m_desk->pages()->viewport(), Qt::LeftButton, Qt::NoModifier,
+                              m_desk->pages()->mapFromScene(m_desk->centerOf(piece)));
+            take(editor, QStringLiteral("editor-options-%1").arg(classes.at(i)));
+        }
+    }
+
+    void takeStatistics()
+    {
+        files()->openCopy(session("fibres"));
+        m_desk->button("theStatisticsButton")->click();
+        QWidget *const window = m_desk->statisticsWindow();
+        window->resize(1280, 800);
+        // Collected first: showing another chart deletes what belonged to the one before.
+        QList<QWidget *> buttons;
+        for (QWidget *const widget : window->findChildren<QWidget *>()) {
+            if (widget->inherits("KvStatisticsToolIconButton"))
+                buttons.append(widget);
+        }
+        for (int i = 0; i < buttons.size(); ++i) {
+            QTest::mouseClick(buttons.at(i), Qt::LeftButton);
+            take(window, QStringLiteral("statistics-%1").arg(i + 1));
+        }
+        window->close();
+    }
+
+    QString m_examples;
+    QString m_theme;
+    QString m_folder;
+    std::unique_ptr<RunningDesk> m_desk;
+};
+
+int main(int argc, char **argv)
+{
+    if (argc != 4) {
+        std::fputs("Usage: Screenshots EXAMPLES Dark|Light FOLDER\n", stderr);
+        return 2;
+    }
+    QCoreApplication::setAttribute(Qt::AA_Use96Dpi);
+    QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
+    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    const QApplication application(argc, argv);
+    ZtAppSettings::setProgramInfo(QStringLiteral("Measuring Desk"), QStringLiteral(STATREPORT_VERSION),
+                                  QStringLiteral("StatReport"));
+    const QString folder = QString::fromLocal8Bit(argv[3]);
+    QDir().mkpath(folder);
+    Screenshots(QString::fromLocal8Bit(argv[1]), QString::fromLocal8Bit(argv[2]), folder).takeAll();
+    return 0;
+}
