@@ -67,6 +67,7 @@ set(STATREPORT_LANGUAGES English German French Spanish Italian Russian Japanese 
     ChineseTraditional Slovakian)
 
 # Compiles a target's translations into its resources: FOLDER/<language>.ts is found as ":/PREFIX/<language>.qm".
+# A program that uses the target's code but not the target links <target>_translations.
 function(statreport_translations name)
   cmake_parse_arguments(ARG "" "PREFIX;FOLDER" "" ${ARGN})
   set(output ${CMAKE_CURRENT_BINARY_DIR}/translations/${ARG_PREFIX})
@@ -82,7 +83,10 @@ function(statreport_translations name)
     CONTENT "<RCC>\n  <qresource prefix=\"/${ARG_PREFIX}\">\n${entries}  </qresource>\n</RCC>\n")
   # Not left to AUTORCC, which knows nothing of files that the build makes.
   qt5_add_resources(resources ${output}/${ARG_PREFIX}.qrc)
-  target_sources(${name} PRIVATE ${resources})
+  add_library(${name}_translations OBJECT ${resources})
+  target_link_libraries(${name}_translations PRIVATE Qt5::Core)
+  set_target_properties(${name}_translations PROPERTIES AUTOMOC OFF AUTOUIC OFF AUTORCC OFF)
+  target_link_libraries(${name} PRIVATE ${name}_translations)
 endfunction()
 
 function(statreport_executable name)

@@ -45,6 +45,7 @@ public:
         m_window.reset();
     }
 
+    ZtMeasuringDocument *document() const { return m_document.get(); }
     KvDeskMainWindow *window() const { return m_window.get(); }
     int pluginCount() const { return m_plugins->count(); }
     /** Ends the plug-ins while the rest goes on. */
