@@ -423,8 +423,8 @@ void StatReportProgramTest::notesMissingGlyphs()
     const ProgramResult result = run("render good.rtp --table private.csv -o out.pdf");
     QCOMPARE(result.exitCode, 0);
     QVERIFY2(result.errors.startsWith(
-                 QLatin1String("statreport: note: no installed font has these characters, they "
-                               "are left out: ")),
+                 QLatin1String("statreport: note: No installed font has these characters, the report leaves "
+                               "them out: ")),
              qPrintable(result.errors));
     QCOMPARE(result.errors.count(QLatin1Char('\n')), 1);
 }
