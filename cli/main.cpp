@@ -50,7 +50,7 @@ int runApplication(int argc, char **argv, const QString &language, const KvCliAr
     qSetGlobalQHashSeed(0);
     QCoreApplication::setAttribute(Qt::AA_Use96Dpi);
     QApplication application(argc, argv);
-    const KvCliTranslation translation(language);
+    const KvCliTranslation translation(arguments.isForPrograms() ? QStringLiteral("English") : language);
     acss::QtAdvancedStylesheet::substituteFonts();
     ZtAppSettings::getInstance()->setStoragePath(QString());
     ZtAppSettings::setProgramInfo(QStringLiteral("StatReport"), QStringLiteral(STATREPORT_VERSION),

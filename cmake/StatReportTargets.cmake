@@ -79,10 +79,11 @@ function(statreport_translations name)
   endforeach()
   set_source_files_properties(${ts_files} PROPERTIES OUTPUT_LOCATION ${output})
   qt5_add_translation(qm_files ${ts_files} OPTIONS -silent)
-  file(CONFIGURE OUTPUT ${output}/${ARG_PREFIX}.qrc @ONLY
+  file(CONFIGURE OUTPUT ${output}/${ARG_PREFIX}_translations.qrc @ONLY
     CONTENT "<RCC>\n  <qresource prefix=\"/${ARG_PREFIX}\">\n${entries}  </qresource>\n</RCC>\n")
-  # Not left to AUTORCC, which knows nothing of files that the build makes.
-  qt5_add_resources(resources ${output}/${ARG_PREFIX}.qrc)
+  # Not left to AUTORCC, which knows nothing of files that the build makes. The file names the function that
+  # registers its content, so it must not be named like other resources of the program.
+  qt5_add_resources(resources ${output}/${ARG_PREFIX}_translations.qrc)
   add_library(${name}_translations OBJECT ${resources})
   target_link_libraries(${name}_translations PRIVATE Qt5::Core)
   set_target_properties(${name}_translations PROPERTIES AUTOMOC OFF AUTOUIC OFF AUTORCC OFF)

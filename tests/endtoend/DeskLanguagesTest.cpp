@@ -12,12 +12,15 @@
 #include "KvDeskSettingsDialog.h"
 #include "KvDeskToolColumn.h"
 #include "KvDeskTranslation.h"
+#include "KvDeskValueTable.h"
+#include "KvDeskValueTableModel.h"
 #include "RunningDesk.h"
 #include "ShortcutLetters.h"
 #include "TextFit.h"
 #include "host/desk/FakeCamera.h"
 #include "host/desk/RecoveryCopies.h"
 #include "kernel/ZtAppSettings.h"
+#include "measuring/ZtDrawnObjectPainter.h"
 
 namespace {
 
@@ -26,6 +29,18 @@ constexpr int kSettlingTime = 500; ///< milliseconds
 QByteArray lines(const QStringList &texts)
 {
     return '\n' + texts.join(QLatin1Char('\n')).toUtf8();
+}
+
+/// Layouts show what they are given in the next round of events.
+bool hasShownAll(const QWidget *window)
+{
+    for (QWidget *widget : window->findChildren<QWidget *>()) {
+        const QWidget *const parent = widget->parentWidget();
+        if (parent->isVisible() && parent->layout() && parent->layout()->indexOf(widget) >= 0 &&
+            widget->isHidden() && !widget->testAttribute(Qt::WA_WState_ExplicitShowHide))
+            return false;
+    }
+    return true;
 }
 
 } // namespace
@@ -50,6 +65,7 @@ private slots:
     void lettersAreUnique_data() { addLanguages(); }
     void lettersAreUnique();
     void arabicMirrorsTheInterfaceOnly();
+    void labelsOfObjectsReadAlike();
 
 private:
     static void addLanguages()
@@ -104,6 +120,7 @@ void DeskLanguagesTest::start(const QString &language)
 void DeskLanguagesTest::look(QWidget *window, const char *name)
 {
     QVERIFY(QTest::qWaitForWindowExposed(window));
+    QTRY_VERIFY(hasShownAll(window));
     // Layouts take a few rounds of events after a change.
     const bool isSettled =
         QTest::qWaitFor([window]() { return TextFit::faults(window).isEmpty(); }, kSettlingTime);
@@ -124,6 +141,7 @@ void DeskLanguagesTest::openSession()
 {
     QVERIFY(
         m_desk->window()->files()->openSession(sourcePath(QStringLiteral("examples/sessions/demo.json"))));
+    QTRY_VERIFY(m_desk->window()->valueTable()->model()->rowCount() > 0);
 }
 
 void DeskLanguagesTest::showLiveImage()
@@ -283,6 +301,22 @@ void DeskLanguagesTest::arabicMirrorsTheInterfaceOnly()
         for (const QWidget *part : qAsConst(parts))
             QVERIFY2(part->layoutDirection() == Qt::LeftToRight, part->metaObject()->className());
     }
+}
+
+/// What is drawn on images is the same whatever the direction of the interface: the name, the value, its
+/// unit.
+void DeskLanguagesTest::labelsOfObjectsReadAlike()
+{
+    const auto label = [](Qt::LayoutDirection direction) {
+        QGuiApplication::setLayoutDirection(direction);
+        QImage image(300, 40, QImage::Format_RGB32);
+        image.fill(Qt::gray);
+        QPainter painter(&image);
+        const QString text = QStringLiteral("\u062E\u0637 1  2.126 mm");
+        ZtDrawnObjectPainter(&painter).drawLabelBox(QRectF(10, 5, 280, 30), text);
+        return image;
+    };
+    QCOMPARE(label(Qt::RightToLeft), label(Qt::LeftToRight));
 }
 
 STATREPORT_TEST_MAIN(DeskLanguagesTest)
