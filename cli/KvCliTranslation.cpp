@@ -6,21 +6,35 @@
 #include <QLocale>
 #include <QTranslator>
 
+namespace {
+
+std::unique_ptr<QTranslator> loaded(const char *product, const QString &language)
+{
+    auto translator = std::make_unique<QTranslator>();
+    const bool isThere = translator->load(QStringLiteral(":/%1/%2.qm").arg(QLatin1String(product), language));
+    return isThere ? std::move(translator) : nullptr;
+}
+
+std::unique_ptr<QTranslator> loadedForQt(const QLocale &locale)
+{
+    auto translator = std::make_unique<QTranslator>();
+    const bool isThere = translator->load(locale, QStringLiteral("qtbase"), QStringLiteral("_"),
+                                          QLibraryInfo::location(QLibraryInfo::TranslationsPath));
+    return isThere ? std::move(translator) : nullptr;
+}
+
+} // namespace
+
 KvCliTranslation::KvCliTranslation(const QString &language)
 {
-    for (const char *product : {"measuringdesk", "statreportingplugin", "statreport"}) {
-        auto translator = std::make_unique<QTranslator>();
-        if (translator->load(QStringLiteral(":/%1/%2.qm").arg(QLatin1String(product), language)))
-            add(std::move(translator));
-    }
-    // The program's file says which locale it is for.
-    if (m_translators.empty())
+    std::unique_ptr<QTranslator> own = loaded("statreport", language);
+    if (!own)
         return;
-    auto qt = std::make_unique<QTranslator>();
-    const QString folder = QLibraryInfo::location(QLibraryInfo::TranslationsPath);
-    if (qt->load(QLocale(m_translators.back()->language()), QStringLiteral("qtbase"), QStringLiteral("_"),
-                 folder))
-        add(std::move(qt));
+    // The one that is added last is asked first.
+    add(loadedForQt(QLocale(own->language())));
+    add(loaded("measuringdesk", language));
+    add(loaded("statreportingplugin", language));
+    add(std::move(own));
 }
 
 KvCliTranslation::~KvCliTranslation()
@@ -31,6 +45,8 @@ KvCliTranslation::~KvCliTranslation()
 
 void KvCliTranslation::add(std::unique_ptr<QTranslator> translator)
 {
+    if (!translator)
+        return;
     QCoreApplication::installTranslator(translator.get());
     m_translators.push_back(std::move(translator));
 }
