@@ -81,6 +81,8 @@ private:
     void openEditor();
     void composeAll();
     void openStatistics();
+    void lookAtDialogsOfTexts();
+    void lookAtModalDialog(const char *slot);
     void look(QWidget *window, const char *name);
 
     std::unique_ptr<KvDeskTranslation> m_translation;
@@ -175,7 +177,31 @@ void DeskLanguagesTest::composeAll()
         m_user.clickScene(m_desk->pages(), m_desk->centerOf(added));
         QTRY_VERIFY(m_desk->options() && m_desk->options()->isVisible());
         look(m_desk->editor(), m_desk->options()->metaObject()->className());
+        if (m_desk->options()->inherits("KvTextDocumentNodeOptionsWidget"))
+            lookAtDialogsOfTexts();
     }
+}
+
+void DeskLanguagesTest::lookAtDialogsOfTexts()
+{
+    for (const char *slot : {"slotLinkClicked", "slotGalleryClicked"})
+        lookAtModalDialog(slot);
+}
+
+/// \a slot of the options runs a dialog, in which this looks and which it closes.
+void DeskLanguagesTest::lookAtModalDialog(const char *slot)
+{
+    bool hasLooked = false;
+    QTimer::singleShot(0, this, [this, slot, &hasLooked]() {
+        QWidget *dialog = QApplication::activeModalWidget();
+        if (!dialog)
+            return;
+        look(dialog, slot);
+        hasLooked = true;
+        dialog->close();
+    });
+    QVERIFY(QMetaObject::invokeMethod(m_desk->options(), slot));
+    QVERIFY2(hasLooked, slot);
 }
 
 void DeskLanguagesTest::openStatistics()
