@@ -25,4 +25,7 @@ struct KvCliArguments
     Format format = Text;
     bool jsonErrors = false;
     bool quiet = false;
+
+    /** Whether the result is for programs, which know names in English only. */
+    bool isForPrograms() const { return format != Text; }
 };

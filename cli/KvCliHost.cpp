@@ -55,8 +55,7 @@ bool KvCliHost::loadSession(const KvCliArguments &arguments, const KvCliOutput &
         return false;
     }
     if (!m_document->imagePath().isEmpty() && !m_document->frameSource() && arguments.imagePath.isEmpty())
-        output.note(
-            QStringLiteral("%1: the image %2 is missing").arg(source.displayName(), m_document->imagePath()));
+        output.note(tr("%1: the image %2 is missing").arg(source.displayName(), m_document->imagePath()));
     return true;
 }
 

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QCoreApplication>
+
 #include <memory>
 
 class KvBlockTypeList;
@@ -13,6 +15,8 @@ struct KvCliArguments;
  * types. */
 class KvCliHost
 {
+    Q_DECLARE_TR_FUNCTIONS(KvCliHost)
+
 public:
     KvCliHost();
     ~KvCliHost();

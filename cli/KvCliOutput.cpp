@@ -39,8 +39,8 @@ bool KvCliOutput::result(const QByteArray &bytes) const
     if (write(stdout, bytes))
         return true;
     ZtFault fault;
-    fault.message = QStringLiteral("cannot be written: ") + QString::fromLocal8Bit(std::strerror(errno));
-    fault.file = QStringLiteral("<standard output>");
+    fault.message = tr("cannot be written: %1").arg(QString::fromLocal8Bit(std::strerror(errno)));
+    fault.file = standardOutputName();
     error(fault);
     return false;
 }
@@ -48,7 +48,7 @@ bool KvCliOutput::result(const QByteArray &bytes) const
 void KvCliOutput::note(const QString &text) const
 {
     if (!m_quiet)
-        write(stderr, singleLine(QStringLiteral("statreport: note: ") + text));
+        write(stderr, singleLine(QStringLiteral("statreport: ") + tr("note: %1").arg(text)));
 }
 
 void KvCliOutput::error(const QString &text) const
@@ -75,6 +75,11 @@ void KvCliOutput::error(const ZtFault &fault) const
         object.insert(QStringLiteral("column"), fault.column);
     const QJsonObject root{{QStringLiteral("error"), object}};
     write(stderr, QJsonDocument(root).toJson(QJsonDocument::Compact) + '\n');
+}
+
+QString KvCliOutput::standardOutputName()
+{
+    return tr("<standard output>");
 }
 
 bool KvCliOutput::isTerminal()

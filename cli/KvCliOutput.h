@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QCoreApplication>
 #include <QString>
 
 struct ZtFault;
@@ -8,6 +9,8 @@ struct ZtFault;
 /** Where the tool writes: results to standard output, errors and notes to standard error, a line each. */
 class KvCliOutput
 {
+    Q_DECLARE_TR_FUNCTIONS(KvCliOutput)
+
 public:
     void setJsonErrors(bool json) { m_jsonErrors = json; }
     void setQuiet(bool quiet) { m_quiet = quiet; }
@@ -21,6 +24,9 @@ public:
     void note(const QString &text) const;
     void error(const QString &text) const;
     void error(const ZtFault &fault) const;
+
+    /** What to call standard output in messages. */
+    static QString standardOutputName();
 
     /** Whether standard error is a terminal, so that progress may be shown on it. */
     static bool isTerminal();

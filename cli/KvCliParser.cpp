@@ -1,34 +1,22 @@
 // SPDX-License-Identifier: MIT
 #include "KvCliParser.h"
 
-#include <QCommandLineParser>
-#include <QCoreApplication>
+#include "KvCliLanguage.h"
 
-#include <memory>
+#include <QCommandLineParser>
 
 namespace {
 
-const char kOverview[] =
-    "Usage: statreport COMMAND [options]\n"
-    "Turns measurements and a report template into a PDF report, without a display.\n"
-    "\n"
-    "Commands:\n"
-    "  render TEMPLATE.rtp (--session S | --table T) [--image I] -o OUT.pdf\n"
-    "                        prints a report\n"
-    "  stats (--session S | --table T) [--group-by object|measurement]\n"
-    "        [--format text|csv|json]\n"
-    "                        prints the statistics of every measured value\n"
-    "  check TEMPLATE.rtp    says what a template holds and what would be skipped or refused\n"
-    "  blocks [--format text|json]\n"
-    "                        lists the block types and their settings with defaults\n"
-    "\n"
-    "Options everywhere:\n"
-    "  -h, --help            this text, or that of a command\n"
-    "  -v, --version         the version\n"
-    "  --json-errors         errors as one line of JSON each\n"
-    "\n"
-    "\"-\" as a file name is standard input or output. Exit codes: 0 done, 1 the work failed,\n"
-    "2 wrong usage.\n";
+// Qt's own texts, which its translations would translate if they were there.
+constexpr const char *kParserTexts[] = {
+    QT_TRANSLATE_NOOP("QCommandLineParser", "Usage: %1"),
+    QT_TRANSLATE_NOOP("QCommandLineParser", "[options]"),
+    QT_TRANSLATE_NOOP("QCommandLineParser", "Options:"),
+    QT_TRANSLATE_NOOP("QCommandLineParser", "Arguments:"),
+    QT_TRANSLATE_NOOP("QCommandLineParser", "Unknown option '%1'."),
+    QT_TRANSLATE_NOOP("QCommandLineParser", "Unknown options: %1."),
+    QT_TRANSLATE_NOOP("QCommandLineParser", "Missing value after '%1'."),
+    QT_TRANSLATE_NOOP("QCommandLineParser", "Unexpected value after '%1'.")};
 
 struct CommandName
 {
@@ -58,30 +46,86 @@ KvCliParseResult shownText(const QString &text)
     return result;
 }
 
-// The parser asks the application for the program's name, and the command line is read before there is one.
+QString languageDescription()
+{
+    return KvCliParser::tr("Language of messages and reports, such as German or de; otherwise the system's.");
+}
+
+QString descriptionOf(KvCliArguments::Command command)
+{
+    switch (command) {
+    case KvCliArguments::Render:
+        return KvCliParser::tr("Prints a report: template and measurements in, PDF out.");
+    case KvCliArguments::Stats:
+        return KvCliParser::tr("Prints the statistics of every measured value, in the table's own units.");
+    case KvCliArguments::Check:
+        return KvCliParser::tr("Says what a template holds and what would be skipped or refused.");
+    default:
+        return KvCliParser::tr("Lists the block types and their settings with defaults.");
+    }
+}
+
+QString optionsWord()
+{
+    return QCommandLineParser::tr(kParserTexts[1]);
+}
+
 QString helpOf(const QCommandLineParser &parser, const QString &command)
 {
-    int count = 1;
-    char name[] = "statreport";
-    char *words[] = {name, nullptr};
-    std::unique_ptr<QCoreApplication> application;
-    if (!QCoreApplication::instance())
-        application = std::make_unique<QCoreApplication>(count, words);
     // The options come behind the command.
     QString text = parser.helpText();
-    return text.replace(QStringLiteral(" [options] ") + command,
-                        QLatin1Char(' ') + command + QStringLiteral(" [options]"));
+    const QString blank = QStringLiteral(" ");
+    return text.replace(blank + optionsWord() + blank + command, blank + command + blank + optionsWord());
+}
+
+/** A line of the overview: what to write, and behind it or on the next line, what it does. */
+QString overviewLine(const QString &syntax, const QString &description)
+{
+    constexpr int kColumn = 24;
+    const QString start = QStringLiteral("  ") + syntax;
+    if (start.size() < kColumn - 1)
+        return start.leftJustified(kColumn) + description + QLatin1Char('\n');
+    return start + QLatin1Char('\n') + QString(kColumn, QLatin1Char(' ')) + description + QLatin1Char('\n');
+}
+
+QString overview()
+{
+    const QString usage = QStringLiteral("statreport %1 %2").arg(QStringLiteral("COMMAND"), optionsWord());
+    QString text = QCommandLineParser::tr(kParserTexts[0]).arg(usage) + QLatin1Char('\n');
+    text += KvCliParser::tr("Turns measurements and a report template into a PDF report, without a display.");
+    text += QLatin1String("\n\n") + KvCliParser::tr("Commands:") + QLatin1Char('\n');
+    text +=
+        overviewLine(QStringLiteral("render TEMPLATE.rtp (--session S | --table T) [--image I] -o OUT.pdf"),
+                     descriptionOf(KvCliArguments::Render));
+    text += overviewLine(QStringLiteral("stats (--session S | --table T) [--group-by object|measurement]\n"
+                                        "        [--format text|csv|json]"),
+                         descriptionOf(KvCliArguments::Stats));
+    text += overviewLine(QStringLiteral("check TEMPLATE.rtp"), descriptionOf(KvCliArguments::Check));
+    text +=
+        overviewLine(QStringLiteral("blocks [--format text|json]"), descriptionOf(KvCliArguments::Blocks));
+    text += QLatin1Char('\n') + KvCliParser::tr("Options everywhere:") + QLatin1Char('\n');
+    text +=
+        overviewLine(QStringLiteral("-h, --help"), KvCliParser::tr("Shows this text, or that of a command."));
+    text += overviewLine(QStringLiteral("-v, --version"), KvCliParser::tr("Shows the version."));
+    text += overviewLine(QStringLiteral("-q, --quiet"), KvCliParser::tr("Writes no notes and no progress."));
+    text += overviewLine(QStringLiteral("--json-errors"),
+                         KvCliParser::tr("Writes errors as one line of JSON each."));
+    text += overviewLine(QStringLiteral("--language NAME"), languageDescription());
+    text += QLatin1Char('\n') + KvCliParser::tr("\"-\" as a file name is standard input or output.");
+    text += QLatin1Char('\n') + KvCliParser::tr("Exit codes: 0 done, 1 the work failed, 2 wrong usage.");
+    return text + QLatin1Char('\n');
 }
 
 void addCommonOptions(QCommandLineParser &parser)
 {
-    parser.addOption({{QStringLiteral("h"), QStringLiteral("help")}, QStringLiteral("Shows this text.")});
+    parser.addOption({{QStringLiteral("h"), QStringLiteral("help")}, KvCliParser::tr("Shows this text.")});
     parser.addOption(
-        {{QStringLiteral("v"), QStringLiteral("version")}, QStringLiteral("Shows the version.")});
+        {{QStringLiteral("v"), QStringLiteral("version")}, KvCliParser::tr("Shows the version.")});
     parser.addOption(
-        {QStringLiteral("json-errors"), QStringLiteral("Writes errors as one line of JSON each.")});
-    parser.addOption(
-        {{QStringLiteral("q"), QStringLiteral("quiet")}, QStringLiteral("Writes no notes and no progress.")});
+        {QStringLiteral("json-errors"), KvCliParser::tr("Writes errors as one line of JSON each.")});
+    parser.addOption({QStringLiteral("language"), languageDescription(), QStringLiteral("name")});
+    parser.addOption({{QStringLiteral("q"), QStringLiteral("quiet")},
+                      KvCliParser::tr("Writes no notes and no progress.")});
 }
 
 void addDataOptions(QCommandLineParser &parser)
@@ -89,23 +133,21 @@ void addDataOptions(QCommandLineParser &parser)
     const QString file = QStringLiteral("file");
     const QString column = QStringLiteral("column");
     parser.addOption(
-        {QStringLiteral("session"), QStringLiteral("Measurements: a session of the Measuring Desk."), file});
-    parser.addOption(
-        {QStringLiteral("table"), QStringLiteral("Measurements: a table (CSV, TSV, ImageJ results)."), file});
-    parser.addOption(
-        {QStringLiteral("unit"),
-         QStringLiteral(
-             "Unit of the table's values that state none, or Name=unit for one value. May be given "
-             "several times."),
-         QStringLiteral("unit")});
-    parser.addOption(
-        {QStringLiteral("type-column"), QStringLiteral("The table's column with the object types."), column});
-    parser.addOption(
-        {QStringLiteral("name-column"), QStringLiteral("The table's column with the object names."), column});
-    parser.addOption({QStringLiteral("decimal"), QStringLiteral("Decimal mark of the table: point or comma."),
-                      QStringLiteral("mark")});
+        {QStringLiteral("session"), KvCliParser::tr("Measurements: a session of the Measuring Desk."), file});
+    parser.addOption({QStringLiteral("table"),
+                      KvCliParser::tr("Measurements: a table (CSV, TSV, ImageJ results)."), file});
+    parser.addOption({QStringLiteral("unit"),
+                      KvCliParser::tr("Unit of the table's values that state none, or Name=unit for one "
+                                      "value. May be given several times."),
+                      QStringLiteral("unit")});
+    parser.addOption({QStringLiteral("type-column"),
+                      KvCliParser::tr("The table's column with the object types."), column});
+    parser.addOption({QStringLiteral("name-column"),
+                      KvCliParser::tr("The table's column with the object names."), column});
+    parser.addOption({QStringLiteral("decimal"),
+                      KvCliParser::tr("Decimal mark of the table: point or comma."), QStringLiteral("mark")});
     parser.addOption({QStringLiteral("digits"),
-                      QStringLiteral("Significant digits of measured values; 0 is automatic."),
+                      KvCliParser::tr("Significant digits of measured values; 0 is automatic."),
                       QStringLiteral("count")});
 }
 
@@ -113,40 +155,31 @@ void addCommandOptions(QCommandLineParser &parser, KvCliArguments::Command comma
 {
     const QCommandLineOption format(QStringLiteral("format"),
                                     command == KvCliArguments::Stats
-                                        ? QStringLiteral("Output: text, csv or json.")
-                                        : QStringLiteral("Output: text or json."),
+                                        ? KvCliParser::tr("Output: text, csv or json.")
+                                        : KvCliParser::tr("Output: text or json."),
                                     QStringLiteral("format"), QStringLiteral("text"));
+    parser.setApplicationDescription(descriptionOf(command));
     switch (command) {
     case KvCliArguments::Render:
-        parser.setApplicationDescription(
-            QStringLiteral("Prints a report: template and measurements in, PDF out."));
-        parser.addPositionalArgument(QStringLiteral("TEMPLATE.rtp"), QStringLiteral("The report template."));
+        parser.addPositionalArgument(QStringLiteral("TEMPLATE.rtp"), KvCliParser::tr("The report template."));
         addDataOptions(parser);
-        parser.addOption({QStringLiteral("image"), QStringLiteral("The image that was measured."),
+        parser.addOption({QStringLiteral("image"), KvCliParser::tr("The image that was measured."),
                           QStringLiteral("file")});
         parser.addOption({{QStringLiteral("o"), QStringLiteral("output")},
-                          QStringLiteral("The PDF file to write."),
+                          KvCliParser::tr("The PDF file to write."),
                           QStringLiteral("file")});
         break;
     case KvCliArguments::Stats:
-        parser.setApplicationDescription(
-            QStringLiteral("Prints the statistics of every measured value, in the table's "
-                           "own units."));
         addDataOptions(parser);
         parser.addOption({QStringLiteral("group-by"),
-                          QStringLiteral("Groups: object (type and value) or measurement."),
+                          KvCliParser::tr("Groups: object (type and value) or measurement."),
                           QStringLiteral("grouping"), QStringLiteral("object")});
         parser.addOption(format);
         break;
     case KvCliArguments::Check:
-        parser.setApplicationDescription(
-            QStringLiteral("Says what a template holds and what would be skipped or "
-                           "refused."));
-        parser.addPositionalArgument(QStringLiteral("TEMPLATE.rtp"), QStringLiteral("The report template."));
+        parser.addPositionalArgument(QStringLiteral("TEMPLATE.rtp"), KvCliParser::tr("The report template."));
         break;
     default:
-        parser.setApplicationDescription(
-            QStringLiteral("Lists the block types and their settings with defaults."));
         parser.addOption(format);
         break;
     }
@@ -165,8 +198,8 @@ QString takeFormat(const QCommandLineParser &parser, KvCliArguments &arguments)
     else if (format == QLatin1String("csv") && hasCsv)
         arguments.format = KvCliArguments::Csv;
     else if (format != QLatin1String("text"))
-        return QStringLiteral("--format must be %1, not \"%2\"")
-            .arg(hasCsv ? QStringLiteral("text, csv or json") : QStringLiteral("text or json"), format);
+        return KvCliParser::tr("--format must be %1, not \"%2\"")
+            .arg(hasCsv ? KvCliParser::tr("text, csv or json") : KvCliParser::tr("text or json"), format);
     return QString();
 }
 
@@ -177,7 +210,7 @@ QString takeGrouping(const QCommandLineParser &parser, KvCliArguments &arguments
     const QString grouping = parser.value(QStringLiteral("group-by"));
     arguments.groupByObject = grouping == QLatin1String("object");
     if (!arguments.groupByObject && grouping != QLatin1String("measurement"))
-        return QStringLiteral("--group-by must be object or measurement, not \"%1\"").arg(grouping);
+        return KvCliParser::tr("--group-by must be object or measurement, not \"%1\"").arg(grouping);
     return QString();
 }
 
@@ -188,7 +221,7 @@ QString takeDigits(const QCommandLineParser &parser, KvCliArguments &arguments)
     bool isNumber = false;
     arguments.digits = parser.value(QStringLiteral("digits")).toUInt(&isNumber);
     if (!isNumber || arguments.digits > 15)
-        return QStringLiteral("--digits must be a number from 0 to 15, not \"%1\"")
+        return KvCliParser::tr("--digits must be a number from 0 to 15, not \"%1\"")
             .arg(parser.value(QStringLiteral("digits")));
     return QString();
 }
@@ -204,10 +237,10 @@ QString takeData(const QCommandLineParser &parser, KvCliArguments &arguments)
     arguments.nameColumn = parser.value(QStringLiteral("name-column"));
     arguments.decimalMark = parser.value(QStringLiteral("decimal"));
     if (arguments.sessionPath.isEmpty() == arguments.tablePath.isEmpty())
-        return QStringLiteral("give the measurements: either --session or --table");
+        return KvCliParser::tr("give the measurements: either --session or --table");
     if (!arguments.decimalMark.isEmpty() && arguments.decimalMark != QLatin1String("point") &&
         arguments.decimalMark != QLatin1String("comma"))
-        return QStringLiteral("--decimal must be point or comma, not \"%1\"").arg(arguments.decimalMark);
+        return KvCliParser::tr("--decimal must be point or comma, not \"%1\"").arg(arguments.decimalMark);
     return takeDigits(parser, arguments);
 }
 
@@ -219,16 +252,16 @@ QString takePositionals(const QCommandLineParser &parser, KvCliArguments &argume
         arguments.command == KvCliArguments::Render || arguments.command == KvCliArguments::Check;
     const int wanted = wantsTemplate ? 1 : 0;
     if (words.size() < wanted)
-        return QStringLiteral("the template is missing");
+        return KvCliParser::tr("the template is missing");
     if (words.size() > wanted)
-        return QStringLiteral("unexpected argument \"%1\"").arg(words.at(wanted));
+        return KvCliParser::tr("unexpected argument \"%1\"").arg(words.at(wanted));
     arguments.templatePath = words.value(0);
     if (arguments.command != KvCliArguments::Render)
         return QString();
     arguments.imagePath = parser.value(QStringLiteral("image"));
     arguments.outputPath = parser.value(QStringLiteral("output"));
     if (arguments.outputPath.isEmpty())
-        return QStringLiteral("the file to write is missing: -o OUT.pdf");
+        return KvCliParser::tr("the file to write is missing: -o OUT.pdf");
     return QString();
 }
 
@@ -237,12 +270,22 @@ QString doubleInputFault(const KvCliArguments &arguments)
     const QString input = QStringLiteral("-");
     const int count = (arguments.templatePath == input ? 1 : 0) + (arguments.sessionPath == input ? 1 : 0) +
                       (arguments.tablePath == input ? 1 : 0);
-    return count > 1 ? QStringLiteral("only one file can be read from standard input") : QString();
+    return count > 1 ? KvCliParser::tr("only one file can be read from standard input") : QString();
+}
+
+QString takeLanguage(const QCommandLineParser &parser, KvCliArguments &arguments)
+{
+    Q_UNUSED(arguments)
+    const QString name = parser.value(QStringLiteral("language"));
+    if (!parser.isSet(QStringLiteral("language")) || !KvCliLanguage::named(name).isEmpty())
+        return QString();
+    return KvCliParser::tr("--language must be one of %1, not \"%2\"")
+        .arg(KvCliLanguage::names().join(QLatin1String(", ")), name);
 }
 
 QString takeValues(const QCommandLineParser &parser, KvCliArguments &arguments)
 {
-    for (const auto take : {takePositionals, takeData, takeGrouping, takeFormat}) {
+    for (const auto take : {takeLanguage, takePositionals, takeData, takeGrouping, takeFormat}) {
         const QString fault = take(parser, arguments);
         if (!fault.isEmpty())
             return fault;
@@ -255,8 +298,12 @@ QString firstWord(const QStringList &arguments)
 {
     const QStringList common{QStringLiteral("--json-errors"), QStringLiteral("-q"),
                              QStringLiteral("--quiet")};
-    for (const QString &word : arguments.mid(1)) {
-        if (!common.contains(word))
+    const QString language = QStringLiteral("--language");
+    for (int i = 1; i < arguments.size(); ++i) {
+        const QString &word = arguments.at(i);
+        if (word == language)
+            ++i; // its value
+        else if (!common.contains(word) && !word.startsWith(language + QLatin1Char('=')))
             return word;
     }
     return QString();
@@ -268,7 +315,7 @@ KvCliParseResult KvCliParser::parse(const QStringList &arguments)
 {
     const QString first = firstWord(arguments);
     if (first == QLatin1String("-h") || first == QLatin1String("--help"))
-        return shownText(QLatin1String(kOverview));
+        return shownText(overview());
     const QString version = QStringLiteral("statreport " STATREPORT_VERSION "\n");
     if (first == QLatin1String("-v") || first == QLatin1String("--version"))
         return shownText(version);
@@ -277,12 +324,12 @@ KvCliParseResult KvCliParser::parse(const QStringList &arguments)
     result.arguments.command = commandOf(first);
     result.arguments.jsonErrors = arguments.contains(QStringLiteral("--json-errors"));
     if (first.isEmpty()) {
-        result.text = QStringLiteral("a command is missing: render, stats, check or blocks");
+        result.text = KvCliParser::tr("a command is missing: render, stats, check or blocks");
         return result;
     }
     if (result.arguments.command == KvCliArguments::NoCommand) {
         result.text =
-            QStringLiteral("unknown command \"%1\"; it must be render, stats, check or blocks").arg(first);
+            KvCliParser::tr("unknown command \"%1\"; it must be render, stats, check or blocks").arg(first);
         return result;
     }
     QCommandLineParser parser;

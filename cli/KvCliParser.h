@@ -3,6 +3,8 @@
 
 #include "KvCliArguments.h"
 
+#include <QCoreApplication>
+
 /** Outcome of reading a command line. */
 struct KvCliParseResult
 {
@@ -16,7 +18,10 @@ struct KvCliParseResult
 /** Reads command lines of statreport; prints nothing. */
 class KvCliParser
 {
+    Q_DECLARE_TR_FUNCTIONS(KvCliParser)
+
 public:
-    /** \a arguments start with the program's name. */
+    /** \a arguments start with the program's name. Texts are in the language of the application's
+     * translators. */
     static KvCliParseResult parse(const QStringList &arguments);
 };

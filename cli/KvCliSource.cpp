@@ -54,12 +54,12 @@ bool KvCliSource::open(const QString &name, ZtFault *fault)
     if (!needsCopy(name))
         return true;
     if (name == QLatin1String("-"))
-        m_displayName = QStringLiteral("<standard input>");
+        m_displayName = tr("<standard input>");
     m_copy = std::make_unique<QTemporaryFile>(QDir::temp().filePath(QStringLiteral("statreport-XXXXXX")));
     QFile input;
     if (!openInput(input, name) || !copyInto(*m_copy, input)) {
         fault->file = m_displayName;
-        fault->message = QStringLiteral("cannot be read");
+        fault->message = tr("cannot be read");
         return false;
     }
     m_path = m_copy->fileName();

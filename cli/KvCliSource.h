@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QCoreApplication>
 #include <QString>
 
 #include <memory>
@@ -12,6 +13,8 @@ struct ZtFault;
  * first. */
 class KvCliSource
 {
+    Q_DECLARE_TR_FUNCTIONS(KvCliSource)
+
 public:
     KvCliSource();
     ~KvCliSource();

@@ -9,17 +9,11 @@
 #include "KvTerminalProgress.h"
 
 #include "common/ZtAppStatus.h"
-#include "data/KvReportKernelData.h"
-#include "gui/ZtFontCoverage.h"
-#include "report/KvReportNode.h"
-#include "templates/KvBaseEditorNodeCfg.h"
 #include "templates/KvBlockRegistry.h"
-#include "templates/KvPageSectionsCfg.h"
 #include "templates/KvTemplateModel.h"
 #include "templates/KvUserMessages.h"
 
 #include <QFileInfo>
-#include <QJsonObject>
 #include <QScopeGuard>
 #include <QTemporaryFile>
 
@@ -72,16 +66,6 @@ QFileDevice::Permissions permissionsOfNewFiles()
     return permissions;
 }
 
-QString htmlText(const KvBaseEditorNodeCfg &cfg)
-{
-    QJsonObject object;
-    cfg.toJson(object);
-    QString texts;
-    for (const QJsonValue &value : qAsConst(object))
-        texts += value.toString();
-    return texts;
-}
-
 } // namespace
 
 KvRenderCommand::KvRenderCommand(const KvCliArguments &arguments, const KvCliOutput &output)
@@ -109,11 +93,11 @@ int KvRenderCommand::run()
     const int entriesBefore = ZtStatusLog::getInstance()->entries().size();
     if (!model.load(templateFile.path()))
         return 1;
-    noteWarnings(entriesBefore);
     model.beginLiveUpdates();
     const auto endLive = qScopeGuard([&model]() { model.endLiveUpdates(); });
-    noteMissingGlyphs(host, model);
-    return print(model) ? 0 : 1;
+    const bool isPrinted = print(model);
+    noteWarnings(entriesBefore);
+    return isPrinted ? 0 : 1;
 }
 
 bool KvRenderCommand::checkTemplate(KvCliHost &host, const QString &path, const QString &displayName) const
@@ -137,24 +121,6 @@ void KvRenderCommand::noteWarnings(int firstEntry) const
     }
 }
 
-void KvRenderCommand::noteMissingGlyphs(KvCliHost &host, KvTemplateModel &model) const
-{
-    ZtFontCoverage coverage(QFont(QStringLiteral("Segoe UI")));
-    for (const KvMeasuredValue &record : host.kernelData().measuredValues()) {
-        for (const QString &text :
-             {record.objectName, record.objectTypeName, record.valueName, record.valueText})
-            coverage.addText(text);
-    }
-    for (const KvReportNode *node : model.nodes())
-        coverage.addText(htmlText(*node->config()));
-    coverage.addText(model.header()->text());
-    coverage.addText(model.footer()->text());
-    const QString missing = coverage.missingCharacters();
-    if (!missing.isEmpty())
-        m_output.note(QStringLiteral("no installed font has these characters, they are left out: ") +
-                      missing.left(40));
-}
-
 bool KvRenderCommand::print(KvTemplateModel &model) const
 {
     if (m_arguments.outputPath == QLatin1String("-"))
@@ -162,7 +128,7 @@ bool KvRenderCommand::print(KvTemplateModel &model) const
     const QFileInfo target(m_arguments.outputPath);
     // Into devices and the like directly; a file only gets its new content when all of it is there.
     if (target.exists() && !target.isFile())
-        return target.isDir() ? failToWrite(m_arguments.outputPath, QStringLiteral("is a directory"))
+        return target.isDir() ? failToWrite(m_arguments.outputPath, tr("is a directory"))
                               : printThroughCopy(model);
     // A link stays one: what it points to is replaced.
     const QString path =
@@ -187,15 +153,14 @@ bool KvRenderCommand::printToFile(KvTemplateModel &model, const QString &path) c
     const bool isPrinted = model.print(path, &progress) != 0;
     progress.finish();
     if (!isPrinted || !isCompletePdf(path))
-        return failToWrite(m_arguments.outputPath,
-                           QStringLiteral("the file could not be written completely"));
+        return failToWrite(m_arguments.outputPath, tr("the file could not be written completely"));
     return true;
 }
 
 bool KvRenderCommand::printThroughCopy(KvTemplateModel &model) const
 {
     const bool isStandardOutput = m_arguments.outputPath == QLatin1String("-");
-    const QString name = isStandardOutput ? QStringLiteral("<standard output>") : m_arguments.outputPath;
+    const QString name = isStandardOutput ? KvCliOutput::standardOutputName() : m_arguments.outputPath;
     QTemporaryFile part;
     if (!part.open())
         return failToWrite(name, part.errorString());
@@ -217,7 +182,7 @@ bool KvRenderCommand::failToWrite(const QString &path, const QString &reason) co
 {
     ZtFault fault;
     fault.file = path;
-    fault.message = QStringLiteral("cannot be written: ") + reason;
+    fault.message = tr("cannot be written: %1").arg(reason);
     m_output.error(fault);
     return false;
 }

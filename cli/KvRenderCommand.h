@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QCoreApplication>
+
 class KvCliHost;
 class KvCliOutput;
 class KvTemplateModel;
@@ -10,6 +12,8 @@ class QString;
 /** "statreport render": template and measurements in, PDF out. */
 class KvRenderCommand
 {
+    Q_DECLARE_TR_FUNCTIONS(KvRenderCommand)
+
 public:
     KvRenderCommand(const KvCliArguments &arguments, const KvCliOutput &output);
 
@@ -24,7 +28,6 @@ private:
     bool printThroughCopy(KvTemplateModel &model) const;
     /** Notes what was logged as a warning or an error since the log had this many entries. */
     void noteWarnings(int firstEntry) const;
-    void noteMissingGlyphs(KvCliHost &host, KvTemplateModel &model) const;
     bool failToWrite(const QString &path, const QString &reason) const;
 
     const KvCliArguments &m_arguments;

@@ -87,6 +87,26 @@ QString readableNumber(double value)
     return text;
 }
 
+bool isWide(QChar character)
+{
+    switch (character.script()) {
+    case QChar::Script_Han:
+    case QChar::Script_Hiragana:
+    case QChar::Script_Katakana:
+    case QChar::Script_Hangul:
+    case QChar::Script_Bopomofo:
+        return true;
+    default:
+        return false;
+    }
+}
+
+// How many columns of a terminal a text takes: characters of East Asian scripts take two.
+int columnsOf(const QString &text)
+{
+    return text.size() + static_cast<int>(std::count_if(text.begin(), text.end(), isWide));
+}
+
 QString csvField(const QString &text)
 {
     const bool needsQuotes = text.contains(QLatin1Char(',')) || text.contains(QLatin1Char('"')) ||
@@ -98,14 +118,23 @@ QString csvField(const QString &text)
     return QLatin1Char('"') + quoted + QLatin1Char('"');
 }
 
-QStringList headings(bool groupByObject)
+// Translated for people only: programs know the columns of CSV by these names.
+constexpr const char *kHeadings[] = {
+    QT_TRANSLATE_NOOP("KvStatsReport", "Object Type"), QT_TRANSLATE_NOOP("KvStatsReport", "Measurement Type"),
+    QT_TRANSLATE_NOOP("KvStatsReport", "Unit"),        QT_TRANSLATE_NOOP("KvStatsReport", "Count"),
+    QT_TRANSLATE_NOOP("KvStatsReport", "Min"),         QT_TRANSLATE_NOOP("KvStatsReport", "Max"),
+    QT_TRANSLATE_NOOP("KvStatsReport", "Average"),     QT_TRANSLATE_NOOP("KvStatsReport", "Sigma"),
+    QT_TRANSLATE_NOOP("KvStatsReport", "3 Sigma"),     QT_TRANSLATE_NOOP("KvStatsReport", "6 Sigma")};
+
+enum class Reader { Person, Program };
+
+QStringList headings(bool groupByObject, Reader reader)
 {
     QStringList names;
-    if (groupByObject)
-        names.append(QStringLiteral("Object Type"));
-    names << QStringLiteral("Measurement Type") << QStringLiteral("Unit") << QStringLiteral("Count")
-          << QStringLiteral("Min") << QStringLiteral("Max") << QStringLiteral("Average")
-          << QStringLiteral("Sigma") << QStringLiteral("3 Sigma") << QStringLiteral("6 Sigma");
+    for (const char *heading : kHeadings)
+        names.append(reader == Reader::Person ? KvStatsReport::tr(heading) : QString::fromLatin1(heading));
+    if (!groupByObject)
+        names.removeFirst();
     return names;
 }
 
@@ -171,21 +200,21 @@ void KvStatsReport::addGroup(const KvStatisticsEngine &engine, const ZtMeasuring
 
 QString KvStatsReport::toText() const
 {
-    QVector<QStringList> rows{headings(m_groupByObject)};
+    QVector<QStringList> rows{headings(m_groupByObject, Reader::Person)};
     for (const KvGroupStatistics &group : m_groups)
         rows.append(fields(group, m_groupByObject, readableNumber));
     const int textColumns = m_groupByObject ? 3 : 2;
     QVector<int> widths(rows.first().size(), 0);
     for (const QStringList &row : qAsConst(rows)) {
         for (int i = 0; i < row.size(); ++i)
-            widths[i] = std::max(widths.at(i), row.at(i).size());
+            widths[i] = std::max(widths.at(i), columnsOf(row.at(i)));
     }
     QString text;
     for (const QStringList &row : qAsConst(rows)) {
         QString line;
         for (int i = 0; i < row.size(); ++i) {
-            line += i < textColumns ? row.at(i).leftJustified(widths.at(i))
-                                    : row.at(i).rightJustified(widths.at(i));
+            const QString blanks(widths.at(i) - columnsOf(row.at(i)), QLatin1Char(' '));
+            line += i < textColumns ? row.at(i) + blanks : blanks + row.at(i);
             line += QLatin1String("  ");
         }
         text += line.trimmed() + QLatin1Char('\n');
@@ -196,7 +225,7 @@ QString KvStatsReport::toText() const
 QString KvStatsReport::toCsv() const
 {
     const auto format = [](double value) { return number(value, kCsvDigits); };
-    QString text = headings(m_groupByObject).join(QLatin1Char(',')) + QLatin1Char('\n');
+    QString text = headings(m_groupByObject, Reader::Program).join(QLatin1Char(',')) + QLatin1Char('\n');
     for (const KvGroupStatistics &group : m_groups) {
         QStringList texts = fields(group, m_groupByObject, format);
         for (QString &field : texts)

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QCoreApplication>
 #include <QString>
 #include <QVector>
 
@@ -30,6 +31,8 @@ struct KvGroupStatistics
 /** Computes the statistics of all groups, and writes them as text, CSV or JSON. */
 class KvStatsReport
 {
+    Q_DECLARE_TR_FUNCTIONS(KvStatsReport)
+
 public:
     /**
      * The numbers are in the unit in which a table gave the values. Values that were drawn, or that a table

@@ -24,17 +24,17 @@ QString typeText(const QJsonValue &value)
     case QJsonValue::Null:
         return QStringLiteral("null");
     case QJsonValue::Bool:
-        return QStringLiteral("a boolean");
+        return KvTemplateCheck::tr("a boolean");
     case QJsonValue::Double:
-        return QStringLiteral("a number");
+        return KvTemplateCheck::tr("a number");
     case QJsonValue::String:
-        return QStringLiteral("a string");
+        return KvTemplateCheck::tr("a string");
     case QJsonValue::Array:
-        return QStringLiteral("an array");
+        return KvTemplateCheck::tr("an array");
     case QJsonValue::Object:
-        return QStringLiteral("an object");
+        return KvTemplateCheck::tr("an object");
     default:
-        return QStringLiteral("missing");
+        return KvTemplateCheck::tr("missing");
     }
 }
 
@@ -63,13 +63,13 @@ QString refusalOf(const QJsonObject &config, KvBaseEditorNodeFactory &factory)
         if (accepts(factory, probe))
             continue;
         if (value.isUndefined())
-            return QStringLiteral("\"%1\" is missing").arg(it.key());
+            return KvTemplateCheck::tr("\"%1\" is missing").arg(it.key());
         if (value.type() != it.value().type())
-            return QStringLiteral("\"%1\" is %2, not %3")
+            return KvTemplateCheck::tr("\"%1\" is %2, not %3")
                 .arg(it.key(), typeText(value), typeText(it.value()));
-        return QStringLiteral("\"%1\" has a value that the block refuses").arg(it.key());
+        return KvTemplateCheck::tr("\"%1\" has a value that the block refuses").arg(it.key());
     }
-    return QStringLiteral("the block refuses its settings");
+    return KvTemplateCheck::tr("the block refuses its settings");
 }
 
 } // namespace
@@ -109,21 +109,21 @@ bool KvTemplateCheck::readRoot(const QString &path, QJsonObject &root)
 {
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly))
-        return fail(QString(), QStringLiteral("cannot be opened: ") + file.errorString());
+        return fail(QString(), tr("cannot be opened: %1").arg(file.errorString()));
     const QByteArray bytes = file.read(kLargestFile + 1);
     if (file.error() != QFileDevice::NoError)
-        return fail(QString(), QStringLiteral("cannot be read: ") + file.errorString());
+        return fail(QString(), tr("cannot be read: %1").arg(file.errorString()));
     if (bytes.size() > kLargestFile)
-        return fail(QString(), QStringLiteral("is larger than 256 MB"));
+        return fail(QString(), tr("is larger than 256 MB"));
     QJsonParseError error;
     const QJsonDocument document = QJsonDocument::fromJson(bytes, &error);
     if (error.error != QJsonParseError::NoError) {
         m_fault.line = bytes.left(error.offset).count('\n') + 1;
         m_fault.column = error.offset - bytes.lastIndexOf('\n', error.offset > 0 ? error.offset - 1 : 0);
-        return fail(QString(), QStringLiteral("is no JSON: ") + error.errorString());
+        return fail(QString(), tr("is no JSON: %1").arg(error.errorString()));
     }
     if (!document.isObject())
-        return fail(QString(), QStringLiteral("is no template: the JSON document is no object"));
+        return fail(QString(), tr("is no template: the JSON document is no object"));
     root = document.object();
     return true;
 }
@@ -131,20 +131,18 @@ bool KvTemplateCheck::readRoot(const QString &path, QJsonObject &root)
 void KvTemplateCheck::checkPage(const QJsonValue &config)
 {
     if (!config.isObject()) {
-        warn(QStringLiteral("config"),
-             QStringLiteral("is %1; the page keeps its defaults").arg(typeText(config)));
+        warn(QStringLiteral("config"), tr("is %1; the page keeps its defaults").arg(typeText(config)));
         return;
     }
     const QJsonValue width = config.toObject().value(QStringLiteral("pageWidth"));
     const int pixels = width.toInt();
     if (!width.isUndefined() && pixels <= 0)
-        warn(QStringLiteral("config.pageWidth"), QStringLiteral("is no whole number of pixels above 0"));
+        warn(QStringLiteral("config.pageWidth"), tr("is no whole number of pixels above 0"));
     else if (!width.isUndefined())
-        m_contents.append(QStringLiteral("page width %1 px").arg(pixels));
+        m_contents.append(tr("page width %1 px").arg(pixels));
     const QJsonValue margin = config.toObject().value(QStringLiteral("marginWidth"));
     if (!margin.isUndefined() && (!margin.isDouble() || margin.toDouble() < 0.0 || margin.toDouble() >= 0.5))
-        warn(QStringLiteral("config.marginWidth"),
-             QStringLiteral("is no fraction of the page width from 0 to 0.5"));
+        warn(QStringLiteral("config.marginWidth"), tr("is no fraction of the page width from 0 to 0.5"));
 }
 
 void KvTemplateCheck::checkSection(const QString &key, const QJsonValue &section)
@@ -152,17 +150,16 @@ void KvTemplateCheck::checkSection(const QString &key, const QJsonValue &section
     if (section.isUndefined())
         return;
     if (!section.isObject()) {
-        warn(key, QStringLiteral("is %1, not an object; it is off").arg(typeText(section)));
+        warn(key, tr("is %1, not an object; it is off").arg(typeText(section)));
         return;
     }
     const QJsonValue enabled = section.toObject().value(QStringLiteral("enabled"));
     const QJsonValue text = section.toObject().value(QStringLiteral("text"));
     if (!enabled.isUndefined() && !enabled.isBool())
-        warn(key + QStringLiteral(".enabled"),
-             QStringLiteral("is %1, not a boolean; it is off").arg(typeText(enabled)));
+        warn(key + QStringLiteral(".enabled"), tr("is %1, not a boolean; it is off").arg(typeText(enabled)));
     else if (enabled.toBool() && !text.isString())
         warn(key + QStringLiteral(".text"),
-             QStringLiteral("is %1, not a string; the section is off").arg(typeText(text)));
+             tr("is %1, not a string; the section is off").arg(typeText(text)));
     else if (enabled.toBool())
         m_contents.append(key);
     checkKeywords(key + QStringLiteral(".text"), text.toString());
@@ -171,8 +168,7 @@ void KvTemplateCheck::checkSection(const QString &key, const QJsonValue &section
 bool KvTemplateCheck::checkNodes(const QJsonValue &nodes)
 {
     if (!nodes.isArray()) {
-        warn(QStringLiteral("nodes"),
-             QStringLiteral("is %1, not an array; there are no blocks").arg(typeText(nodes)));
+        warn(QStringLiteral("nodes"), tr("is %1, not an array; there are no blocks").arg(typeText(nodes)));
         return true;
     }
     const QJsonArray array = nodes.toArray();
@@ -188,12 +184,11 @@ bool KvTemplateCheck::checkNode(const QString &place, const QJsonValue &node)
     const QJsonValue name = node.toObject().value(QStringLiteral("name"));
     if (!name.isString()) {
         warn(place + QStringLiteral(".name"),
-             QStringLiteral("is %1, not a string; the block is skipped").arg(typeText(name)));
+             tr("is %1, not a string; the block is skipped").arg(typeText(name)));
         return true;
     }
     if (!m_blocks.find(name.toString())) {
-        warn(place,
-             QStringLiteral("there is no block type \"%1\"; the block is skipped").arg(name.toString()));
+        warn(place, tr("there is no block type \"%1\"; the block is skipped").arg(name.toString()));
         return true;
     }
     return checkConfig(place + QStringLiteral(".config"), name.toString(),
@@ -203,21 +198,19 @@ bool KvTemplateCheck::checkNode(const QString &place, const QJsonValue &node)
 bool KvTemplateCheck::checkConfig(const QString &place, const QString &typeName, const QJsonValue &config)
 {
     if (!config.isObject())
-        return fail(place, QStringLiteral("is %1, not an object").arg(typeText(config)));
+        return fail(place, tr("is %1, not an object").arg(typeText(config)));
     KvBaseEditorNodeFactory &factory = *m_blocks.find(typeName);
     const QJsonObject object = config.toObject();
     const QJsonObject defaults = defaultConfig(factory);
     const std::unique_ptr<KvBaseEditorNodeCfg> cfg(factory.createConfig(nullptr));
     if (!cfg->fromJson(object))
         return fail(place, refusalOf(object, factory));
-    m_contents.append(QStringLiteral("block \"%1\"").arg(typeName));
+    m_contents.append(tr("block \"%1\"").arg(typeName));
     for (auto it = object.constBegin(); it != object.constEnd(); ++it) {
         const QJsonValue expected = defaults.value(it.key());
         const QString member = place + QLatin1Char('.') + it.key();
         if (!expected.isUndefined() && expected.type() != it.value().type())
-            warn(
-                member,
-                QStringLiteral("is %1, not %2; it is ignored").arg(typeText(it.value()), typeText(expected)));
+            warn(member, tr("is %1, not %2; it is ignored").arg(typeText(it.value()), typeText(expected)));
         checkKeywords(member, it.value().toString());
     }
     return true;
@@ -234,6 +227,6 @@ void KvTemplateCheck::checkKeywords(const QString &place, const QString &text)
         for (const KvReportKeyword &keyword : keywords.keywords())
             isKnown = isKnown || keyword.keyword == found;
         if (!isKnown)
-            warn(place, QStringLiteral("unknown keyword %1; it stays as it is").arg(found));
+            warn(place, tr("unknown keyword %1; it stays as it is").arg(found));
     }
 }

@@ -3,6 +3,7 @@
 
 #include "measuring/ZtFault.h"
 
+#include <QCoreApplication>
 #include <QStringList>
 
 class KvBlockRegistry;
@@ -13,6 +14,8 @@ class QJsonValue;
 /** Looks through a template file before it is loaded, and says where in it what is wrong. */
 class KvTemplateCheck
 {
+    Q_DECLARE_TR_FUNCTIONS(KvTemplateCheck)
+
 public:
     explicit KvTemplateCheck(const KvBlockRegistry &blocks);
 

@@ -11,6 +11,7 @@
 #include "templates/KvBaseEditorNodeFactory.h"
 #include "templates/KvBlockRegistry.h"
 
+#include <QCoreApplication>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
@@ -76,7 +77,8 @@ int check(const KvCliArguments &arguments, const KvCliOutput &output)
     for (const QString &line : check.contents())
         text += line + QLatin1Char('\n');
     for (const QString &warning : check.warnings())
-        text += QStringLiteral("warning: ") + warning + QLatin1Char('\n');
+        text +=
+            QCoreApplication::translate("KvTemplateCommands", "warning: %1").arg(warning) + QLatin1Char('\n');
     const bool isWritten = output.result(text);
     if (!isUsable)
         output.error(check.fault());

@@ -22,7 +22,7 @@ void KvTerminalProgress::pageWritten(int done, int total)
         return;
     m_isShown = true;
     m_sinceShown.start();
-    KvCliOutput::progress(QStringLiteral("page %1 of %2").arg(done).arg(total));
+    KvCliOutput::progress(tr("page %1 of %2").arg(done).arg(total));
 }
 
 void KvTerminalProgress::finish()

@@ -3,6 +3,7 @@
 
 #include "report/KvPrintProgress.h"
 
+#include <QCoreApplication>
 #include <QElapsedTimer>
 
 class KvCliOutput;
@@ -10,6 +11,8 @@ class KvCliOutput;
 /** Shows how far a long print is, on a terminal only and not in the first half second. */
 class KvTerminalProgress : public KvPrintProgress
 {
+    Q_DECLARE_TR_FUNCTIONS(KvTerminalProgress)
+
 public:
     explicit KvTerminalProgress(const KvCliOutput &output);
 

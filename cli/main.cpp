@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
+#include "KvCliLanguage.h"
 #include "KvCliOutput.h"
 #include "KvCliParser.h"
+#include "KvCliTranslation.h"
 #include "KvRenderCommand.h"
 #include "KvStatsCommand.h"
 #include "KvTemplateCommands.h"
@@ -10,6 +12,7 @@
 
 #include <QApplication>
 #include <QHash>
+#include <QProcessEnvironment>
 
 #include <cstdio>
 
@@ -37,7 +40,8 @@ int runCommand(const KvCliArguments &arguments, const KvCliOutput &output)
     }
 }
 
-int runApplication(int argc, char **argv, const KvCliArguments &arguments, const KvCliOutput &output)
+int runApplication(int argc, char **argv, const QString &language, const KvCliArguments &arguments,
+                   const KvCliOutput &output)
 {
     if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
         qputenv("QT_QPA_PLATFORM", "offscreen");
@@ -46,6 +50,7 @@ int runApplication(int argc, char **argv, const KvCliArguments &arguments, const
     qSetGlobalQHashSeed(0);
     QCoreApplication::setAttribute(Qt::AA_Use96Dpi);
     QApplication application(argc, argv);
+    const KvCliTranslation translation(arguments.isForPrograms() ? QStringLiteral("English") : language);
     acss::QtAdvancedStylesheet::substituteFonts();
     ZtAppSettings::getInstance()->setStoragePath(QString());
     ZtAppSettings::setProgramInfo(QStringLiteral("StatReport"), QStringLiteral(STATREPORT_VERSION),
@@ -54,6 +59,36 @@ int runApplication(int argc, char **argv, const KvCliArguments &arguments, const
     // Pieces of tables are deleted later; without an event loop nothing else would do it.
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     return exitCode;
+}
+
+// Help, version or a usage error.
+int answer(const KvCliParseResult &parsed, const KvCliOutput &output)
+{
+    if (parsed.kind == KvCliParseResult::ShowText)
+        return output.result(parsed.text) ? 0 : 1;
+    output.error(KvCliParser::tr("%1 (statreport --help tells more)").arg(parsed.text));
+    return 2;
+}
+
+int runCommandLine(int argc, char **argv, const QStringList &words)
+{
+    const QString language = KvCliLanguage::chosen(words, QProcessEnvironment::systemEnvironment());
+    KvCliParseResult parsed;
+    KvCliOutput output;
+    {
+        // Translated texts take an application; for these, one without fonts will do. Help shows its name.
+        int count = 1;
+        char name[] = "statreport";
+        char *names[] = {name, nullptr};
+        const QCoreApplication application(count, names);
+        const KvCliTranslation translation(language);
+        parsed = KvCliParser::parse(words);
+        output.setJsonErrors(parsed.arguments.jsonErrors);
+        output.setQuiet(parsed.arguments.quiet);
+        if (parsed.kind != KvCliParseResult::Run)
+            return answer(parsed, output);
+    }
+    return runApplication(argc, argv, language, parsed.arguments, output);
 }
 
 } // namespace
@@ -65,16 +100,5 @@ int main(int argc, char **argv)
     QStringList words;
     for (int i = 0; i < argc; ++i)
         words.append(QString::fromLocal8Bit(argv[i]));
-    const KvCliParseResult parsed = KvCliParser::parse(words);
-    KvCliOutput output;
-    output.setJsonErrors(parsed.arguments.jsonErrors);
-    output.setQuiet(parsed.arguments.quiet);
-    if (parsed.kind == KvCliParseResult::ShowText) {
-        return output.result(parsed.text) ? 0 : 1;
-    }
-    if (parsed.kind == KvCliParseResult::UsageError) {
-        output.error(parsed.text + QStringLiteral(" (statreport --help tells more)"));
-        return 2;
-    }
-    return runApplication(argc, argv, parsed.arguments, output);
+    return runCommandLine(argc, argv, words);
 }

@@ -69,6 +69,7 @@ set(STATREPORT_LANGUAGES English German French Spanish Italian Russian Japanese 
     ChineseTraditional Slovakian)
 
 # Compiles a target's translations into its resources: FOLDER/<language>.ts is found as ":/PREFIX/<language>.qm".
+# A program that uses the target's code but not the target links <target>_translations.
 function(statreport_translations name)
   cmake_parse_arguments(ARG "" "PREFIX;FOLDER" "" ${ARGN})
   set(output ${CMAKE_CURRENT_BINARY_DIR}/translations/${ARG_PREFIX})
@@ -80,11 +81,15 @@ function(statreport_translations name)
   endforeach()
   set_source_files_properties(${ts_files} PROPERTIES OUTPUT_LOCATION ${output})
   qt5_add_translation(qm_files ${ts_files} OPTIONS -silent)
-  file(CONFIGURE OUTPUT ${output}/${ARG_PREFIX}.qrc @ONLY
+  file(CONFIGURE OUTPUT ${output}/${ARG_PREFIX}_translations.qrc @ONLY
     CONTENT "<RCC>\n  <qresource prefix=\"/${ARG_PREFIX}\">\n${entries}  </qresource>\n</RCC>\n")
-  # Not left to AUTORCC, which knows nothing of files that the build makes.
-  qt5_add_resources(resources ${output}/${ARG_PREFIX}.qrc)
-  target_sources(${name} PRIVATE ${resources})
+  # Not left to AUTORCC, which knows nothing of files that the build makes. The file names the function that
+  # registers its content, so it must not be named like other resources of the program.
+  qt5_add_resources(resources ${output}/${ARG_PREFIX}_translations.qrc)
+  add_library(${name}_translations OBJECT ${resources})
+  target_link_libraries(${name}_translations PRIVATE Qt5::Core)
+  set_target_properties(${name}_translations PROPERTIES AUTOMOC OFF AUTOUIC OFF AUTORCC OFF)
+  target_link_libraries(${name} PRIVATE ${name}_translations)
 endfunction()
 
 function(statreport_executable name)

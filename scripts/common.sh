@@ -5,7 +5,7 @@ say() { printf '==> %s\n' "$*"; }
 
 # What a fresh Debian 12 lacks to build; each script adds what it needs beside it.
 BUILD_PACKAGES="g++ cmake ninja-build ccache qtbase5-dev libqt5svg5-dev qt5-image-formats-plugins \
-qttools5-dev qttools5-dev-tools libtiff-dev fonts-open-sans fonts-dejavu-core fonts-droid-fallback"
+qttools5-dev qttools5-dev-tools qttranslations5-l10n libtiff-dev fonts-open-sans fonts-dejavu-core fonts-noto-cjk"
 # Videos and cameras of the Measuring Desk; a build without them has no such frame sources.
 CAMERA_PACKAGES="pkg-config qtmultimedia5-dev libqt5multimedia5-plugins gstreamer1.0-plugins-base \
 gstreamer1.0-plugins-good gstreamer1.0-plugins-bad libaravis-dev libusb-1.0-0-dev"

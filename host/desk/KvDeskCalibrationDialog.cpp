@@ -38,8 +38,9 @@ KvDeskCalibrationDialog::KvDeskCalibrationDialog(KvDeskCalibrator *calibrator, Q
     , m_calibrator(calibrator)
 {
     setWindowTitle(tr("Calibration"));
-    setMinimumWidth(smallestWidth);
     auto *const layout = new QVBoxLayout(this);
+    // Not a minimum width of the window, which would hold for longer texts, too.
+    layout->addStrut(smallestWidth - 2 * pageMargin);
     layout->setContentsMargins(pageMargin, pageMargin, pageMargin, pageMargin);
     layout->setSpacing(rowSpacing);
     addObjective(layout);

@@ -17,7 +17,7 @@ namespace {
 constexpr int pageMargin = 24;
 constexpr int groupSpacing = 16;
 constexpr int rowSpacing = 8;
-constexpr int fieldWidth = 320;
+constexpr int fieldWidth = 320; ///< at least
 constexpr int noteLines = 2;
 
 const char groupName[] = "DeskExport";
@@ -57,18 +57,18 @@ void KvDeskExportDialog::createFields()
 {
     m_layout = new QComboBox;
     m_layout->setAccessibleName(tr("Table"));
-    m_layout->setFixedWidth(fieldWidth);
     fillLayouts();
     m_note = new QLabel;
     m_note->setProperty("caption", true);
     m_note->setWordWrap(true);
-    m_note->setFixedWidth(fieldWidth);
     m_note->setMinimumHeight(noteLines * m_note->fontMetrics().lineSpacing());
     m_note->setAlignment(Qt::AlignLeft | Qt::AlignTop);
     m_numbers = new QComboBox;
     m_numbers->setAccessibleName(tr("Numbers"));
-    m_numbers->setFixedWidth(fieldWidth);
     fillNumbers();
+    for (QWidget *const field : {static_cast<QWidget *>(m_layout), static_cast<QWidget *>(m_note),
+                                 static_cast<QWidget *>(m_numbers)})
+        field->setMinimumWidth(fieldWidth);
     m_selectionOnly = new QCheckBox(tr("Only the selected objects (%1)").arg(m_selection.size()));
     m_mark = new QCheckBox(tr("Byte order mark, for spreadsheets that do not expect UTF-8"));
     m_guard = new QCheckBox(tr("Apostrophe before names that spreadsheets take for formulas"));
@@ -94,7 +94,8 @@ void KvDeskExportDialog::fillNumbers()
     //: %1 is the name of a language
     const QString system = hasComma ? tr("1,5, semicolons between the fields (spreadsheets, %1)")
                                     : tr("1.5, commas between the fields (spreadsheets, %1)");
-    m_numbers->addItem(system.arg(locale.nativeLanguageName()), true);
+    const QString language = locale.nativeLanguageName();
+    m_numbers->addItem(system.arg(language.isEmpty() ? locale.name() : language), true);
 }
 
 QFormLayout *KvDeskExportDialog::createForm()

@@ -15,10 +15,10 @@ namespace {
 constexpr int spacing = 8;
 constexpr int sliderWidth = 120;
 constexpr int narrowSliderWidth = 64; ///< where there is little space
-constexpr int fieldWidth = 128;
-constexpr int steps = 1000;          ///< of the slider
-constexpr int decimals = 3;          ///< of milliseconds
-constexpr double resolution = 0.001; ///< milliseconds; a logarithm needs a smallest one
+constexpr int numberWidth = 104;      ///< of the field, without the unit
+constexpr int steps = 1000;           ///< of the slider
+constexpr int decimals = 3;           ///< of milliseconds
+constexpr double resolution = 0.001;  ///< milliseconds; a logarithm needs a smallest one
 
 } // namespace
 
@@ -27,7 +27,7 @@ KvDeskExposureControl::KvDeskExposureControl(QWidget *parent)
     , m_slider(new QSlider(Qt::Horizontal, this))
     , m_field(new QDoubleSpinBox(this))
 {
-    auto *const label = new QLabel(tr("&Exposure"), this);
+    auto *const label = new QLabel(tr("E&xposure"), this);
     label->setBuddy(m_field);
     m_slider->setRange(0, steps);
     m_slider->setPageStep(steps / 20);
@@ -40,7 +40,7 @@ KvDeskExposureControl::KvDeskExposureControl(QWidget *parent)
     m_field->setStepType(QAbstractSpinBox::AdaptiveDecimalStepType);
     // The camera gets what was typed to its end.
     m_field->setKeyboardTracking(false);
-    m_field->setFixedWidth(fieldWidth);
+    m_field->setFixedWidth(numberWidth + m_field->fontMetrics().horizontalAdvance(m_field->suffix()));
     m_field->setToolTip(m_slider->toolTip());
     m_field->setAccessibleName(m_slider->toolTip());
     // Files are dropped on the window.

@@ -4,6 +4,7 @@
 #include "KvDeskEmptyState.h"
 #include "KvDeskPanelHeader.h"
 #include "KvDeskReason.h"
+#include "KvDeskStatus.h"
 #include "KvDeskStatusLogModel.h"
 #include "KvDeskTableView.h"
 #include "common/ZtAppStatus.h"
@@ -12,6 +13,24 @@
 #include <QHeaderView>
 #include <QScrollBar>
 #include <QToolButton>
+
+#include <algorithm>
+
+namespace {
+
+constexpr int smallestCategoryWidth = 112;
+constexpr int categoryMargins = 44; ///< with the icon
+
+/// Enough for the longest name, whatever is in the log.
+int categoryWidth(const QFontMetrics &metrics)
+{
+    int width = 0;
+    for (const int category : {ZtAppStatus::Information, ZtAppStatus::Warning, ZtAppStatus::Error})
+        width = std::max(width, metrics.horizontalAdvance(KvDeskStatus::categoryName(category)));
+    return std::max(smallestCategoryWidth, width + categoryMargins);
+}
+
+} // namespace
 
 KvDeskStatusLog::KvDeskStatusLog(QWidget *parent)
     : KvDeskPanel(tr("Status log"), tr("Hide the status log"), parent)
@@ -32,7 +51,7 @@ void KvDeskStatusLog::createView()
     m_view->setIconSize(QSize(16, 16));
     m_view->horizontalHeader()->hide();
     m_view->horizontalHeader()->setStretchLastSection(true);
-    m_view->setColumnWidth(KvDeskStatusLogModel::CategoryColumn, 112);
+    m_view->setColumnWidth(KvDeskStatusLogModel::CategoryColumn, categoryWidth(m_view->fontMetrics()));
     m_view->setColumnWidth(KvDeskStatusLogModel::TimeColumn, 72);
     m_emptyState =
         new KvDeskEmptyState(tr("Messages of the program and its plug-ins appear here"), m_view->viewport());

@@ -8,6 +8,14 @@
 
 namespace {
 
+/// Qt's own texts on buttons of dialogs, which are English where Qt's translations are not installed.
+[[maybe_unused]] constexpr const char *buttonTexts[] = {
+    QT_TRANSLATE_NOOP("QPlatformTheme", "OK"),      QT_TRANSLATE_NOOP("QPlatformTheme", "Cancel"),
+    QT_TRANSLATE_NOOP("QPlatformTheme", "Apply"),   QT_TRANSLATE_NOOP("QPlatformTheme", "Save"),
+    QT_TRANSLATE_NOOP("QPlatformTheme", "Open"),    QT_TRANSLATE_NOOP("QPlatformTheme", "Close"),
+    QT_TRANSLATE_NOOP("QPlatformTheme", "Discard"), QT_TRANSLATE_NOOP("QPlatformTheme", "&Yes"),
+    QT_TRANSLATE_NOOP("QPlatformTheme", "&No")};
+
 /// Qt takes the direction of the layout from a translated text, anew whenever a translator is installed, be
 /// it one of a plug-in. Its own translations, which hold that text, need not be there.
 class DirectionTranslator : public QTranslator

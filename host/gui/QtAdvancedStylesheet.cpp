@@ -4,8 +4,8 @@
 #include <QApplication>
 #include <QFile>
 #include <QFont>
+#include <QProxyStyle>
 #include <QRegularExpression>
-#include <QStyleFactory>
 
 namespace acss {
 
@@ -152,6 +152,24 @@ QPalette QtAdvancedStylesheet::palette() const
 
 namespace {
 
+/**
+ * Letters of shortcuts are underlined, but not where writing runs from right to left: Qt draws an underlined letter on
+ * its own, which tears apart the joined letters of Arabic. The keys work all the same.
+ */
+class JoinedLettersStyle : public QProxyStyle
+{
+public:
+    using QProxyStyle::QProxyStyle;
+
+    int styleHint(StyleHint hint, const QStyleOption *option, const QWidget *widget,
+                  QStyleHintReturn *returnData) const override
+    {
+        if (hint == SH_UnderlineShortcut && QGuiApplication::layoutDirection() == Qt::RightToLeft)
+            return 0;
+        return QProxyStyle::styleHint(hint, option, widget, returnData);
+    }
+};
+
 /// Setting a style polishes and lays out every widget anew, which a change of the theme does not need.
 void setStyleOnce(QApplication *application)
 {
@@ -160,7 +178,7 @@ void setStyleOnce(QApplication *application)
         return;
     // A style sheet wraps the style, so the style comes first.
     application->setStyleSheet(QString());
-    QApplication::setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
+    QApplication::setStyle(new JoinedLettersStyle(QStringLiteral("Fusion")));
     application->setProperty(property, true);
 }
 

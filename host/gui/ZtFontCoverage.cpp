@@ -27,12 +27,34 @@ bool isDrawn(uint codePoint)
     }
 }
 
+bool isEmoji(uint codePoint)
+{
+    return codePoint >= 0x1F000 && codePoint < 0x1FB00;
+}
+
+QString packageWith(uint codePoint)
+{
+    if (QChar::category(codePoint) == QChar::Other_PrivateUse)
+        return QString();
+    if (isEmoji(codePoint))
+        return QStringLiteral("fonts-symbola");
+    switch (QChar::script(codePoint)) {
+    case QChar::Script_Han:
+    case QChar::Script_Hiragana:
+    case QChar::Script_Katakana:
+    case QChar::Script_Hangul:
+    case QChar::Script_Bopomofo:
+        return QStringLiteral("fonts-noto-cjk");
+    default:
+        return QStringLiteral("fonts-noto-core");
+    }
+}
+
 } // namespace
 
 ZtFontCoverage::ZtFontCoverage(const QFont &font)
     : m_font(font)
-{
-}
+{}
 
 void ZtFontCoverage::addText(const QString &text)
 {
@@ -40,7 +62,8 @@ void ZtFontCoverage::addText(const QString &text)
     if (text == m_lastText)
         return;
     m_lastText = text;
-    const bool isPlain = std::all_of(text.begin(), text.end(), [](QChar c) { return c.unicode() < kFirstChecked; });
+    const bool isPlain =
+        std::all_of(text.begin(), text.end(), [](QChar c) { return c.unicode() < kFirstChecked; });
     if (isPlain)
         return;
     for (const uint codePoint : text.toUcs4()) {
@@ -59,4 +82,16 @@ QString ZtFontCoverage::missingCharacters() const
     }
     std::sort(missing.begin(), missing.end());
     return QString::fromUcs4(missing.constData(), missing.size());
+}
+
+QStringList ZtFontCoverage::packagesWith(const QString &characters)
+{
+    QStringList packages;
+    for (const uint codePoint : characters.toUcs4()) {
+        const QString package = packageWith(codePoint);
+        if (!package.isEmpty() && !packages.contains(package))
+            packages.append(package);
+    }
+    packages.sort();
+    return packages;
 }

@@ -6,6 +6,7 @@
 #include <QFont>
 #include <QSet>
 #include <QString>
+#include <QStringList>
 
 /**
  * Finds the characters that no installed font can draw. Such characters vanish from a page without a word, so
@@ -19,6 +20,9 @@ public:
     void addText(const QString &text); ///< remembers the characters, each once
     /** The characters of all texts that neither the font nor any substitute has, by code point. */
     QString missingCharacters() const;
+    /** The packages of Debian and its kin with fonts for these characters; none for those that no font has.
+     */
+    static QStringList packagesWith(const QString &characters);
 
 private:
     QFont m_font;

@@ -113,6 +113,8 @@ void ZtDrawnObjectPainter::drawLabelBox(const QRectF &box, const QString &text) 
     m_painter->drawRoundedRect(box, labelPadding, labelPadding);
     m_painter->setPen(labelColor);
     const QRectF inside = box.adjusted(labelPadding, labelPadding, -labelPadding, -labelPadding);
+    // The name comes before the value whatever script it is in.
+    m_painter->setLayoutDirection(Qt::LeftToRight);
     m_painter->drawText(inside, Qt::AlignLeft | Qt::TextDontClip, text);
     m_painter->restore();
 }

@@ -99,6 +99,7 @@ void ZtScaleBar::draw(QPainter *painter, const QRectF &page) const
         QRectF(inside.center().x() - length / 2.0, inside.bottom() - barHeight, length, barHeight), barColor);
     painter->setFont(textFont());
     painter->setPen(barColor);
+    painter->setLayoutDirection(Qt::LeftToRight);
     painter->drawText(inside, Qt::AlignHCenter | Qt::AlignTop | Qt::TextDontClip, text);
     painter->restore();
 }

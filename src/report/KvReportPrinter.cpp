@@ -80,6 +80,8 @@ bool KvReportPrinter::render(QPdfWriter &writer)
     QPainter painter;
     if (!painter.begin(&writer))
         return false;
+    // Pages look alike in every language of the interface.
+    painter.setLayoutDirection(Qt::LeftToRight);
     // Pictures would be stored as JPEG otherwise.
     painter.setRenderHint(QPainter::LosslessImageRendering);
     reportProgress(0);

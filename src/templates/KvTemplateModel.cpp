@@ -5,6 +5,7 @@
 #include "report/KvFooterWidget.h"
 #include "report/KvHeaderWidget.h"
 #include "report/KvPageCountWidget.h"
+#include "report/KvReportGlyphs.h"
 #include "report/KvReportNode.h"
 #include "report/KvReportPrinter.h"
 #include "templates/KvBaseEditorNodeCfg.h"
@@ -218,6 +219,7 @@ void KvTemplateModel::emitSectionStates()
 int KvTemplateModel::print(const QString &target, KvPrintProgress *progress)
 {
     emit signalCloseAllEditors();
+    KvReportGlyphs::logMissing(*this);
     KvReportPrinter printer(this);
     printer.setProgress(progress);
     return printer.print(target) ? 1 : 0;

@@ -48,6 +48,11 @@ void KvCliParserTest::refusesWrongUsage_data()
     add("Render", "unknown command \"Render\"; it must be render, stats, check or blocks");
     add("--json-errors", "a command is missing: render, stats, check or blocks");
     add("--json-errors -q print", "unknown command \"print\"; it must be render, stats, check or blocks");
+    add("check a.rtp --language Klingon", "--language must be one of English, German, French, Spanish, "
+                                          "Italian, Russian, Japanese, Korean, Arabic, "
+                                          "ChineseSimple, ChineseTraditional, Slovakian, not \"Klingon\"");
+    add("--language de", "a command is missing: render, stats, check or blocks");
+    add("--language", "a command is missing: render, stats, check or blocks");
     add("render", "the template is missing");
     add("render --table t.csv -o o.pdf", "the template is missing");
     add("render a.rtp", "the file to write is missing: -o OUT.pdf");
@@ -121,10 +126,10 @@ void KvCliParserTest::showsTheOverview()
     const KvCliParseResult result = parse(line);
     QCOMPARE(result.kind, KvCliParseResult::ShowText);
     QVERIFY(result.text.startsWith(QLatin1String("Usage: statreport COMMAND [options]\n")));
-    for (const char *part :
-         {"render TEMPLATE.rtp (--session S | --table T) [--image I] -o OUT.pdf\n",
-          "stats (--session S | --table T) [--group-by object|measurement]\n", "check TEMPLATE.rtp ",
-          "blocks [--format text|json]\n", "--json-errors ", "0 done, 1 the work failed,\n2 wrong usage.\n"})
+    for (const char *part : {"render TEMPLATE.rtp (--session S | --table T) [--image I] -o OUT.pdf\n",
+                             "stats (--session S | --table T) [--group-by object|measurement]\n",
+                             "check TEMPLATE.rtp ", "blocks [--format text|json]\n", "--json-errors ",
+                             "--language NAME ", "0 done, 1 the work failed, 2 wrong usage.\n"})
         QVERIFY2(result.text.contains(QLatin1String(part)), part);
 }
 
@@ -161,6 +166,9 @@ void KvCliParserTest::showsTheHelpOfACommand()
     QVERIFY2(firstLine.endsWith(QLatin1Char(' ') + usage), qPrintable(firstLine));
     options << QStringLiteral("-h, --help") << QStringLiteral("-v, --version")
             << QStringLiteral("--json-errors") << QStringLiteral("-q, --quiet");
+    // Between the usage and the options there is what the command does.
+    const QString description = result.text.section(QLatin1Char('\n'), 1, 1);
+    QVERIFY2(description.endsWith(QLatin1Char('.')), qPrintable(description));
     for (const QString &option : qAsConst(options))
         QVERIFY2(result.text.contains(option), qPrintable(option));
 }
@@ -252,6 +260,9 @@ void KvCliParserTest::readsBlocks_data()
     QTest::addColumn<QString>("line");
     QTest::addColumn<int>("format");
     QTest::newRow("default") << QStringLiteral("blocks") << int(KvCliArguments::Text);
+    QTest::newRow("behind a language") << QStringLiteral("--language de blocks") << int(KvCliArguments::Text);
+    QTest::newRow("behind a language, too")
+        << QStringLiteral("--language=German -q blocks") << int(KvCliArguments::Text);
     QTest::newRow("text") << QStringLiteral("blocks --format text") << int(KvCliArguments::Text);
     QTest::newRow("json") << QStringLiteral("blocks --format json") << int(KvCliArguments::Json);
 }

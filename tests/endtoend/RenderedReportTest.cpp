@@ -71,6 +71,7 @@ private slots:
     void keepsPictures();
     void elidesLongCells();
     void drawsAllScripts();
+    void printsEveryLanguage();
     void printsShortTables_data();
     void printsShortTables();
     void printsLongTablesSoon();
@@ -313,6 +314,40 @@ void RenderedReportTest::drawsAllScripts()
                                  letters(text("\xD8\xB3\xD9\x84\xD8\xA7\xD9\x85")),
                                  letters(text("\xE6\xBC\xA2\xE5\xAD\x97")),
                                  letters(text("\xCE\xA9\xCE\xBC\xCE\xAD\xCE\xB3\xCE\xB1"))}));
+}
+
+/// One text block with a sentence in each language of the interface; no character is lost.
+void RenderedReportTest::printsEveryLanguage()
+{
+    const QStringList sentences{
+        text("The quick brown fox jumps over the lazy dog"),
+        text("Zw\u00F6lf Boxk\u00E4mpfer jagen Viktor quer \u00FCber den gro\u00DFen Sylter Deich"),
+        text("D\u00E8s No\u00EBl, o\u00F9 un z\u00E9phyr ha\u00EF me v\u00EAt de gla\u00E7ons w\u00FCrmiens"),
+        text("El ping\u00FCino hizo kil\u00F3metros bajo exhaustiva lluvia y fr\u00EDo, a\u00F1oraba"),
+        text("Quel fez sghembo copre davanti, perch\u00E9 cos\u00EC \u00E8 pi\u00F9"),
+        text("\u0421\u044A\u0435\u0448\u044C \u0435\u0449\u0451 \u043C\u044F\u0433\u043A\u0438\u0445 "
+             "\u0431\u0443\u043B\u043E\u043A \u0436\u044E"),
+        text("K\u0155de\u013E \u010Fat\u013Eov u\u010D\u00ED ko\u0148a \u017Era\u0165 k\u00F4ru"),
+        text("\u0642\u064A\u0627\u0633 \u0627\u0644\u0637\u0648\u0644 "
+             "\u0648\u0627\u0644\u0645\u0633\u0627\u062D\u0629"),
+        text("\u3044\u308D\u306F\u306B\u307B\u3078\u3068 \u6E2C\u5B9A\u5024\u3068\u30AB\u30E1\u30E9"),
+        text("\uB2E4\uB78C\uC950 \uD5CC \uCCB3\uBC14\uD034\uC5D0 \uCE21\uC815\uAC12"),
+        text("\u6D4B\u91CF\u56FE\u50CF\u5BF9\u8C61\u5E76\u663E\u793A"),
+        text("\u91CF\u6E2C\u5F71\u50CF\u7269\u4EF6\u4E26\u986F\u793A")};
+    const QString html = QStringLiteral("<p>%1</p>").arg(sentences.join(QLatin1String("</p><p>")));
+    QCOMPARE(render(TemplateFile::bytes({TemplateFile::textBlock(html)}), "name,length_mm\na,1\n"),
+             QString());
+    const PdfFile pdf(outPath());
+    QVERIFY(pdf.isSound());
+    for (const PdfFont &font : pdf.fonts())
+        QVERIFY2(font.isEmbedded, qPrintable(font.name));
+    const QString all = pdf.pageTexts().join(QString()).normalized(QString::NormalizationForm_KC);
+    QString lost;
+    for (const QChar letter : sentences.join(QString()).normalized(QString::NormalizationForm_KC)) {
+        if (!all.contains(letter) && !lost.contains(letter))
+            lost.append(letter);
+    }
+    QCOMPARE(lost, QString());
 }
 
 void RenderedReportTest::printsShortTables_data()

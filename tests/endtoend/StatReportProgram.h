@@ -14,7 +14,7 @@ struct ProgramResult
     QString errors;
 };
 
-/** Runs programs as on a machine without a display. */
+/** Runs programs as on a machine without a display, in English unless told otherwise. */
 class StatReportProgram
 {
 public:
@@ -22,6 +22,14 @@ public:
                              const QString &folder = QString())
     {
         return runProgram(QStringLiteral(STATREPORT_PROGRAM), arguments, input, folder);
+    }
+
+    /** With more variables in the environment, "NAME=value" each. */
+    static ProgramResult runWith(const QStringList &variables, const QStringList &arguments,
+                                 const QString &folder)
+    {
+        return runProgram(QStringLiteral(STATREPORT_PROGRAM), arguments, QByteArray(), folder, QString(),
+                          variables);
     }
 
     /** With the standard output going into a file or device. */
@@ -32,12 +40,19 @@ public:
 
     static ProgramResult runProgram(const QString &program, const QStringList &arguments,
                                     const QByteArray &input = QByteArray(), const QString &folder = QString(),
-                                    const QString &outputFile = QString())
+                                    const QString &outputFile = QString(),
+                                    const QStringList &variables = QStringList())
     {
         QProcess process;
         QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
         for (const char *name : {"DISPLAY", "WAYLAND_DISPLAY", "QT_QPA_PLATFORM", "XDG_RUNTIME_DIR"})
             environment.remove(QLatin1String(name));
+        environment.remove(QStringLiteral("LANGUAGE"));
+        environment.insert(QStringLiteral("LC_ALL"), QStringLiteral("C.UTF-8"));
+        for (const QString &variable : variables) {
+            const int end = variable.indexOf(QLatin1Char('='));
+            environment.insert(variable.left(end), variable.mid(end + 1));
+        }
         process.setProcessEnvironment(environment);
         if (!folder.isEmpty())
             process.setWorkingDirectory(folder);

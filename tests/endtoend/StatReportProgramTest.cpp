@@ -35,6 +35,9 @@ private slots:
     void writesErrorsAsJson();
     void leavesTheOutputAlone_data();
     void leavesTheOutputAlone();
+    void speaksTheLanguage_data();
+    void speaksTheLanguage();
+    void programsReadEnglish();
     void showsHelp_data();
     void showsHelp();
     void tellsWhenTheOutputIsFull_data();
@@ -249,6 +252,55 @@ void StatReportProgramTest::leavesTheOutputAlone()
     }
 }
 
+void StatReportProgramTest::speaksTheLanguage_data()
+{
+    QTest::addColumn<QString>("line");
+    QTest::addColumn<QString>("errors");
+    const auto row = [](const char *variables, const char *line, const char *errors) {
+        QTest::newRow(variables) << text(line) << text(errors);
+    };
+    row("LC_ALL=de_DE.UTF-8", "check", "statreport: die Vorlage fehlt (mehr sagt statreport --help)\n");
+    row("LC_ALL=|LANG=fr_FR.UTF-8", "check none.rtp --language es",
+        "statreport: none.rtp: no se puede abrir: No such file or directory\n");
+    row("LC_ALL=it_IT.UTF-8|LANGUAGE=de:fr", "stats --frob",
+        "statreport: Unbekannte Option \u201Efrob\u201C. (mehr sagt statreport --help)\n");
+    // A fault that the measuring library found.
+    row("LANG=C", "stats --table none.csv --language de",
+        "statreport: none.csv: Die Datei ist nicht vorhanden\n");
+    row("LC_ALL=tlh", "check", "statreport: the template is missing (statreport --help tells more)\n");
+}
+
+void StatReportProgramTest::speaksTheLanguage()
+{
+    QFETCH(QString, line);
+    QFETCH(QString, errors);
+    const QStringList variables = QString::fromLatin1(QTest::currentDataTag()).split(QLatin1Char('|'));
+    const ProgramResult result =
+        StatReportProgram::runWith(variables, line.split(QLatin1Char(' ')), m_folder->path());
+    QCOMPARE(result.errors, errors);
+    QVERIFY(result.exitCode > 0);
+}
+
+/// What programs read is the same in every language, what people read is not.
+void StatReportProgramTest::programsReadEnglish()
+{
+    for (const char *line : {"stats --table good.csv --format csv", "stats --table good.csv --format json",
+                             "blocks --format text", "blocks --format json"}) {
+        const ProgramResult english = run(line);
+        const ProgramResult german =
+            StatReportProgram::runWith({text("LC_ALL=de_DE.UTF-8")}, words(line), m_folder->path());
+        QCOMPARE(german.exitCode, 0);
+        QCOMPARE(german.output, english.output);
+    }
+    const ProgramResult german = StatReportProgram::runWith(
+        {text("LC_ALL=de_DE.UTF-8")}, words("stats --table good.csv"), m_folder->path());
+    QVERIFY2(german.output.startsWith("Objekttyp"), german.output.constData());
+    const ProgramResult fault = StatReportProgram::runWith(
+        {text("LC_ALL=de_DE.UTF-8")}, words("stats --table none.csv --json-errors"), m_folder->path());
+    QVERIFY2(fault.errors.startsWith(QLatin1String("{\"error\":{\"file\":\"none.csv\",\"message\":")),
+             qPrintable(fault.errors));
+}
+
 void StatReportProgramTest::showsHelp_data()
 {
     QTest::addColumn<QByteArray>("start");
@@ -423,8 +475,8 @@ void StatReportProgramTest::notesMissingGlyphs()
     const ProgramResult result = run("render good.rtp --table private.csv -o out.pdf");
     QCOMPARE(result.exitCode, 0);
     QVERIFY2(result.errors.startsWith(
-                 QLatin1String("statreport: note: no installed font has these characters, they "
-                               "are left out: ")),
+                 QLatin1String("statreport: note: No installed font has these characters, the report leaves "
+                               "them out: ")),
              qPrintable(result.errors));
     QCOMPARE(result.errors.count(QLatin1Char('\n')), 1);
 }

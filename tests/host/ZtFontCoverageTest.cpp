@@ -9,6 +9,8 @@ private slots:
     void findsMissing_data();
     void findsMissing();
     void sortsAndMentionsEachOnce();
+    void namesPackages_data();
+    void namesPackages();
 };
 
 void ZtFontCoverageTest::findsMissing_data()
@@ -41,6 +43,28 @@ void ZtFontCoverageTest::sortsAndMentionsEachOnce()
          {QStringLiteral("\uF8F1x"), QStringLiteral("\uF8F1x"), QStringLiteral("\uF8F0\uF8F1")})
         coverage.addText(text);
     QCOMPARE(coverage.missingCharacters(), QStringLiteral("\uF8F0\uF8F1"));
+}
+
+void ZtFontCoverageTest::namesPackages_data()
+{
+    QTest::addColumn<QString>("characters");
+    QTest::addColumn<QStringList>("packages");
+    const QString cjk = QStringLiteral("fonts-noto-cjk");
+    const QString core = QStringLiteral("fonts-noto-core");
+    QTest::newRow("none") << QString() << QStringList();
+    QTest::newRow("private use") << QStringLiteral("\uF8F0") << QStringList();
+    QTest::newRow("Chinese") << QStringLiteral("\u957F\u5EA6") << QStringList(cjk);
+    QTest::newRow("Japanese and Korean") << QStringLiteral("\u3042\u30AB\uAC00") << QStringList(cjk);
+    QTest::newRow("Arabic") << QStringLiteral("\u0642") << QStringList(core);
+    QTest::newRow("emoji") << QString::fromUtf8("\xF0\x9F\x98\x80")
+                           << QStringList(QStringLiteral("fonts-symbola"));
+    QTest::newRow("several") << QStringLiteral("\u957F\u0E01\uF8F0") << QStringList({cjk, core});
+}
+
+void ZtFontCoverageTest::namesPackages()
+{
+    QFETCH(QString, characters);
+    QTEST(ZtFontCoverage::packagesWith(characters), "packages");
 }
 
 STATREPORT_TEST_MAIN(ZtFontCoverageTest)

@@ -27,7 +27,8 @@ const QStringList languages{QStringLiteral("English"),
 /// Folder of the sources and folder of their translations.
 const QVector<QPair<QString, QString>> products{
     {QStringLiteral("src"), QStringLiteral("src/resources/translations")},
-    {QStringLiteral("host"), QStringLiteral("host/desk/translations")}};
+    {QStringLiteral("host"), QStringLiteral("host/desk/translations")},
+    {QStringLiteral("cli"), QStringLiteral("cli/translations")}};
 
 struct Message
 {
@@ -35,14 +36,14 @@ struct Message
     QString source;
     QStringList translations; ///< several for plurals
     bool isPlural = false;
-    bool isFinished = true;
+    bool isFinished = true; ///< false for texts without a translation, and for those that are gone
 
     QString key() const { return context + QStringLiteral(": ") + source; }
 };
 
 void readTranslation(QXmlStreamReader &xml, Message *message)
 {
-    message->isFinished = xml.attributes().value(QLatin1String("type")) != QLatin1String("unfinished");
+    message->isFinished = !xml.attributes().hasAttribute(QLatin1String("type"));
     if (!message->isPlural) {
         message->translations.append(xml.readElementText());
         return;
@@ -120,14 +121,51 @@ QStringList placeholders(const QString &text)
     return result;
 }
 
-/// Messages with a translation that lost a placeholder or has one too many.
-QStringList placeholderFaults(const QVector<Message> &messages)
+/// A language may say "none", "one" or "two" in words; the last form of a plural is for all larger numbers.
+bool hasThePlaceholders(const Message &message, int form)
+{
+    QStringList wanted = placeholders(message.source);
+    QStringList found = placeholders(message.translations.at(form));
+    if (message.isPlural && form + 1 < message.translations.size()) {
+        wanted.removeAll(QStringLiteral("n"));
+        found.removeAll(QStringLiteral("n"));
+    }
+    return found == wanted;
+}
+
+/// Letters that a key with Alt stands for.
+int shortcutCount(const QString &text)
+{
+    static const QRegularExpression pattern(QStringLiteral("&(?=\\w)(?!\\w+;)"),
+                                            QRegularExpression::UseUnicodePropertiesOption);
+    return QString(text).remove(QLatin1String("&&")).count(pattern);
+}
+
+bool hasTheShortcuts(const Message &message, int form)
+{
+    const int count = shortcutCount(message.translations.at(form));
+    return count == qMin(1, shortcutCount(message.source));
+}
+
+/// What follows a command that asks for more, and the lines of the text.
+bool hasTheShape(const Message &message, int form)
+{
+    const auto asksForMore = [](const QString &text) {
+        return text.endsWith(QLatin1String("...")) || text.contains(QLatin1String("...(&"));
+    };
+    const QString translation = message.translations.at(form);
+    return asksForMore(translation) == asksForMore(message.source) &&
+           translation.count(QLatin1Char('\n')) == message.source.count(QLatin1Char('\n'));
+}
+
+/// Messages with a form of their translation that does not pass the check.
+QStringList faultsOf(const QVector<Message> &messages, bool (*isGood)(const Message &message, int form))
 {
     QStringList faults;
     for (const Message &message : messages) {
-        for (const QString &translation : message.translations) {
-            if (!translation.isEmpty() && placeholders(translation) != placeholders(message.source))
-                faults.append(message.key());
+        for (int form = 0; form < message.translations.size(); ++form) {
+            if (!message.translations.at(form).isEmpty() && !isGood(message, form))
+                faults.append(message.key() + QStringLiteral(" -> ") + message.translations.at(form));
         }
     }
     return faults;
@@ -168,6 +206,12 @@ private slots:
 
     void seesLostPlaceholders_data();
     void seesLostPlaceholders();
+    void seesLostCounts_data();
+    void seesLostCounts();
+    void seesOtherShortcuts_data();
+    void seesOtherShortcuts();
+    void seesOtherShapes_data();
+    void seesOtherShapes();
     void seesUnmarkedTexts_data();
     void seesUnmarkedTexts();
 
@@ -177,9 +221,14 @@ private slots:
     void thePluginTranslatesToEnglish();
     void everyLanguageHasTheSameTexts_data();
     void everyLanguageHasTheSameTexts();
-    void englishIsComplete();
+    void everyLanguageIsComplete_data();
+    void everyLanguageIsComplete();
     void placeholdersAreKept_data();
     void placeholdersAreKept();
+    void shortcutsAreKept_data();
+    void shortcutsAreKept();
+    void dotsAndLinesAreKept_data();
+    void dotsAndLinesAreKept();
     void theTextsOfTheCodeAreThere_data();
     void theTextsOfTheCodeAreThere();
     void contextsAreTheAgreedOnes_data();
@@ -209,8 +258,6 @@ void TranslationsTest::seesLostPlaceholders_data()
     QTest::newRow("not translated") << QStringLiteral("%1 of %2") << QString() << false;
     QTest::newRow("lost") << QStringLiteral("%1 of %2") << QStringLiteral("%1 von 2") << true;
     QTest::newRow("added") << QStringLiteral("Open") << QStringLiteral("Open %1") << true;
-    QTest::newRow("a count") << QStringLiteral("%n page(s)") << QStringLiteral("%n pages") << false;
-    QTest::newRow("a lost count") << QStringLiteral("%n page(s)") << QStringLiteral("pages") << true;
     QTest::newRow("per cent") << QStringLiteral("100 %") << QStringLiteral("100%") << false;
 }
 
@@ -222,7 +269,83 @@ void TranslationsTest::seesLostPlaceholders()
     Message message;
     message.source = source;
     message.translations = QStringList(translation);
-    QCOMPARE(placeholderFaults({message}).size(), isFault ? 1 : 0);
+    QCOMPARE(faultsOf({message}, hasThePlaceholders).size(), isFault ? 1 : 0);
+}
+
+void TranslationsTest::seesLostCounts_data()
+{
+    QTest::addColumn<QStringList>("forms");
+    QTest::addColumn<int>("faults");
+    const auto row = [](const char *name, const QStringList &forms, int faults) {
+        QTest::newRow(name) << forms << faults;
+    };
+    const QString counted = QStringLiteral("%n pages of %1");
+    row("all forms", {counted, counted}, 0);
+    row("one in words", {QStringLiteral("one page of %1"), counted}, 0);
+    row("many in words", {counted, QStringLiteral("pages of %1")}, 1);
+    row("a single form in words", {QStringLiteral("pages of %1")}, 1);
+    row("another placeholder lost", {QStringLiteral("one page"), counted}, 1);
+}
+
+void TranslationsTest::seesLostCounts()
+{
+    QFETCH(QStringList, forms);
+    Message message;
+    message.source = QStringLiteral("%n page(s) of %1");
+    message.isPlural = true;
+    message.translations = forms;
+    QTEST(faultsOf({message}, hasThePlaceholders).size(), "faults");
+}
+
+void TranslationsTest::seesOtherShortcuts_data()
+{
+    QTest::addColumn<QString>("source");
+    QTest::addColumn<QString>("translation");
+    QTest::addColumn<bool>("isFault");
+    QTest::newRow("kept") << QStringLiteral("&Open") << QStringLiteral("\u041E&\u0442") << false;
+    QTest::newRow("behind the text") << QStringLiteral("&Open") << QStringLiteral("\u958B(&O)") << false;
+    QTest::newRow("lost") << QStringLiteral("&Open") << QStringLiteral("Offen") << true;
+    QTest::newRow("added") << QStringLiteral("Open") << QStringLiteral("&Offen") << true;
+    QTest::newRow("two") << QStringLiteral("&Open") << QStringLiteral("&Of&fen") << true;
+    QTest::newRow("no letter") << QStringLiteral("A & B") << QStringLiteral("A und B") << false;
+    QTest::newRow("an ampersand") << QStringLiteral("A && B") << QStringLiteral("A &&B") << false;
+    QTest::newRow("markup") << QStringLiteral("&lt;a") << QStringLiteral("a") << false;
+}
+
+void TranslationsTest::seesOtherShortcuts()
+{
+    QFETCH(QString, source);
+    QFETCH(QString, translation);
+    QFETCH(bool, isFault);
+    Message message;
+    message.source = source;
+    message.translations = QStringList(translation);
+    QCOMPARE(faultsOf({message}, hasTheShortcuts).size(), isFault ? 1 : 0);
+}
+
+void TranslationsTest::seesOtherShapes_data()
+{
+    QTest::addColumn<QString>("source");
+    QTest::addColumn<QString>("translation");
+    QTest::addColumn<bool>("isFault");
+    QTest::newRow("kept") << QStringLiteral("Open...") << QStringLiteral("Offen...") << false;
+    QTest::newRow("before a letter") << QStringLiteral("&Open...") << QStringLiteral("Offen...(&O)") << false;
+    QTest::newRow("lost dots") << QStringLiteral("Open...") << QStringLiteral("Offen") << true;
+    QTest::newRow("added dots") << QStringLiteral("Open") << QStringLiteral("Offen...") << true;
+    QTest::newRow("another ellipsis") << QStringLiteral("Open...") << QStringLiteral("Offen\u2026") << true;
+    QTest::newRow("lines") << QStringLiteral("a\nb") << QStringLiteral("c\nd") << false;
+    QTest::newRow("a lost line") << QStringLiteral("a\nb") << QStringLiteral("c d") << true;
+}
+
+void TranslationsTest::seesOtherShapes()
+{
+    QFETCH(QString, source);
+    QFETCH(QString, translation);
+    QFETCH(bool, isFault);
+    Message message;
+    message.source = source;
+    message.translations = QStringList(translation);
+    QCOMPARE(faultsOf({message}, hasTheShape).size(), isFault ? 1 : 0);
 }
 
 void TranslationsTest::seesUnmarkedTexts_data()
@@ -320,15 +443,29 @@ void TranslationsTest::everyLanguageHasTheSameTexts()
     QCOMPARE(QStringList(own).removeDuplicates(), 0);
 }
 
-void TranslationsTest::englishIsComplete()
+void TranslationsTest::everyLanguageIsComplete_data()
 {
+    addFiles();
+}
+
+/// Nothing is left to translate, and nothing is left over.
+void TranslationsTest::everyLanguageIsComplete()
+{
+    static const QHash<QString, int> pluralForms{{QStringLiteral("Russian"), 3},
+                                                 {QStringLiteral("Slovakian"), 3},
+                                                 {QStringLiteral("Arabic"), 6},
+                                                 {QStringLiteral("Japanese"), 1},
+                                                 {QStringLiteral("Korean"), 1},
+                                                 {QStringLiteral("ChineseSimple"), 1},
+                                                 {QStringLiteral("ChineseTraditional"), 1}};
+    QFETCH(QString, folder);
+    QFETCH(QString, language);
     QStringList faults;
-    for (const auto &product : products) {
-        for (const Message &message : readMessages(path(product.second, QStringLiteral("English")))) {
-            const bool isEmpty = message.translations.isEmpty() || message.translations.contains(QString());
-            if (!message.isFinished || isEmpty || (message.isPlural && message.translations.size() != 2))
-                faults.append(message.key());
-        }
+    for (const Message &message : readMessages(path(folder, language))) {
+        const int forms = message.isPlural ? pluralForms.value(language, 2) : 1;
+        const bool isEmpty = message.translations.contains(QString());
+        if (!message.isFinished || isEmpty || message.translations.size() != forms)
+            faults.append(message.key());
     }
     QVERIFY2(faults.isEmpty(), lines(faults));
 }
@@ -342,7 +479,33 @@ void TranslationsTest::placeholdersAreKept()
 {
     QFETCH(QString, folder);
     QFETCH(QString, language);
-    const QStringList faults = placeholderFaults(readMessages(path(folder, language)));
+    const QStringList faults = faultsOf(readMessages(path(folder, language)), hasThePlaceholders);
+    QVERIFY2(faults.isEmpty(), lines(faults));
+}
+
+void TranslationsTest::shortcutsAreKept_data()
+{
+    addFiles();
+}
+
+void TranslationsTest::shortcutsAreKept()
+{
+    QFETCH(QString, folder);
+    QFETCH(QString, language);
+    const QStringList faults = faultsOf(readMessages(path(folder, language)), hasTheShortcuts);
+    QVERIFY2(faults.isEmpty(), lines(faults));
+}
+
+void TranslationsTest::dotsAndLinesAreKept_data()
+{
+    addFiles();
+}
+
+void TranslationsTest::dotsAndLinesAreKept()
+{
+    QFETCH(QString, folder);
+    QFETCH(QString, language);
+    const QStringList faults = faultsOf(readMessages(path(folder, language)), hasTheShape);
     QVERIFY2(faults.isEmpty(), lines(faults));
 }
 

@@ -100,7 +100,7 @@
         <translation>إظهار القيم المقيسة أو إخفاؤها</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>&amp;سجل الحالة</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>التبديل بين السمة الداكنة والفاتحة</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>الإ&amp;عدادات...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>رسم شريط مقياس</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>المعا&amp;يرة...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>حفظ الصورة في المعرض</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>لقطات مع ال&amp;قياسات</translation>
     </message>
     <message>
@@ -353,8 +353,8 @@
         <translation>إظهار تسميات الكائنات أو إخفاؤها</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
-        <translation>مساطر ال&amp;بكسل</translation>
+        <source>&amp;Rulers</source>
+        <translation>المسا&amp;طر</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
@@ -782,7 +782,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>التع&amp;ريض</translation>
     </message>
     <message>
@@ -1902,6 +1902,45 @@ Reported by %2</source>
     <message>
         <source>Reset to the default values</source>
         <translation>إعادة التعيين إلى القيم الافتراضية</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>موافق</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>إلغاء</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>تطبيق</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>حفظ</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>فتح</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>إغلاق</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>تجاهل</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>&amp;نعم</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>&amp;لا</translation>
     </message>
 </context>
 <context>

@@ -100,7 +100,7 @@
         <translation>显示或隐藏测量值</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>状态日志(&amp;T)</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>在深色和浅色主题之间切换</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>设置(&amp;P)...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>绘制比例尺</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>校准(&amp;I)...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>将图像保存到图库</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>快照包含测量对象(&amp;W)</translation>
     </message>
     <message>
@@ -353,8 +353,8 @@
         <translation>显示或隐藏对象标签</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
-        <translation>像素标尺(&amp;R)</translation>
+        <source>&amp;Rulers</source>
+        <translation>标尺(&amp;R)</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
@@ -782,7 +782,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>曝光(&amp;X)</translation>
     </message>
     <message>
@@ -1887,6 +1887,45 @@ Reported by %2</source>
     <message>
         <source>Reset to the default values</source>
         <translation>重置为默认值</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>确定</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>应用</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>保存</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>打开</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>关闭</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>放弃</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>是(&amp;Y)</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>否(&amp;N)</translation>
     </message>
 </context>
 <context>

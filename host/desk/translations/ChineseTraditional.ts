@@ -100,7 +100,7 @@
         <translation>顯示或隱藏量測值</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>狀態記錄(&amp;T)</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>在深色與淺色主題之間切換</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>設定(&amp;P)...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>繪製比例尺</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>校正(&amp;I)...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>將影像儲存到圖庫</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>快照包含量測物件(&amp;W)</translation>
     </message>
     <message>
@@ -353,8 +353,8 @@
         <translation>顯示或隱藏物件的標籤</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
-        <translation>像素尺規(&amp;R)</translation>
+        <source>&amp;Rulers</source>
+        <translation>尺規(&amp;R)</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
@@ -782,7 +782,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>曝光(&amp;X)</translation>
     </message>
     <message>
@@ -1887,6 +1887,45 @@ Reported by %2</source>
     <message>
         <source>Reset to the default values</source>
         <translation>重設為預設值</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>確定</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>套用</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>儲存</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>開啟</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>關閉</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>捨棄</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>是(&amp;Y)</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>否(&amp;N)</translation>
     </message>
 </context>
 <context>

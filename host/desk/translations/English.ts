@@ -100,8 +100,8 @@
         <translation>Show or hide the measured values</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
-        <translation>Status &amp;log</translation>
+        <source>Stat&amp;us log</source>
+        <translation>Stat&amp;us log</translation>
     </message>
     <message>
         <source>Show or hide the status log</source>
@@ -116,8 +116,8 @@
         <translation>Change between the dark and the light theme</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
-        <translation>S&amp;ettings...</translation>
+        <source>Settin&amp;gs...</source>
+        <translation>Settin&amp;gs...</translation>
     </message>
     <message>
         <source>Settings</source>
@@ -305,8 +305,8 @@
         <translation>Draw a scale bar</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
-        <translation>Cali&amp;bration...</translation>
+        <source>Cal&amp;ibration...</source>
+        <translation>Cal&amp;ibration...</translation>
     </message>
     <message>
         <source>Say how large a pixel of the image is</source>
@@ -329,8 +329,8 @@
         <translation>Save the image to the gallery</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
-        <translation>Snapshots with &amp;measurements</translation>
+        <source>Snapshots &amp;with measurements</source>
+        <translation>Snapshots &amp;with measurements</translation>
     </message>
     <message>
         <source>Draw the measured objects on snapshots</source>
@@ -353,8 +353,8 @@
         <translation>Show or hide the labels of objects</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
-        <translation>Pixel &amp;rulers</translation>
+        <source>&amp;Rulers</source>
+        <translation>&amp;Rulers</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
@@ -782,8 +782,8 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
-        <translation>&amp;Exposure</translation>
+        <source>E&amp;xposure</source>
+        <translation>E&amp;xposure</translation>
     </message>
     <message>
         <source>Exposure time of the camera</source>
@@ -1890,6 +1890,45 @@ Reported by %2</translation>
     <message>
         <source>Reset to the default values</source>
         <translation>Reset to the default values</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancel</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Apply</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Save</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Open</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Close</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>Discard</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>&amp;Yes</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>&amp;No</translation>
     </message>
 </context>
 <context>

@@ -89,7 +89,7 @@
     </message>
     <message>
         <source>Show the image at 100 %</source>
-        <translation>Afficher l’image à 100 %</translation>
+        <translation>Afficher l’image à 100&#xa0;%</translation>
     </message>
     <message>
         <source>&amp;Measured values</source>
@@ -100,7 +100,7 @@
         <translation>Afficher ou masquer les valeurs mesurées</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>&amp;Journal d’état</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>Passer du thème sombre au thème clair et inversement</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>&amp;Paramètres...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>Tracer une barre d’échelle</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>Étal&amp;onnage...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>Enregistrer l’image dans la galerie</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>Instantanés avec &amp;mesures</translation>
     </message>
     <message>
@@ -353,8 +353,8 @@
         <translation>Afficher ou masquer les étiquettes des objets</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
-        <translation>Règ&amp;les en pixels</translation>
+        <source>&amp;Rulers</source>
+        <translation>Règ&amp;les</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
@@ -381,11 +381,11 @@
     <name>KvDeskAutosave</name>
     <message>
         <source>the folder &quot;%1&quot; cannot be written</source>
-        <translation>impossible d’écrire dans le dossier « %1 »</translation>
+        <translation>impossible d’écrire dans le dossier «&#xa0;%1&#xa0;»</translation>
     </message>
     <message>
         <source>Unsaved changes are not being copied: %1</source>
-        <translation>Les modifications non enregistrées ne sont pas sauvegardées : %1</translation>
+        <translation>Les modifications non enregistrées ne sont pas sauvegardées&#xa0;: %1</translation>
     </message>
 </context>
 <context>
@@ -415,7 +415,7 @@
     </message>
     <message>
         <source>Such as 10x</source>
-        <translation>P. ex. 10x</translation>
+        <translation>P.&#xa0;ex. 10x</translation>
     </message>
     <message>
         <source>In use</source>
@@ -471,7 +471,7 @@
     </message>
     <message>
         <source>New pixel size: %1</source>
-        <translation>Nouvelle taille de pixel : %1</translation>
+        <translation>Nouvelle taille de pixel&#xa0;: %1</translation>
     </message>
     <message>
         <source>No pixel size yet</source>
@@ -550,18 +550,18 @@
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
-        <translation>%1 indique une taille de pixel de %2 ; la session mesure avec %3</translation>
+        <translation>%1 indique une taille de pixel de %2&#xa0;; la session mesure avec %3</translation>
     </message>
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
-        <translation>%1 indique une taille de pixel de %2 ; la session mesure en pixels</translation>
+        <translation>%1 indique une taille de pixel de %2&#xa0;; la session mesure en pixels</translation>
     </message>
 </context>
 <context>
     <name>KvDeskCommandLine</name>
     <message>
         <source>There is no theme &quot;%1&quot;: use %2</source>
-        <translation>Il n’existe pas de thème « %1 » : utilisez %2</translation>
+        <translation>Il n’existe pas de thème «&#xa0;%1&#xa0;»&#xa0;: utilisez %2</translation>
     </message>
     <message>
         <source> or </source>
@@ -581,18 +581,18 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>Utilisation : measuringdesk [OPTION...] [SESSION|IMAGE|TABLEAU...]
+        <translation>Utilisation&#xa0;: measuringdesk [OPTION...] [SESSION|IMAGE|TABLEAU...]
 Mesure des objets sur des images et affiche leurs valeurs.
 
   --session FICHIER   ouvrir une session
   --image FICHIER     ouvrir une image
   --table FICHIER     importer un tableau de valeurs mesurées
   --theme Dark|Light  thème pour cette exécution
-  --plugins DOSSIER   chercher aussi des plug-ins ici ; répétable
+  --plugins DOSSIER   chercher aussi des plug-ins ici&#xa0;; répétable
   --help              afficher ce texte
   --version           afficher la version
 
-STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
+STATREPORT_PLUGINS (variable d’environnement)&#xa0;: autres dossiers de plug-ins.
 </translation>
     </message>
 </context>
@@ -624,7 +624,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     <message>
         <source>&amp;Undo %1</source>
         <extracomment>%1 is what is undone or redone, such as &quot;move of Line 3&quot;</extracomment>
-        <translation>&amp;Annuler : %1</translation>
+        <translation>&amp;Annuler&#xa0;: %1</translation>
     </message>
     <message>
         <source>&amp;Undo</source>
@@ -632,7 +632,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>&amp;Redo %1</source>
-        <translation>&amp;Rétablir : %1</translation>
+        <translation>&amp;Rétablir&#xa0;: %1</translation>
     </message>
     <message>
         <source>&amp;Redo</source>
@@ -684,15 +684,15 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Export cancelled: %1</source>
-        <translation>Exportation annulée : %1</translation>
+        <translation>Exportation annulée&#xa0;: %1</translation>
     </message>
     <message>
         <source>The table &quot;%1&quot; was not written.</source>
-        <translation>Le tableau « %1 » n’a pas été écrit.</translation>
+        <translation>Le tableau «&#xa0;%1&#xa0;» n’a pas été écrit.</translation>
     </message>
     <message>
         <source>Measured values exported: %1</source>
-        <translation>Valeurs mesurées exportées : %1</translation>
+        <translation>Valeurs mesurées exportées&#xa0;: %1</translation>
     </message>
     <message>
         <source>Exporting measured values</source>
@@ -731,7 +731,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Changes names that begin with =, +, - or @: they are others when the table is imported again</source>
-        <translation>Modifie les noms commençant par =, +, - ou @ : ils seront différents si le tableau est réimporté</translation>
+        <translation>Modifie les noms commençant par =, +, - ou @&#xa0;: ils seront différents si le tableau est réimporté</translation>
     </message>
     <message>
         <source>Export...</source>
@@ -782,7 +782,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>E&amp;xposition</translation>
     </message>
     <message>
@@ -811,15 +811,15 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Save the changes to &quot;%1&quot;?</source>
-        <translation>Enregistrer les modifications de « %1 » ?</translation>
+        <translation>Enregistrer les modifications de «&#xa0;%1&#xa0;»&#xa0;?</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not opened.</source>
-        <translation>La session « %1 » n’a pas été ouverte.</translation>
+        <translation>La session «&#xa0;%1&#xa0;» n’a pas été ouverte.</translation>
     </message>
     <message>
         <source>Session opened: %1 (objects: %2)</source>
-        <translation>Session ouverte : %1 (objets : %2)</translation>
+        <translation>Session ouverte&#xa0;: %1 (objets&#xa0;: %2)</translation>
     </message>
     <message>
         <source>Image missing</source>
@@ -827,36 +827,36 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Open the session without its image?</source>
-        <translation>Ouvrir la session sans son image ?</translation>
+        <translation>Ouvrir la session sans son image&#xa0;?</translation>
     </message>
     <message>
         <source>The image &quot;%1&quot; was not opened.</source>
-        <translation>L’image « %1 » n’a pas été ouverte.</translation>
+        <translation>L’image «&#xa0;%1&#xa0;» n’a pas été ouverte.</translation>
     </message>
     <message>
         <source>Image opened: %1</source>
-        <translation>Image ouverte : %1</translation>
+        <translation>Image ouverte&#xa0;: %1</translation>
     </message>
     <message>
         <source>The table &quot;%1&quot; was not imported.</source>
-        <translation>Le tableau « %1 » n’a pas été importé.</translation>
+        <translation>Le tableau «&#xa0;%1&#xa0;» n’a pas été importé.</translation>
     </message>
     <message>
         <source>%1: %2</source>
         <comment>file, remark</comment>
-        <translation>%1 : %2</translation>
+        <translation>%1&#xa0;: %2</translation>
     </message>
     <message>
         <source>Table imported: %1 (objects: %2)</source>
-        <translation>Tableau importé : %1 (objets : %2)</translation>
+        <translation>Tableau importé&#xa0;: %1 (objets&#xa0;: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
-        <translation>La session « %1 » n’a pas été enregistrée.</translation>
+        <translation>La session «&#xa0;%1&#xa0;» n’a pas été enregistrée.</translation>
     </message>
     <message>
         <source>Session saved: %1</source>
-        <translation>Session enregistrée : %1</translation>
+        <translation>Session enregistrée&#xa0;: %1</translation>
     </message>
     <message>
         <source>Open session</source>
@@ -888,11 +888,11 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Only one session can be open; not opened: %1</source>
-        <translation>Une seule session peut être ouverte ; non ouverte : %1</translation>
+        <translation>Une seule session peut être ouverte&#xa0;; non ouverte&#xa0;: %1</translation>
     </message>
     <message>
         <source>Neither a session, an image nor a table: %1</source>
-        <translation>Ni session, ni image, ni tableau : %1</translation>
+        <translation>Ni session, ni image, ni tableau&#xa0;: %1</translation>
     </message>
     <message>
         <source>There is not enough memory</source>
@@ -900,7 +900,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Opening &quot;%1&quot;</source>
-        <translation>Ouverture de « %1 »</translation>
+        <translation>Ouverture de «&#xa0;%1&#xa0;»</translation>
     </message>
     <message>
         <source>The measurements were not restored.</source>
@@ -912,15 +912,15 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>Mesures restaurées : %1 (objets : %2)</translation>
+        <translation>Mesures restaurées&#xa0;: %1 (objets&#xa0;: %2)</translation>
     </message>
     <message>
         <source>Importing &quot;%1&quot;</source>
-        <translation>Importation de « %1 »</translation>
+        <translation>Importation de «&#xa0;%1&#xa0;»</translation>
     </message>
     <message>
         <source>Saving &quot;%1&quot;</source>
-        <translation>Enregistrement de « %1 »</translation>
+        <translation>Enregistrement de «&#xa0;%1&#xa0;»</translation>
     </message>
     <message>
         <source>Session changed by another program</source>
@@ -928,7 +928,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>&quot;%1&quot; was changed by another program. Overwrite its changes?</source>
-        <translation>« %1 » a été modifiée par un autre programme. Écraser ces modifications ?</translation>
+        <translation>«&#xa0;%1&#xa0;» a été modifiée par un autre programme. Écraser ces modifications&#xa0;?</translation>
     </message>
     <message>
         <source>Overwrite</source>
@@ -1019,7 +1019,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Snapshots (%1) and the images of a folder appear here; drag them onto report pages</source>
-        <translation>Les instantanés (%1) et les images d’un dossier s’affichent ici ; faites-les glisser sur les pages du rapport</translation>
+        <translation>Les instantanés (%1) et les images d’un dossier s’affichent ici&#xa0;; faites-les glisser sur les pages du rapport</translation>
     </message>
     <message>
         <source>There are no images in %1</source>
@@ -1039,11 +1039,11 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Move &quot;%1&quot; to the trash?</source>
-        <translation>Mettre « %1 » à la corbeille ?</translation>
+        <translation>Mettre «&#xa0;%1&#xa0;» à la corbeille&#xa0;?</translation>
     </message>
     <message>
         <source>Move the selected images (%1) to the trash?</source>
-        <translation>Mettre les images sélectionnées (%1) à la corbeille ?</translation>
+        <translation>Mettre les images sélectionnées (%1) à la corbeille&#xa0;?</translation>
     </message>
     <message>
         <source>Move to trash</source>
@@ -1051,11 +1051,11 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Moved to the trash: %1</source>
-        <translation>Mis à la corbeille : %1</translation>
+        <translation>Mis à la corbeille&#xa0;: %1</translation>
     </message>
     <message>
         <source>Not moved to the trash: %1</source>
-        <translation>Non mis à la corbeille : %1</translation>
+        <translation>Non mis à la corbeille&#xa0;: %1</translation>
     </message>
     <message>
         <source>Measuring Desk</source>
@@ -1136,7 +1136,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     <message>
         <source>%1: %2</source>
         <comment>name and length of a line</comment>
-        <translation>%1 : %2</translation>
+        <translation>%1&#xa0;: %2</translation>
     </message>
     <message>
         <source>Take the selected line as the known distance</source>
@@ -1160,11 +1160,11 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     <message>
         <source>%1 fps</source>
         <extracomment>frames per second</extracomment>
-        <translation>%1 i/s</translation>
+        <translation>%1&#xa0;i/s</translation>
     </message>
     <message>
         <source>%1 delivers no pictures any more; this is the last one</source>
-        <translation>%1 ne fournit plus d’images ; celle-ci est la dernière</translation>
+        <translation>%1 ne fournit plus d’images&#xa0;; celle-ci est la dernière</translation>
     </message>
     <message>
         <source>%1 delivers no pictures</source>
@@ -1180,11 +1180,11 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     </message>
     <message>
         <source>Frozen: %1</source>
-        <translation>Image figée : %1</translation>
+        <translation>Image figée&#xa0;: %1</translation>
     </message>
     <message>
         <source>Live: %1</source>
-        <translation>En direct : %1</translation>
+        <translation>En direct&#xa0;: %1</translation>
     </message>
     <message>
         <source>This image is not live</source>
@@ -1202,7 +1202,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
         <source>Frames per second
 Dropped, because newer ones came first: %1</source>
         <translation>Images par seconde
-Ignorées au profit de plus récentes : %1</translation>
+Ignorées au profit de plus récentes&#xa0;: %1</translation>
     </message>
 </context>
 <context>
@@ -1364,19 +1364,19 @@ Ignorées au profit de plus récentes : %1</translation>
     </message>
     <message>
         <source>Its tools &quot;%1&quot; could not be started</source>
-        <translation>Ses outils « %1 » n’ont pas pu être démarrés</translation>
+        <translation>Ses outils «&#xa0;%1&#xa0;» n’ont pas pu être démarrés</translation>
     </message>
     <message>
         <source>Plug-in loaded: %1</source>
-        <translation>Plug-in chargé : %1</translation>
+        <translation>Plug-in chargé&#xa0;: %1</translation>
     </message>
     <message>
         <source>Plug-in not loaded: %1: %2</source>
-        <translation>Plug-in non chargé : %1 : %2</translation>
+        <translation>Plug-in non chargé&#xa0;: %1&#xa0;: %2</translation>
     </message>
     <message>
         <source>It failed: %1</source>
-        <translation>Il a échoué : %1</translation>
+        <translation>Il a échoué&#xa0;: %1</translation>
     </message>
     <message>
         <source>It failed for a reason of its own</source>
@@ -1403,7 +1403,7 @@ Ignorées au profit de plus récentes : %1</translation>
     <message>
         <source>%1 (objects: %2)</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1 (objets : %2)</translation>
+        <translation>%1 (objets&#xa0;: %2)</translation>
     </message>
 </context>
 <context>
@@ -1431,7 +1431,7 @@ Ignorées au profit de plus récentes : %1</translation>
     <message>
         <source>%1: %2</source>
         <extracomment>%1 is a time, %2 a session</extracomment>
-        <translation>%1 : %2</translation>
+        <translation>%1&#xa0;: %2</translation>
     </message>
     <message numerus="yes">
         <source>%n more</source>
@@ -1470,27 +1470,27 @@ Ignorées au profit de plus récentes : %1</translation>
     </message>
     <message>
         <source>Selected values: %1</source>
-        <translation>Valeurs sélectionnées : %1</translation>
+        <translation>Valeurs sélectionnées&#xa0;: %1</translation>
     </message>
     <message>
         <source>&quot;%1&quot; among them: %2</source>
-        <translation>Dont « %1 » : %2</translation>
+        <translation>Dont «&#xa0;%1&#xa0;»&#xa0;: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
-        <translation>Moyenne : %1</translation>
+        <translation>Moyenne&#xa0;: %1</translation>
     </message>
     <message>
         <source>Standard deviation: %1</source>
-        <translation>Écart-type : %1</translation>
+        <translation>Écart-type&#xa0;: %1</translation>
     </message>
     <message>
         <source>Smallest: %1</source>
-        <translation>Minimum : %1</translation>
+        <translation>Minimum&#xa0;: %1</translation>
     </message>
     <message>
         <source>Largest: %1</source>
-        <translation>Maximum : %1</translation>
+        <translation>Maximum&#xa0;: %1</translation>
     </message>
 </context>
 <context>
@@ -1582,11 +1582,11 @@ Ignorées au profit de plus récentes : %1</translation>
     </message>
     <message>
         <source>No snapshot was taken: earlier ones are still being saved</source>
-        <translation>Aucun instantané n’a été pris : les précédents sont encore en cours d’enregistrement</translation>
+        <translation>Aucun instantané n’a été pris&#xa0;: les précédents sont encore en cours d’enregistrement</translation>
     </message>
     <message>
         <source>Snapshot saved: %1</source>
-        <translation>Instantané enregistré : %1</translation>
+        <translation>Instantané enregistré&#xa0;: %1</translation>
     </message>
     <message>
         <source>The snapshot was not saved. %1</source>
@@ -1597,11 +1597,11 @@ Ignorées au profit de plus récentes : %1</translation>
     <name>KvDeskSourceCommands</name>
     <message>
         <source>The image source &quot;%1&quot; was not opened.</source>
-        <translation>La source d’image « %1 » n’a pas été ouverte.</translation>
+        <translation>La source d’image «&#xa0;%1&#xa0;» n’a pas été ouverte.</translation>
     </message>
     <message>
         <source>Image source: %1</source>
-        <translation>Source d’image : %1</translation>
+        <translation>Source d’image&#xa0;: %1</translation>
     </message>
     <message>
         <source>Open image folder</source>
@@ -1675,7 +1675,7 @@ Ignorées au profit de plus récentes : %1</translation>
     <message>
         <source>%1 %</source>
         <comment>zoom</comment>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
     <message>
         <source>x %1, y %2</source>
@@ -1893,6 +1893,45 @@ Signalé par %2</translation>
     </message>
 </context>
 <context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Appliquer</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Enregistrer</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Ouvrir</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Fermer</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>Abandonner</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>&amp;Oui</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>&amp;Non</translation>
+    </message>
+</context>
+<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -1904,7 +1943,7 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>The settings file %1 is damaged. It was renamed to %2; all settings are back at their defaults.</source>
-        <translation>Le fichier de paramètres %1 est endommagé. Il a été renommé en %2 ; tous les paramètres ont repris leur valeur par défaut.</translation>
+        <translation>Le fichier de paramètres %1 est endommagé. Il a été renommé en %2&#xa0;; tous les paramètres ont repris leur valeur par défaut.</translation>
     </message>
     <message>
         <source>The settings file %1 is damaged and could not be renamed to %2. Changes to the settings will not be kept.</source>
@@ -1915,7 +1954,7 @@ Signalé par %2</translation>
     <name>ZtAravisSource</name>
     <message>
         <source>%1 is disconnected; its last picture stays</source>
-        <translation>%1 est déconnectée ; sa dernière image reste affichée</translation>
+        <translation>%1 est déconnectée&#xa0;; sa dernière image reste affichée</translation>
     </message>
     <message>
         <source>%1 delivers pictures of a kind that cannot be shown</source>
@@ -1938,7 +1977,7 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>A calibration in the settings is damaged and was left out (%1: %2)</source>
-        <translation>Un étalonnage des paramètres est endommagé et a été ignoré (%1 : %2)</translation>
+        <translation>Un étalonnage des paramètres est endommagé et a été ignoré (%1&#xa0;: %2)</translation>
     </message>
 </context>
 <context>
@@ -2058,7 +2097,7 @@ Signalé par %2</translation>
     <name>ZtImageFolderSource</name>
     <message>
         <source>%1: no picture of the folder can be shown</source>
-        <translation>%1 : aucune image du dossier ne peut être affichée</translation>
+        <translation>%1&#xa0;: aucune image du dossier ne peut être affichée</translation>
     </message>
     <message>
         <source>The folder does not exist</source>
@@ -2084,7 +2123,7 @@ Signalé par %2</translation>
     <name>ZtLiveFrameSource</name>
     <message>
         <source>%1 has stopped delivering pictures; the last one stays</source>
-        <translation>%1 ne fournit plus d’images ; la dernière reste affichée</translation>
+        <translation>%1 ne fournit plus d’images&#xa0;; la dernière reste affichée</translation>
     </message>
 </context>
 <context>
@@ -2138,11 +2177,11 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>&quot;%1&quot; is not a type of objects</source>
-        <translation>« %1 » n’est pas un type d’objet</translation>
+        <translation>«&#xa0;%1&#xa0;» n’est pas un type d’objet</translation>
     </message>
     <message>
         <source>An object of type &quot;%1&quot; cannot have this number of points (%2)</source>
-        <translation>Un objet de type « %1 » ne peut pas avoir ce nombre de points (%2)</translation>
+        <translation>Un objet de type «&#xa0;%1&#xa0;» ne peut pas avoir ce nombre de points (%2)</translation>
     </message>
     <message>
         <source>A point must be a list of two numbers between -1e9 and 1e9</source>
@@ -2234,11 +2273,11 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>The session is of the newer version %1; this program reads versions up to %2</source>
-        <translation>La session est dans la version %1, plus récente ; ce programme lit les versions jusqu’à %2</translation>
+        <translation>La session est dans la version %1, plus récente&#xa0;; ce programme lit les versions jusqu’à %2</translation>
     </message>
     <message>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
-        <translation>Les sessions de version %1 ne sont pas connues ; ce programme lit les versions %2 à %3</translation>
+        <translation>Les sessions de version %1 ne sont pas connues&#xa0;; ce programme lit les versions %2 à %3</translation>
     </message>
 </context>
 <context>
@@ -2288,7 +2327,7 @@ Signalé par %2</translation>
     <name>ZtTableImport</name>
     <message>
         <source>&quot;%1&quot; already has a value &quot;%2&quot; in line %3</source>
-        <translation>« %1 » a déjà une valeur « %2 » à la ligne %3</translation>
+        <translation>«&#xa0;%1&#xa0;» a déjà une valeur «&#xa0;%2&#xa0;» à la ligne %3</translation>
     </message>
     <message>
         <source>The file does not exist</source>
@@ -2324,11 +2363,11 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>&quot;%1&quot; of &quot;%2&quot; is given in &quot;%3&quot; here, but in &quot;%4&quot; before</source>
-        <translation>« %1 » de « %2 » est en « %3 » ici, mais en « %4 » auparavant</translation>
+        <translation>«&#xa0;%1&#xa0;» de «&#xa0;%2&#xa0;» est en «&#xa0;%3&#xa0;» ici, mais en «&#xa0;%4&#xa0;» auparavant</translation>
     </message>
     <message>
         <source>There is no column %1; the columns are %2</source>
-        <translation>Il n’y a pas de colonne %1 ; les colonnes sont %2</translation>
+        <translation>Il n’y a pas de colonne %1&#xa0;; les colonnes sont %2</translation>
     </message>
     <message>
         <source>Object</source>
@@ -2336,7 +2375,7 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>There is no value %1 to give a unit; the values are %2</source>
-        <translation>Il n’y a pas de valeur %1 à laquelle attribuer une unité ; les valeurs sont %2</translation>
+        <translation>Il n’y a pas de valeur %1 à laquelle attribuer une unité&#xa0;; les valeurs sont %2</translation>
     </message>
     <message>
         <source>The first line announces %1 rows, but there are %2</source>
@@ -2348,11 +2387,11 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>There is no column %1; the columns of this table have no names</source>
-        <translation>Il n’y a pas de colonne %1 ; les colonnes de ce tableau n’ont pas de nom</translation>
+        <translation>Il n’y a pas de colonne %1&#xa0;; les colonnes de ce tableau n’ont pas de nom</translation>
     </message>
     <message>
         <source>%1 is not the index of a class; they go from 0 to %2</source>
-        <translation>%1 n’est pas l’indice d’une classe ; les indices vont de 0 à %2</translation>
+        <translation>%1 n’est pas l’indice d’une classe&#xa0;; les indices vont de 0 à %2</translation>
     </message>
     <message>
         <source>Value %1</source>
@@ -2364,7 +2403,7 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
-        <translation>Le fichier dépasse %1 Mo</translation>
+        <translation>Le fichier dépasse %1&#xa0;Mo</translation>
     </message>
     <message>
         <source>The file is empty</source>
@@ -2419,7 +2458,7 @@ Signalé par %2</translation>
     <name>ZtTextDecoder</name>
     <message>
         <source>The file is not a text file: it holds a NUL character</source>
-        <translation>Le fichier n’est pas un fichier texte : il contient un caractère NUL</translation>
+        <translation>Le fichier n’est pas un fichier texte&#xa0;: il contient un caractère NUL</translation>
     </message>
     <message>
         <source>The file is not valid UTF-16 text</source>

@@ -89,7 +89,7 @@
     </message>
     <message>
         <source>Show the image at 100 %</source>
-        <translation>Bild mit 100 % anzeigen</translation>
+        <translation>Bild mit 100&#xa0;% anzeigen</translation>
     </message>
     <message>
         <source>&amp;Measured values</source>
@@ -100,7 +100,7 @@
         <translation>Messwerte ein- oder ausblenden</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>&amp;Statusprotokoll</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>Zwischen dunklem und hellem Design wechseln</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>E&amp;instellungen...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>Einen Maßstabsbalken zeichnen</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>Kalibr&amp;ierung...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>Bild in der Galerie speichern</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>Aufnahmen mit &amp;Messungen</translation>
     </message>
     <message>
@@ -353,8 +353,8 @@
         <translation>Beschriftungen der Objekte ein- oder ausblenden</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
-        <translation>Pixel&amp;lineale</translation>
+        <source>&amp;Rulers</source>
+        <translation>&amp;Lineale</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
@@ -415,7 +415,7 @@
     </message>
     <message>
         <source>Such as 10x</source>
-        <translation>Z. B. 10x</translation>
+        <translation>Z.&#xa0;B. 10x</translation>
     </message>
     <message>
         <source>In use</source>
@@ -782,7 +782,7 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>B&amp;elichtung</translation>
     </message>
     <message>
@@ -1675,7 +1675,7 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
     <message>
         <source>%1 %</source>
         <comment>zoom</comment>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
     <message>
         <source>x %1, y %2</source>
@@ -1890,6 +1890,45 @@ Gemeldet von %2</translation>
     <message>
         <source>Reset to the default values</source>
         <translation>Auf die Standardwerte zurücksetzen</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Anwenden</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Speichern</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Öffnen</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Schließen</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>Verwerfen</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>&amp;Ja</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>&amp;Nein</translation>
     </message>
 </context>
 <context>
@@ -2364,7 +2403,7 @@ Gemeldet von %2</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
-        <translation>Die Datei ist größer als %1 MB</translation>
+        <translation>Die Datei ist größer als %1&#xa0;MB</translation>
     </message>
     <message>
         <source>The file is empty</source>

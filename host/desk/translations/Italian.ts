@@ -100,7 +100,7 @@
         <translation>Mostra o nasconde i valori misurati</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>Registro di &amp;stato</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>Passa dal tema scuro a quello chiaro e viceversa</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>Im&amp;postazioni...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>Disegna una barra di scala</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>Calibra&amp;zione...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>Salva l&apos;immagine nella galleria</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>Istantanee con &amp;misure</translation>
     </message>
     <message>
@@ -353,7 +353,7 @@
         <translation>Mostra o nasconde le etichette degli oggetti</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
+        <source>&amp;Rulers</source>
         <translation>Righe&amp;lli</translation>
     </message>
     <message>
@@ -782,7 +782,7 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>&amp;Esposizione</translation>
     </message>
     <message>
@@ -1890,6 +1890,45 @@ Segnalato da %2</translation>
     <message>
         <source>Reset to the default values</source>
         <translation>Ripristina i valori predefiniti</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annulla</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Applica</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Salva</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Apri</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Chiudi</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>Scarta</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>&amp;Sì</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>&amp;No</translation>
     </message>
 </context>
 <context>

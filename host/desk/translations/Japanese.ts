@@ -100,7 +100,7 @@
         <translation>測定値の表示/非表示</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>ステータスログ(&amp;T)</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>ダークテーマとライトテーマを切り替え</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>設定(&amp;G)...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>スケールバーを描く</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>校正(&amp;I)...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>画像をギャラリーに保存</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>測定付きスナップショット(&amp;E)</translation>
     </message>
     <message>
@@ -353,8 +353,8 @@
         <translation>オブジェクトのラベルの表示/非表示</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
-        <translation>ピクセルルーラー(&amp;R)</translation>
+        <source>&amp;Rulers</source>
+        <translation>ルーラー(&amp;R)</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
@@ -782,7 +782,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>露光(&amp;X)</translation>
     </message>
     <message>
@@ -1887,6 +1887,45 @@ Reported by %2</source>
     <message>
         <source>Reset to the default values</source>
         <translation>既定値に戻す</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>キャンセル</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>適用</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>保存</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>開く</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>閉じる</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>破棄</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>はい(&amp;Y)</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>いいえ(&amp;N)</translation>
     </message>
 </context>
 <context>

@@ -100,7 +100,7 @@
         <translation>측정값 표시/숨기기</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>상태 로그(&amp;T)</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>어두운 테마와 밝은 테마 전환</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>설정(&amp;G)...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>스케일 바 그리기</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>교정(&amp;I)...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>이미지를 갤러리에 저장</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>측정 포함 스냅샷(&amp;E)</translation>
     </message>
     <message>
@@ -353,8 +353,8 @@
         <translation>개체 레이블 표시/숨기기</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
-        <translation>픽셀 눈금자(&amp;R)</translation>
+        <source>&amp;Rulers</source>
+        <translation>눈금자(&amp;R)</translation>
     </message>
     <message>
         <source>Show or hide the rulers</source>
@@ -782,7 +782,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>노출(&amp;X)</translation>
     </message>
     <message>
@@ -1887,6 +1887,45 @@ Reported by %2</source>
     <message>
         <source>Reset to the default values</source>
         <translation>기본값으로 되돌리기</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>확인</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>취소</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>적용</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>저장</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>열기</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>닫기</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>버리기</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>예(&amp;Y)</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>아니요(&amp;N)</translation>
     </message>
 </context>
 <context>

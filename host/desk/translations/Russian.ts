@@ -100,7 +100,7 @@
         <translation>Показать или скрыть измеренные значения</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>&amp;Журнал сообщений</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>Переключить тёмную и светлую тему</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>Н&amp;астройки...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>Нанести масштабный отрезок</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>&amp;Калибровка...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>Сохранить изображение в галерею</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>Снимки с из&amp;мерениями</translation>
     </message>
     <message>
@@ -353,7 +353,7 @@
         <translation>Показать или скрыть подписи объектов</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
+        <source>&amp;Rulers</source>
         <translation>&amp;Линейки</translation>
     </message>
     <message>
@@ -782,7 +782,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>&amp;Экспозиция</translation>
     </message>
     <message>
@@ -1893,6 +1893,45 @@ Reported by %2</source>
     <message>
         <source>Reset to the default values</source>
         <translation>Вернуть значения по умолчанию</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>ОК</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Отмена</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Применить</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Сохранить</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Открыть</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Закрыть</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>Не сохранять</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>&amp;Да</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>&amp;Нет</translation>
     </message>
 </context>
 <context>

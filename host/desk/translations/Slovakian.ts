@@ -100,7 +100,7 @@
         <translation>Zobraziť alebo skryť namerané hodnoty</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>&amp;Denník správ</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>Prepnúť medzi tmavým a svetlým motívom</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>Na&amp;stavenia...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>Nakresliť mierku</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>Kal&amp;ibrácia...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>Uložiť obrázok do galérie</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>Snímky s m&amp;eraniami</translation>
     </message>
     <message>
@@ -353,7 +353,7 @@
         <translation>Zobraziť alebo skryť popisky objektov</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
+        <source>&amp;Rulers</source>
         <translation>P&amp;ravítka</translation>
     </message>
     <message>
@@ -782,7 +782,7 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>&amp;Expozícia</translation>
     </message>
     <message>
@@ -1893,6 +1893,45 @@ Ohlásil: %2</translation>
     <message>
         <source>Reset to the default values</source>
         <translation>Obnoviť predvolené hodnoty</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Zrušiť</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Použiť</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Uložiť</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Otvoriť</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Zavrieť</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>Zahodiť</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>Án&amp;o</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>&amp;Nie</translation>
     </message>
 </context>
 <context>

@@ -100,7 +100,7 @@
         <translation>Mostrar u ocultar los valores medidos</translation>
     </message>
     <message>
-        <source>Status &amp;log</source>
+        <source>Stat&amp;us log</source>
         <translation>Registro de e&amp;stado</translation>
     </message>
     <message>
@@ -116,7 +116,7 @@
         <translation>Cambiar entre el tema oscuro y el claro</translation>
     </message>
     <message>
-        <source>S&amp;ettings...</source>
+        <source>Settin&amp;gs...</source>
         <translation>C&amp;onfiguración...</translation>
     </message>
     <message>
@@ -305,7 +305,7 @@
         <translation>Dibujar una barra de escala</translation>
     </message>
     <message>
-        <source>Cali&amp;bration...</source>
+        <source>Cal&amp;ibration...</source>
         <translation>Cal&amp;ibración...</translation>
     </message>
     <message>
@@ -329,7 +329,7 @@
         <translation>Guardar la imagen en la galería</translation>
     </message>
     <message>
-        <source>Snapshots with &amp;measurements</source>
+        <source>Snapshots &amp;with measurements</source>
         <translation>Instantáneas con &amp;mediciones</translation>
     </message>
     <message>
@@ -353,7 +353,7 @@
         <translation>Mostrar u ocultar las etiquetas de los objetos</translation>
     </message>
     <message>
-        <source>Pixel &amp;rulers</source>
+        <source>&amp;Rulers</source>
         <translation>Reg&amp;las</translation>
     </message>
     <message>
@@ -782,7 +782,7 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
 <context>
     <name>KvDeskExposureControl</name>
     <message>
-        <source>&amp;Exposure</source>
+        <source>E&amp;xposure</source>
         <translation>E&amp;xposición</translation>
     </message>
     <message>
@@ -1890,6 +1890,45 @@ Notificado por %2</translation>
     <message>
         <source>Reset to the default values</source>
         <translation>Restablecer los valores predeterminados</translation>
+    </message>
+</context>
+<context>
+    <name>QPlatformTheme</name>
+    <message>
+        <source>OK</source>
+        <translation>Aceptar</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancelar</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Aplicar</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Guardar</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Abrir</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Cerrar</translation>
+    </message>
+    <message>
+        <source>Discard</source>
+        <translation>Descartar</translation>
+    </message>
+    <message>
+        <source>&amp;Yes</source>
+        <translation>&amp;Sí</translation>
+    </message>
+    <message>
+        <source>&amp;No</source>
+        <translation>&amp;No</translation>
     </message>
 </context>
 <context>

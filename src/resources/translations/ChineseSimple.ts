@@ -320,6 +320,17 @@ Do you want to replace it?</source>
     </message>
 </context>
 <context>
+    <name>KvReportGlyphs</name>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1</source>
+        <translation>已安装的字体都没有这些字符，报告中将省略：%1</translation>
+    </message>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
+        <translation>已安装的字体都没有这些字符，报告中将省略：%1（需要安装的字体：%2）</translation>
+    </message>
+</context>
+<context>
     <name>KvReportKeywords</name>
     <message>
         <source>Creation date (ISO)</source>

@@ -29,7 +29,7 @@
     </message>
     <message>
         <source>Template:</source>
-        <translation>Modèle :</translation>
+        <translation>Modèle&#xa0;:</translation>
     </message>
     <message>
         <source>Browse Templates</source>
@@ -59,11 +59,11 @@
     </message>
     <message>
         <source>Title:</source>
-        <translation>Titre :</translation>
+        <translation>Titre&#xa0;:</translation>
     </message>
     <message>
         <source>URL:</source>
-        <translation>URL :</translation>
+        <translation>URL&#xa0;:</translation>
     </message>
 </context>
 <context>
@@ -146,14 +146,14 @@
     <name>KvColumnsOptionsRow</name>
     <message>
         <source>Select columns:</source>
-        <translation>Choix des colonnes :</translation>
+        <translation>Choix des colonnes&#xa0;:</translation>
     </message>
 </context>
 <context>
     <name>KvEditorAddImageExtWidgetUi</name>
     <message>
         <source>Width:</source>
-        <translation>Largeur :</translation>
+        <translation>Largeur&#xa0;:</translation>
     </message>
     <message>
         <source>Width in percent of the text&apos;s width</source>
@@ -161,7 +161,7 @@
     </message>
     <message>
         <source>Float:</source>
-        <translation>Habillage :</translation>
+        <translation>Habillage&#xa0;:</translation>
     </message>
     <message>
         <source>Side of the text at which the picture stands</source>
@@ -212,7 +212,7 @@
         <source>%1 already exists.
 Do you want to replace it?</source>
         <translation>%1 existe déjà.
-Voulez-vous le remplacer ?</translation>
+Voulez-vous le remplacer&#xa0;?</translation>
     </message>
     <message>
         <source>Save</source>
@@ -230,7 +230,7 @@ Voulez-vous le remplacer ?</translation>
     <name>KvGroupByOptionsRow</name>
     <message>
         <source>Group by:</source>
-        <translation>Grouper par :</translation>
+        <translation>Grouper par&#xa0;:</translation>
     </message>
     <message>
         <source>Object</source>
@@ -320,6 +320,17 @@ Voulez-vous le remplacer ?</translation>
     </message>
 </context>
 <context>
+    <name>KvReportGlyphs</name>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1</source>
+        <translation>Aucune police installée ne contient ces caractères, le rapport les omet&#xa0;: %1</translation>
+    </message>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
+        <translation>Aucune police installée ne contient ces caractères, le rapport les omet&#xa0;: %1 (polices à installer&#xa0;: %2)</translation>
+    </message>
+</context>
+<context>
     <name>KvReportKeywords</name>
     <message>
         <source>Creation date (ISO)</source>
@@ -406,7 +417,7 @@ Voulez-vous le remplacer ?</translation>
     </message>
     <message>
         <source>Order by:</source>
-        <translation>Trier par :</translation>
+        <translation>Trier par&#xa0;:</translation>
     </message>
     <message>
         <source>default</source>
@@ -582,7 +593,7 @@ Voulez-vous le remplacer ?</translation>
     </message>
     <message>
         <source>The template is modified, do you want to save it first?</source>
-        <translation>Le modèle a été modifié. Voulez-vous d’abord l’enregistrer ?</translation>
+        <translation>Le modèle a été modifié. Voulez-vous d’abord l’enregistrer&#xa0;?</translation>
     </message>
     <message>
         <source>Choose file to open</source>
@@ -726,7 +737,7 @@ Voulez-vous le remplacer ?</translation>
     <name>KvThemeOptionsRow</name>
     <message>
         <source>Color theme:</source>
-        <translation>Thème :</translation>
+        <translation>Thème&#xa0;:</translation>
     </message>
     <message>
         <source>Dark</source>

@@ -320,6 +320,17 @@ Möchten Sie die Datei ersetzen?</translation>
     </message>
 </context>
 <context>
+    <name>KvReportGlyphs</name>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1</source>
+        <translation>Keine installierte Schriftart enthält diese Zeichen, im Bericht fehlen sie: %1</translation>
+    </message>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
+        <translation>Keine installierte Schriftart enthält diese Zeichen, im Bericht fehlen sie: %1 (zu installierende Schriften: %2)</translation>
+    </message>
+</context>
+<context>
     <name>KvReportKeywords</name>
     <message>
         <source>Creation date (ISO)</source>

@@ -320,6 +320,17 @@ Sostituirlo?</translation>
     </message>
 </context>
 <context>
+    <name>KvReportGlyphs</name>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1</source>
+        <translation>Nessun carattere tipografico installato contiene questi simboli, il report li omette: %1</translation>
+    </message>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
+        <translation>Nessun carattere tipografico installato contiene questi simboli, il report li omette: %1 (pacchetti da installare: %2)</translation>
+    </message>
+</context>
+<context>
     <name>KvReportKeywords</name>
     <message>
         <source>Creation date (ISO)</source>

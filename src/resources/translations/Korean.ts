@@ -320,6 +320,17 @@ Do you want to replace it?</source>
     </message>
 </context>
 <context>
+    <name>KvReportGlyphs</name>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1</source>
+        <translation>설치된 글꼴에 없는 문자이므로 보고서에서 빠집니다: %1</translation>
+    </message>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
+        <translation>설치된 글꼴에 없는 문자이므로 보고서에서 빠집니다: %1(설치할 글꼴: %2)</translation>
+    </message>
+</context>
+<context>
     <name>KvReportKeywords</name>
     <message>
         <source>Creation date (ISO)</source>

@@ -320,6 +320,17 @@ Chcete ho nahradiť?</translation>
     </message>
 </context>
 <context>
+    <name>KvReportGlyphs</name>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1</source>
+        <translation>Tieto znaky nie sú v žiadnom nainštalovanom písme, v správe chýbajú: %1</translation>
+    </message>
+    <message>
+        <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
+        <translation>Tieto znaky nie sú v žiadnom nainštalovanom písme, v správe chýbajú: %1 (písma na inštaláciu: %2)</translation>
+    </message>
+</context>
+<context>
     <name>KvReportKeywords</name>
     <message>
         <source>Creation date (ISO)</source>

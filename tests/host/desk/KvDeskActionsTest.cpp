@@ -65,11 +65,11 @@ void KvDeskActionsTest::commands_data()
     row(A::CounterTool, "Cou&nter", "Count by clicks (N)", true, true);
     row(A::NoteTool, "&Text note", "Write on the image (T)", true, true);
     row(A::ScaleBarTool, "Scale &bar", "Draw a scale bar (B)", true, true);
-    row(A::Calibrate, "Cali&bration...", "Say how large a pixel of the image is (Ctrl+K)");
+    row(A::Calibrate, "Cal&ibration...", "Say how large a pixel of the image is (Ctrl+K)");
     row(A::UseFilePixelSize, "Use the file's pixel size",
         "Measure with the pixel size that the image's file states", false);
     row(A::TakeSnapshot, "&Take snapshot", "Save the image to the gallery (F9)");
-    row(A::SnapshotMeasurements, "Snapshots with &measurements",
+    row(A::SnapshotMeasurements, "Snapshots &with measurements",
         "Draw the measured objects on snapshots (Shift+F9)", false, true);
     row(A::Freeze, "&Freeze", "Freeze the live image (F12)", true, true);
     row(A::ZoomIn, "Zoom &in", "Zoom in (Ctrl++)");
@@ -77,14 +77,14 @@ void KvDeskActionsTest::commands_data()
     row(A::ZoomFit, "&Fit to window", "Show the whole image (Ctrl+0)");
     row(A::ZoomActual, "&Actual size", "Show the image at 100 % (Ctrl+1)");
     row(A::ShowLabels, "&Labels on the image", "Show or hide the labels of objects (F4)", true, true);
-    row(A::ShowRulers, "Pixel &rulers", "Show or hide the rulers (Shift+F4)", true, true);
+    row(A::ShowRulers, "&Rulers", "Show or hide the rulers (Shift+F4)", true, true);
     row(A::ShowScaleBar, "&Scale bar on the image", "Show or hide the scale bar, on reports, too (Shift+B)",
         true, true);
     row(A::ShowValues, "&Measured values", "Show or hide the measured values (F6)", true, true);
-    row(A::ShowLog, "Status &log", "Show or hide the status log (F7)", true, true);
+    row(A::ShowLog, "Stat&us log", "Show or hide the status log (F7)", true, true);
     row(A::ShowGallery, "&Gallery", "Show or hide the gallery (F5)", true, true);
     row(A::ToggleTheme, "&Dark or light theme", "Change between the dark and the light theme (F8)");
-    row(A::Settings, "S&ettings...", "Settings (Ctrl+,)");
+    row(A::Settings, "Settin&gs...", "Settings (Ctrl+,)");
     row(A::StartPage, "&Start page", "Show the first steps, the examples and the recent sessions", false);
     row(A::About, "&About Measuring Desk", "About Measuring Desk");
 }
