@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>إظهار المعرض أو إخفاؤه</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>&amp;صفحة البدء</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>إظهار الخطوات الأولى والأمثلة والجلسات الأخيرة</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> أو </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>الاستخدام: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <translation>الاستخدام: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 يقيس الكائنات على الصور ويعرض قيمها.
 
   --session FILE      فتح جلسة
@@ -657,6 +665,25 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>لم تُنسخ أي كائنات مقيسة</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>عملة معدنية: أول طول</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>صفيحة: الأبعاد</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>خلايا: العدّ</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>ألياف: الإحصاء</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured object is selected</source>
         <translation>لم يُحدَّد أي كائن مقيس</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>يخص جداول CSV فقط</translation>
     </message>
 </context>
 <context>
@@ -1208,6 +1239,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>الإطارات في الثانية
 أُسقطت لأن إطارات أحدث سبقتها: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>إيقاف الصورة المباشرة؛ يمكن للبرامج الأخرى استخدام الكاميرا بعد ذلك</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1574,6 +1609,10 @@ Dropped, because newer ones came first: %1</source>
         <source>System default</source>
         <translation>افتراضي النظام</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>لم يُغيَّر أي شيء بعد</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1664,6 +1703,66 @@ Dropped, because newer ones came first: %1</source>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>من الصورة إلى التقرير</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>العودة إلى الصورة</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>فتح صورة</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>ملف صورة، أو الصورة المباشرة من كاميرا.</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>اختيار كاميرا أو مصدر آخر</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>معايرة</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>حدد حجم البكسل. الأمثلة معايَرة مسبقًا.</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>القياس وإعداد التقرير</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>اسحب خطًا فوق الصورة: يظهر طوله في القائمة فورًا. تُنشئ لوحة التقرير ملف PDF بجميع القيم.</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>أمثلة للتجربة</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>الجلسات الأخيرة</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>افتح صورة أولًا</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>فتح نسخة من هذا المثال</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1726,6 +1825,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>تظهر هنا رسائل البرنامج وإضافاته</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>لا توجد رسائل</translation>
     </message>
 </context>
 <context>
@@ -1845,10 +1948,6 @@ Reported by %2</source>
         <translation>إخفاء القيم المقيسة</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>تظهر القيم المقيسة هنا بعد فتح جلسة أو استيراد جدول</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>تصفية حسب النوع أو الكائن أو اسم القيمة</translation>
     </message>
@@ -1872,6 +1971,14 @@ Reported by %2</source>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 من %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>تظهر القيم المقيسة هنا بعد إجراء قياس أو استيراد</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>لا توجد قيم مقيسة بعد</translation>
     </message>
 </context>
 <context>
@@ -1941,6 +2048,13 @@ Reported by %2</source>
     <message>
         <source>&amp;No</source>
         <translation>&amp;لا</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>يشير اسم الملف إلى مجلد</translation>
     </message>
 </context>
 <context>

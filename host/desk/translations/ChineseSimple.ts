@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>显示或隐藏图库</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>起始页(&amp;S)</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>显示入门步骤、示例和最近的会话</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> 或 </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>用法：measuringdesk [选项...] [会话|图像|表格...]
+        <translation>用法：measuringdesk [选项...] [会话|图像|表格|文件夹|视频...]
 测量图像上的对象并显示其数值。
 
   --session 文件      打开会话
@@ -657,6 +665,25 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>没有已复制的测量对象</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>硬币：首次测量长度</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>板件：尺寸</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>细胞：计数</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>纤维：统计</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured object is selected</source>
         <translation>未选择测量对象</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>仅适用于 CSV 表格</translation>
     </message>
 </context>
 <context>
@@ -1203,6 +1234,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>每秒帧数
 因有更新的帧先到而丢弃：%1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>停止实时图像；之后其他程序可以使用相机</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1559,6 +1594,10 @@ Dropped, because newer ones came first: %1</source>
         <source>System default</source>
         <translation>系统默认</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>尚未进行任何更改</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1649,6 +1688,66 @@ Dropped, because newer ones came first: %1</source>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>从图像到报告</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>返回图像</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>打开图像</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>图像文件或相机的实时图像。</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>选择相机或其他源</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>校准</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>指定一个像素的大小。示例均已校准。</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>测量并生成报告</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>在图像上拖出一条直线，其长度会立即列出。报告面板可将所有数值生成 PDF。</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>试用示例</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>最近的会话</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>请先打开图像</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>打开此示例的副本</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1711,6 +1810,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>程序及其插件的消息将显示在这里</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>没有消息</translation>
     </message>
 </context>
 <context>
@@ -1830,10 +1933,6 @@ Reported by %2</source>
         <translation>隐藏测量值</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>打开会话或导入表格后，测量值将显示在这里</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>按类型、对象或数值名称筛选</translation>
     </message>
@@ -1857,6 +1956,14 @@ Reported by %2</source>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 / %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>进行测量或导入后，测量值将显示在这里</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>尚无测量值</translation>
     </message>
 </context>
 <context>
@@ -1926,6 +2033,13 @@ Reported by %2</source>
     <message>
         <source>&amp;No</source>
         <translation>否(&amp;N)</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>文件名指向的是文件夹</translation>
     </message>
 </context>
 <context>

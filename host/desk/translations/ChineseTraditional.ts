@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>顯示或隱藏圖庫</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>起始頁(&amp;S)</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>顯示入門步驟、範例及最近的工作階段</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> 或 </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>用法：measuringdesk [選項...] [工作階段|影像|表格...]
+        <translation>用法：measuringdesk [選項...] [工作階段|影像|表格|資料夾|影片...]
 量測影像上的物件並顯示其數值。
 
   --session 檔案      開啟工作階段
@@ -657,6 +665,25 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>沒有已複製的量測物件</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>硬幣：首次量測長度</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>板件：尺寸</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>細胞：計數</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>纖維：統計</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured object is selected</source>
         <translation>未選取量測物件</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>僅適用於 CSV 表格</translation>
     </message>
 </context>
 <context>
@@ -1203,6 +1234,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>每秒影格數
 因較新的影格先到而捨棄：%1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>停止即時影像；之後其他程式即可使用相機</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1559,6 +1594,10 @@ Dropped, because newer ones came first: %1</source>
         <source>System default</source>
         <translation>系統預設值</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>尚未進行任何變更</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1649,6 +1688,66 @@ Dropped, because newer ones came first: %1</source>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>從影像到報告</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>返回影像</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>開啟影像</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>影像檔案或相機的即時影像。</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>選擇相機或其他來源</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>校正</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>指定一個像素的大小。範例皆已校正。</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>量測並產生報告</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>在影像上拖曳出一條直線，其長度會立即列出。報告面板可將所有數值產生為 PDF。</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>試用範例</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>最近的工作階段</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>請先開啟影像</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>開啟此範例的副本</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1711,6 +1810,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>程式及其外掛程式的訊息會顯示在這裡</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>沒有訊息</translation>
     </message>
 </context>
 <context>
@@ -1830,10 +1933,6 @@ Reported by %2</source>
         <translation>隱藏量測值</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>開啟工作階段或匯入表格後，量測值會顯示在這裡</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>依類型、物件或數值名稱篩選</translation>
     </message>
@@ -1857,6 +1956,14 @@ Reported by %2</source>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 / %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>進行量測或匯入後，量測值會顯示在這裡</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>尚無量測值</translation>
     </message>
 </context>
 <context>
@@ -1926,6 +2033,13 @@ Reported by %2</source>
     <message>
         <source>&amp;No</source>
         <translation>否(&amp;N)</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>檔名指向的是資料夾</translation>
     </message>
 </context>
 <context>

@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>Show or hide the gallery</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>&amp;Start page</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>Show the first steps, the examples and the recent sessions</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> or </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <translation>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -657,6 +665,25 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>No measured objects were copied</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>Coin: first length</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>Plate: dimensions</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>Cells: counting</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>Fibres: statistics</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured object is selected</source>
         <translation>No measured object is selected</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>Concerns CSV tables only</translation>
     </message>
 </context>
 <context>
@@ -1204,6 +1235,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>Frames per second
 Dropped, because newer ones came first: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>Stop the live image; other programs can use the camera then</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1562,6 +1597,10 @@ Dropped, because newer ones came first: %1</translation>
         <source>System default</source>
         <translation>System default</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>Nothing was changed yet</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1652,6 +1691,66 @@ Dropped, because newer ones came first: %1</translation>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>From an image to a report</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>Back to the image</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>Open an image</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>A picture file, or the live image of a camera.</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>Choose a camera or another source</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Calibrate</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>Say how large a pixel is. The examples are calibrated already.</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>Measure and report</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>Examples to try</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>Recent sessions</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>Open an image first</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>Open a copy of this example</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1714,6 +1813,10 @@ Dropped, because newer ones came first: %1</translation>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>Messages of the program and its plug-ins appear here</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>There are no messages</translation>
     </message>
 </context>
 <context>
@@ -1833,10 +1936,6 @@ Reported by %2</translation>
         <translation>Hide the measured values</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>Measured values appear here once a session is opened or a table is imported</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>Filter by type, object or value name</translation>
     </message>
@@ -1860,6 +1959,14 @@ Reported by %2</translation>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 of %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>Measured values appear here once something is measured or imported</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>There are no measured values yet</translation>
     </message>
 </context>
 <context>
@@ -1929,6 +2036,13 @@ Reported by %2</translation>
     <message>
         <source>&amp;No</source>
         <translation>&amp;No</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>Filename refers to a directory</translation>
     </message>
 </context>
 <context>

@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>Afficher ou masquer la galerie</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>Page d’&amp;accueil</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>Afficher les premiers pas, les exemples et les sessions récentes</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> ou </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,18 +589,18 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>Utilisation&#xa0;: measuringdesk [OPTION...] [SESSION|IMAGE|TABLEAU...]
+        <translation>Utilisation : measuringdesk [OPTION...] [SESSION|IMAGE|TABLEAU|DOSSIER|VIDÉO...]
 Mesure des objets sur des images et affiche leurs valeurs.
 
   --session FICHIER   ouvrir une session
   --image FICHIER     ouvrir une image
   --table FICHIER     importer un tableau de valeurs mesurées
   --theme Dark|Light  thème pour cette exécution
-  --plugins DOSSIER   chercher aussi des plug-ins ici&#xa0;; répétable
+  --plugins DOSSIER   chercher aussi des plug-ins ici ; répétable
   --help              afficher ce texte
   --version           afficher la version
 
-STATREPORT_PLUGINS (variable d’environnement)&#xa0;: autres dossiers de plug-ins.
+STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
 </translation>
     </message>
 </context>
@@ -657,6 +665,25 @@ STATREPORT_PLUGINS (variable d’environnement)&#xa0;: autres dossiers de plug-i
     <message>
         <source>No measured objects were copied</source>
         <translation>Aucun objet mesuré n’a été copié</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>Monnaie : première longueur</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>Plaque : dimensions</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>Cellules : comptage</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>Fibres : statistiques</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ STATREPORT_PLUGINS (variable d’environnement)&#xa0;: autres dossiers de plug-i
     <message>
         <source>No measured object is selected</source>
         <translation>Aucun objet mesuré n’est sélectionné</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>Concerne uniquement les tableaux CSV</translation>
     </message>
 </context>
 <context>
@@ -1204,6 +1235,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>Images par seconde
 Ignorées au profit de plus récentes&#xa0;: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>Arrêter l’image en direct ; d’autres programmes pourront alors utiliser la caméra</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1562,6 +1597,10 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
         <source>System default</source>
         <translation>Langue du système</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>Rien n’a encore été modifié</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1652,6 +1691,66 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>De l’image au rapport</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>Retour à l’image</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>Ouvrir une image</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>Un fichier image ou l’image en direct d’une caméra.</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>Choisir une caméra ou une autre source</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Étalonner</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>Indiquez la taille d’un pixel. Les exemples sont déjà étalonnés.</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>Mesurer et créer un rapport</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>Tracez une ligne sur l’image en faisant glisser la souris : sa longueur s’affiche aussitôt dans la liste. Le panneau de rapport crée un PDF de toutes les valeurs.</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>Exemples à essayer</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>Sessions récentes</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>Ouvrez d’abord une image</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>Ouvrir une copie de cet exemple</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1714,6 +1813,10 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>Les messages du programme et de ses plug-ins s’affichent ici</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>Il n’y a aucun message</translation>
     </message>
 </context>
 <context>
@@ -1833,10 +1936,6 @@ Signalé par %2</translation>
         <translation>Masquer les valeurs mesurées</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>Les valeurs mesurées s’affichent ici dès qu’une session est ouverte ou qu’un tableau est importé</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>Filtrer par type, objet ou grandeur</translation>
     </message>
@@ -1860,6 +1959,14 @@ Signalé par %2</translation>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 sur %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>Les valeurs mesurées s’affichent ici dès qu’une mesure est effectuée ou importée</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>Il n’y a pas encore de valeurs mesurées</translation>
     </message>
 </context>
 <context>
@@ -1929,6 +2036,13 @@ Signalé par %2</translation>
     <message>
         <source>&amp;No</source>
         <translation>&amp;Non</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>Le nom de fichier désigne un dossier</translation>
     </message>
 </context>
 <context>

@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>Galerie ein- oder ausblenden</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>&amp;Startseite</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>Erste Schritte, Beispiele und zuletzt verwendete Sitzungen anzeigen</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> oder </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>Aufruf: measuringdesk [OPTION...] [SITZUNG|BILD|TABELLE...]
+        <translation>Aufruf: measuringdesk [OPTION...] [SITZUNG|BILD|TABELLE|ORDNER|VIDEO...]
 Misst Objekte in Bildern und zeigt ihre Messwerte.
 
   --session DATEI     eine Sitzung öffnen
@@ -657,6 +665,25 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>Es wurden keine Messobjekte kopiert</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>Münze: erste Länge</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>Platte: Maße</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>Zellen: Zählung</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>Fasern: Statistik</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     <message>
         <source>No measured object is selected</source>
         <translation>Es ist kein Messobjekt ausgewählt</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>Betrifft nur CSV-Tabellen</translation>
     </message>
 </context>
 <context>
@@ -1204,6 +1235,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>Bilder pro Sekunde
 Verworfen, weil neuere zuvorkamen: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>Livebild beenden; andere Programme können die Kamera dann verwenden</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1562,6 +1597,10 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
         <source>System default</source>
         <translation>Systemsprache</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>Es wurde noch nichts geändert</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1652,6 +1691,66 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>Vom Bild zum Bericht</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>Zurück zum Bild</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>Bild öffnen</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>Eine Bilddatei oder das Livebild einer Kamera.</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>Eine Kamera oder eine andere Quelle auswählen</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Kalibrieren</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>Geben Sie an, wie groß ein Pixel ist. Die Beispiele sind bereits kalibriert.</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>Messen und Bericht erstellen</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>Ziehen Sie eine Linie über das Bild: Ihre Länge erscheint sofort in der Liste. Der Berichtsbereich erzeugt ein PDF mit allen Werten.</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>Beispiele zum Ausprobieren</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>Zuletzt verwendete Sitzungen</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>Zuerst ein Bild öffnen</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>Eine Kopie dieses Beispiels öffnen</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1714,6 +1813,10 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>Hier erscheinen Meldungen des Programms und seiner Plug-ins</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>Es gibt keine Meldungen</translation>
     </message>
 </context>
 <context>
@@ -1833,10 +1936,6 @@ Gemeldet von %2</translation>
         <translation>Messwerte ausblenden</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>Hier erscheinen Messwerte, sobald eine Sitzung geöffnet oder eine Tabelle importiert ist</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>Nach Typ, Objekt oder Messgröße filtern</translation>
     </message>
@@ -1860,6 +1959,14 @@ Gemeldet von %2</translation>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 von %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>Hier erscheinen Messwerte, sobald etwas gemessen oder importiert wurde</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>Es gibt noch keine Messwerte</translation>
     </message>
 </context>
 <context>
@@ -1929,6 +2036,13 @@ Gemeldet von %2</translation>
     <message>
         <source>&amp;No</source>
         <translation>&amp;Nein</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>Der Dateiname bezeichnet einen Ordner</translation>
     </message>
 </context>
 <context>

@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>Mostra o nasconde la galleria</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>&amp;Pagina iniziale</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>Mostra i primi passi, gli esempi e le sessioni recenti</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> o </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>Uso: measuringdesk [OPZIONE...] [SESSIONE|IMMAGINE|TABELLA...]
+        <translation>Uso: measuringdesk [OPZIONE...] [SESSIONE|IMMAGINE|TABELLA|CARTELLA|VIDEO...]
 Misura oggetti su immagini e ne mostra i valori.
 
   --session FILE      apre una sessione
@@ -657,6 +665,25 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     <message>
         <source>No measured objects were copied</source>
         <translation>Nessun oggetto misurato è stato copiato</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>Moneta: prima lunghezza</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>Piastra: dimensioni</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>Cellule: conteggio</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>Fibre: statistica</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     <message>
         <source>No measured object is selected</source>
         <translation>Nessun oggetto misurato è selezionato</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>Riguarda solo le tabelle CSV</translation>
     </message>
 </context>
 <context>
@@ -1204,6 +1235,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>Fotogrammi al secondo
 Scartati perché ne sono arrivati di più recenti: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>Arresta l&apos;immagine dal vivo; la telecamera sarà poi disponibile per altri programmi</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1562,6 +1597,10 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
         <source>System default</source>
         <translation>Lingua di sistema</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>Non è stato ancora modificato nulla</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1652,6 +1691,66 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>Dall&apos;immagine al report</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>Torna all&apos;immagine</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>Apri un&apos;immagine</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>Un file di immagine o l&apos;immagine dal vivo di una telecamera.</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>Scegli una telecamera o un&apos;altra sorgente</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Calibra</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>Indicare la dimensione di un pixel. Gli esempi sono già calibrati.</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>Misura e crea il report</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>Trascinare una linea sull&apos;immagine: la sua lunghezza appare subito nell&apos;elenco. Il pannello del report crea un PDF con tutti i valori.</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>Esempi da provare</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>Sessioni recenti</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>Aprire prima un&apos;immagine</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>Apri una copia di questo esempio</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1714,6 +1813,10 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>Qui appaiono i messaggi del programma e dei suoi plug-in</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>Non ci sono messaggi</translation>
     </message>
 </context>
 <context>
@@ -1833,10 +1936,6 @@ Segnalato da %2</translation>
         <translation>Nascondi i valori misurati</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>I valori misurati appaiono qui quando si apre una sessione o si importa una tabella</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>Filtra per tipo, oggetto o grandezza</translation>
     </message>
@@ -1860,6 +1959,14 @@ Segnalato da %2</translation>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 di %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>I valori misurati appaiono qui non appena si misura o si importa qualcosa</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>Non ci sono ancora valori misurati</translation>
     </message>
 </context>
 <context>
@@ -1929,6 +2036,13 @@ Segnalato da %2</translation>
     <message>
         <source>&amp;No</source>
         <translation>&amp;No</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>Il nome del file corrisponde a una cartella</translation>
     </message>
 </context>
 <context>

@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>ギャラリーの表示/非表示</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>スタートページ(&amp;S)</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>最初の手順、サンプル、最近使用したセッションを表示</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> または </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>使用法: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <translation>使用法: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 画像上のオブジェクトを測定し、その値を表示します。
 
   --session FILE      セッションを開く
@@ -657,6 +665,25 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>測定オブジェクトがコピーされていません</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>コイン: はじめての長さ測定</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>プレート: 寸法</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>細胞: 計数</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>繊維: 統計</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured object is selected</source>
         <translation>測定オブジェクトが選択されていません</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>CSV 表にのみ適用されます</translation>
     </message>
 </context>
 <context>
@@ -1203,6 +1234,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>1 秒あたりのフレーム数
 より新しいフレームが先に届いたため破棄: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>ライブ画像を停止します。停止後は他のプログラムがカメラを使用できます</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1559,6 +1594,10 @@ Dropped, because newer ones came first: %1</source>
         <source>System default</source>
         <translation>システムの既定</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>まだ何も変更されていません</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1649,6 +1688,66 @@ Dropped, because newer ones came first: %1</source>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>画像からレポートまで</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>画像に戻る</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>画像を開く</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>画像ファイル、またはカメラのライブ画像。</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>カメラまたは別のソースを選択</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>校正</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>1 ピクセルの大きさを指定します。サンプルは校正済みです。</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>測定とレポート作成</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>画像上でドラッグして直線を引くと、その長さがすぐに一覧に表示されます。レポートパネルで、すべての値を PDF にまとめられます。</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>サンプルで試す</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>最近使用したセッション</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>先に画像を開いてください</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>このサンプルのコピーを開く</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1711,6 +1810,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>プログラムとプラグインのメッセージがここに表示されます</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>メッセージはありません</translation>
     </message>
 </context>
 <context>
@@ -1830,10 +1933,6 @@ Reported by %2</source>
         <translation>測定値を非表示</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>セッションを開くか表をインポートすると、測定値がここに表示されます</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>種類、オブジェクト、値の名前で絞り込み</translation>
     </message>
@@ -1857,6 +1956,14 @@ Reported by %2</source>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 / %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>測定またはインポートを行うと、測定値がここに表示されます</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>測定値はまだありません</translation>
     </message>
 </context>
 <context>
@@ -1926,6 +2033,13 @@ Reported by %2</source>
     <message>
         <source>&amp;No</source>
         <translation>いいえ(&amp;N)</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>ファイル名がフォルダーを指しています</translation>
     </message>
 </context>
 <context>

@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>갤러리 표시/숨기기</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>시작 페이지(&amp;S)</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>첫 단계, 예제, 최근 세션 표시</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> 또는 </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>사용법: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <translation>사용법: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 이미지에서 개체를 측정하고 그 값을 표시합니다.
 
   --session FILE      세션 열기
@@ -657,6 +665,25 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>복사한 측정 개체가 없습니다</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>동전: 첫 길이 측정</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>플레이트: 치수</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>세포: 개수 세기</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>섬유: 통계</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured object is selected</source>
         <translation>선택한 측정 개체가 없습니다</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>CSV 표에만 적용됩니다</translation>
     </message>
 </context>
 <context>
@@ -1203,6 +1234,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>초당 프레임 수
 더 새로운 프레임이 먼저 들어와 버려짐: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>라이브 이미지를 중지합니다. 중지하면 다른 프로그램에서 카메라를 사용할 수 있습니다</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1559,6 +1594,10 @@ Dropped, because newer ones came first: %1</source>
         <source>System default</source>
         <translation>시스템 기본값</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>아직 변경한 것이 없습니다</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1649,6 +1688,66 @@ Dropped, because newer ones came first: %1</source>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>이미지에서 보고서까지</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>이미지로 돌아가기</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1(%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>이미지 열기</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>이미지 파일 또는 카메라의 라이브 이미지입니다.</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>카메라 또는 다른 소스 선택</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>교정</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>픽셀의 크기를 지정합니다. 예제는 이미 교정되어 있습니다.</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>측정 및 보고서 작성</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>이미지 위에서 끌어 직선을 그리면 길이가 바로 목록에 표시됩니다. 보고서 패널에서 모든 값을 PDF로 만들 수 있습니다.</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>예제로 시작하기</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>최근 세션</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>먼저 이미지를 여세요</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>이 예제의 사본 열기</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1711,6 +1810,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>프로그램과 플러그인의 메시지가 여기에 표시됩니다</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>메시지가 없습니다</translation>
     </message>
 </context>
 <context>
@@ -1830,10 +1933,6 @@ Reported by %2</source>
         <translation>측정값 숨기기</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>세션을 열거나 표를 가져오면 측정값이 여기에 표시됩니다</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>유형, 개체, 값 이름으로 필터링</translation>
     </message>
@@ -1857,6 +1956,14 @@ Reported by %2</source>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 / %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>측정하거나 가져오면 측정값이 여기에 표시됩니다</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>아직 측정값이 없습니다</translation>
     </message>
 </context>
 <context>
@@ -1926,6 +2033,13 @@ Reported by %2</source>
     <message>
         <source>&amp;No</source>
         <translation>아니요(&amp;N)</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>파일 이름이 폴더를 가리킵니다</translation>
     </message>
 </context>
 <context>

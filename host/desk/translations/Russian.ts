@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>Показать или скрыть галерею</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>&amp;Начальная страница</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>Показать первые шаги, примеры и недавние сеансы</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> или </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>Использование: measuringdesk [ПАРАМЕТР...] [СЕАНС|ИЗОБРАЖЕНИЕ|ТАБЛИЦА...]
+        <translation>Использование: measuringdesk [ПАРАМЕТР...] [СЕАНС|ИЗОБРАЖЕНИЕ|ТАБЛИЦА|ПАПКА|ВИДЕО...]
 Измеряет объекты на изображениях и показывает их значения.
 
   --session ФАЙЛ      открыть сеанс
@@ -657,6 +665,25 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>Измеренные объекты не скопированы</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>Монета: первая длина</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>Пластина: размеры</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>Клетки: подсчёт</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>Волокна: статистика</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured object is selected</source>
         <translation>Не выделен ни один измеренный объект</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>Относится только к таблицам CSV</translation>
     </message>
 </context>
 <context>
@@ -1205,6 +1236,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>Кадров в секунду
 Пропущено из-за поступления более новых: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>Остановить живое изображение; после этого камеру смогут использовать другие программы</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1565,6 +1600,10 @@ Dropped, because newer ones came first: %1</source>
         <source>System default</source>
         <translation>Как в системе</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>Ещё ничего не изменено</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1655,6 +1694,66 @@ Dropped, because newer ones came first: %1</source>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>От изображения к отчёту</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>Назад к изображению</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>Открыть изображение</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>Файл изображения или живое изображение с камеры.</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>Выбрать камеру или другой источник</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Калибровать</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>Укажите размер пикселя. Примеры уже откалиброваны.</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>Измерить и создать отчёт</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>Проведите мышью линию по изображению: её длина сразу появится в списке. Панель отчёта создаёт PDF со всеми значениями.</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>Попробуйте на примерах</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>Недавние сеансы</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>Сначала откройте изображение</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>Открыть копию этого примера</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1717,6 +1816,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>Здесь появляются сообщения программы и её модулей</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>Сообщений нет</translation>
     </message>
 </context>
 <context>
@@ -1836,10 +1939,6 @@ Reported by %2</source>
         <translation>Скрыть измеренные значения</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>Измеренные значения появятся здесь после открытия сеанса или импорта таблицы</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>Фильтр по типу, объекту или величине</translation>
     </message>
@@ -1863,6 +1962,14 @@ Reported by %2</source>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 из %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>Измеренные значения появятся здесь после измерения или импорта</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>Измеренных значений пока нет</translation>
     </message>
 </context>
 <context>
@@ -1932,6 +2039,13 @@ Reported by %2</source>
     <message>
         <source>&amp;No</source>
         <translation>&amp;Нет</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>Имя файла указывает на папку</translation>
     </message>
 </context>
 <context>

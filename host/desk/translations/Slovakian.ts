@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>Zobraziť alebo skryť galériu</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>Ú&amp;vodná stránka</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>Zobraziť prvé kroky, príklady a nedávne relácie</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> alebo </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>Použitie: measuringdesk [VOĽBA...] [RELÁCIA|OBRÁZOK|TABUĽKA...]
+        <translation>Použitie: measuringdesk [VOĽBA...] [RELÁCIA|OBRÁZOK|TABUĽKA|PRIEČINOK|VIDEO...]
 Meria objekty na obrázkoch a zobrazuje ich hodnoty.
 
   --session SÚBOR     otvoriť reláciu
@@ -657,6 +665,25 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     <message>
         <source>No measured objects were copied</source>
         <translation>Neboli skopírované žiadne merané objekty</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>Minca: prvá dĺžka</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>Platňa: rozmery</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>Bunky: počítanie</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>Vlákna: štatistika</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     <message>
         <source>No measured object is selected</source>
         <translation>Nie je vybraný žiadny meraný objekt</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>Týka sa len tabuliek CSV</translation>
     </message>
 </context>
 <context>
@@ -1205,6 +1236,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>Snímky za sekundu
 Vynechané, pretože medzitým prišli novšie: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>Zastaviť živý obraz; kameru potom môžu používať iné programy</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1565,6 +1600,10 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
         <source>System default</source>
         <translation>Podľa systému</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>Zatiaľ sa nič nezmenilo</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1655,6 +1694,66 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>Od obrázka k protokolu</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>Späť na obrázok</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>Otvoriť obrázok</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>Súbor s obrázkom alebo živý obraz z kamery.</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>Vybrať kameru alebo iný zdroj</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Kalibrovať</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>Určte, aký veľký je pixel. Príklady sú už kalibrované.</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>Merať a vytvoriť protokol</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>Potiahnite myšou úsečku cez obrázok: jej dĺžka sa hneď objaví v zozname. Panel protokolu vytvorí PDF so všetkými hodnotami.</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>Príklady na vyskúšanie</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>Nedávne relácie</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>Najprv otvorte obrázok</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>Otvoriť kópiu tohto príkladu</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1717,6 +1816,10 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>Tu sa zobrazujú správy programu a jeho zásuvných modulov</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>Nie sú žiadne správy</translation>
     </message>
 </context>
 <context>
@@ -1836,10 +1939,6 @@ Ohlásil: %2</translation>
         <translation>Skryť namerané hodnoty</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>Namerané hodnoty sa tu objavia po otvorení relácie alebo importe tabuľky</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>Filtrovať podľa typu, objektu alebo veličiny</translation>
     </message>
@@ -1863,6 +1962,14 @@ Ohlásil: %2</translation>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 z %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>Namerané hodnoty sa tu objavia po meraní alebo importe</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>Zatiaľ nie sú žiadne namerané hodnoty</translation>
     </message>
 </context>
 <context>
@@ -1932,6 +2039,13 @@ Ohlásil: %2</translation>
     <message>
         <source>&amp;No</source>
         <translation>&amp;Nie</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>Názov súboru označuje priečinok</translation>
     </message>
 </context>
 <context>

@@ -376,6 +376,14 @@
         <source>Show or hide the gallery</source>
         <translation>Mostrar u ocultar la galería</translation>
     </message>
+    <message>
+        <source>&amp;Start page</source>
+        <translation>Página de &amp;inicio</translation>
+    </message>
+    <message>
+        <source>Show the first steps, the examples and the recent sessions</source>
+        <translation>Mostrar los primeros pasos, los ejemplos y las sesiones recientes</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -568,7 +576,7 @@
         <translation> o </translation>
     </message>
     <message>
-        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE...]
+        <source>Usage: measuringdesk [OPTION...] [SESSION|IMAGE|TABLE|FOLDER|VIDEO...]
 Measures objects on images and shows their values.
 
   --session FILE      open a session
@@ -581,7 +589,7 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>Uso: measuringdesk [OPCIÓN...] [SESIÓN|IMAGEN|TABLA...]
+        <translation>Uso: measuringdesk [OPCIÓN...] [SESIÓN|IMAGEN|TABLA|CARPETA|VÍDEO...]
 Mide objetos en imágenes y muestra sus valores.
 
   --session ARCHIVO   abrir una sesión
@@ -657,6 +665,25 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     <message>
         <source>No measured objects were copied</source>
         <translation>No se han copiado objetos medidos</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskExamples</name>
+    <message>
+        <source>Coin: first length</source>
+        <translation>Moneda: primera longitud</translation>
+    </message>
+    <message>
+        <source>Plate: dimensions</source>
+        <translation>Placa: dimensiones</translation>
+    </message>
+    <message>
+        <source>Cells: counting</source>
+        <translation>Células: recuento</translation>
+    </message>
+    <message>
+        <source>Fibres: statistics</source>
+        <translation>Fibras: estadística</translation>
     </message>
 </context>
 <context>
@@ -777,6 +804,10 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     <message>
         <source>No measured object is selected</source>
         <translation>No hay ningún objeto medido seleccionado</translation>
+    </message>
+    <message>
+        <source>Concerns CSV tables only</source>
+        <translation>Solo afecta a las tablas CSV</translation>
     </message>
 </context>
 <context>
@@ -1204,6 +1235,10 @@ Dropped, because newer ones came first: %1</source>
         <translation>Fotogramas por segundo
 Descartados porque llegaron antes otros más nuevos: %1</translation>
     </message>
+    <message>
+        <source>Stop the live image; other programs can use the camera then</source>
+        <translation>Detener la imagen en vivo; entonces otros programas podrán usar la cámara</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskMainWindow</name>
@@ -1562,6 +1597,10 @@ Descartados porque llegaron antes otros más nuevos: %1</translation>
         <source>System default</source>
         <translation>Idioma del sistema</translation>
     </message>
+    <message>
+        <source>Nothing was changed yet</source>
+        <translation>Aún no se ha cambiado nada</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskSnapshotFile</name>
@@ -1652,6 +1691,66 @@ Descartados porque llegaron antes otros más nuevos: %1</translation>
     </message>
 </context>
 <context>
+    <name>KvDeskStartPage</name>
+    <message>
+        <source>From an image to a report</source>
+        <translation>De la imagen al informe</translation>
+    </message>
+    <message>
+        <source>Back to the image</source>
+        <translation>Volver a la imagen</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>command (shortcut)</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>Open an image</source>
+        <translation>Abrir una imagen</translation>
+    </message>
+    <message>
+        <source>A picture file, or the live image of a camera.</source>
+        <translation>Un archivo de imagen o la imagen en vivo de una cámara.</translation>
+    </message>
+    <message>
+        <source>Choose a camera or another source</source>
+        <translation>Elegir una cámara u otra fuente</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Calibrar</translation>
+    </message>
+    <message>
+        <source>Say how large a pixel is. The examples are calibrated already.</source>
+        <translation>Indique el tamaño de un píxel. Los ejemplos ya están calibrados.</translation>
+    </message>
+    <message>
+        <source>Measure and report</source>
+        <translation>Medir y crear el informe</translation>
+    </message>
+    <message>
+        <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
+        <translation>Arrastre una línea sobre la imagen: su longitud aparece al momento en la lista. El panel de informes crea un PDF con todos los valores.</translation>
+    </message>
+    <message>
+        <source>Examples to try</source>
+        <translation>Ejemplos para probar</translation>
+    </message>
+    <message>
+        <source>Recent sessions</source>
+        <translation>Sesiones recientes</translation>
+    </message>
+    <message>
+        <source>Open an image first</source>
+        <translation>Abra primero una imagen</translation>
+    </message>
+    <message>
+        <source>Open a copy of this example</source>
+        <translation>Abrir una copia de este ejemplo</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskStatus</name>
     <message>
         <source>Warning</source>
@@ -1714,6 +1813,10 @@ Descartados porque llegaron antes otros más nuevos: %1</translation>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
         <translation>Aquí aparecen los mensajes del programa y sus complementos</translation>
+    </message>
+    <message>
+        <source>There are no messages</source>
+        <translation>No hay mensajes</translation>
     </message>
 </context>
 <context>
@@ -1833,10 +1936,6 @@ Notificado por %2</translation>
         <translation>Ocultar los valores medidos</translation>
     </message>
     <message>
-        <source>Measured values appear here once a session is opened or a table is imported</source>
-        <translation>Los valores medidos aparecen aquí al abrir una sesión o importar una tabla</translation>
-    </message>
-    <message>
         <source>Filter by type, object or value name</source>
         <translation>Filtrar por tipo, objeto o magnitud</translation>
     </message>
@@ -1860,6 +1959,14 @@ Notificado por %2</translation>
         <source>%1 of %2</source>
         <extracomment>rows that match the filter, all rows</extracomment>
         <translation>%1 de %2</translation>
+    </message>
+    <message>
+        <source>Measured values appear here once something is measured or imported</source>
+        <translation>Los valores medidos aparecen aquí en cuanto se mide o se importa algo</translation>
+    </message>
+    <message>
+        <source>There are no measured values yet</source>
+        <translation>Aún no hay valores medidos</translation>
     </message>
 </context>
 <context>
@@ -1929,6 +2036,13 @@ Notificado por %2</translation>
     <message>
         <source>&amp;No</source>
         <translation>&amp;No</translation>
+    </message>
+</context>
+<context>
+    <name>QSaveFile</name>
+    <message>
+        <source>Filename refers to a directory</source>
+        <translation>El nombre de archivo corresponde a una carpeta</translation>
     </message>
 </context>
 <context>
