@@ -25,8 +25,8 @@ constexpr int controlSpacing = 8;
 constexpr int groupSpacing = 16;
 constexpr int pageMargin = 24;
 constexpr int widestPage = 720;
-constexpr QSize thumbnailSize(124, 93);
-constexpr QSize exampleSize(136, 124);
+constexpr QSize thumbnailSize(148, 111);
+constexpr QSize exampleSize(160, 142);
 constexpr int mostRecent = 4;
 
 QLabel *groupTitle(const QString &text, QWidget *parent)

@@ -17,7 +17,7 @@ _statreport_words()
 _statreport()
 {
     local current=${COMP_WORDS[COMP_CWORD]} previous=${COMP_WORDS[COMP_CWORD - 1]} command=${COMP_WORDS[1]}
-    local common="--help --version --json-errors --quiet"
+    local common="--help --version --json-errors --language --quiet"
     local data="--session --table --unit --type-column --name-column --decimal --digits"
     COMPREPLY=()
     shopt -q extglob || { shopt -s extglob; }
@@ -32,6 +32,7 @@ _statreport()
     --format)
         if [ "$command" = stats ]; then _statreport_words "text csv json"; else _statreport_words "text json"; fi
         return ;;
+    --language) _statreport_words "English German French Spanish Italian Russian Japanese Korean Arabic ChineseSimple ChineseTraditional Slovakian"; return ;;
     --unit | --type-column | --name-column | --digits) return ;;
     esac
 

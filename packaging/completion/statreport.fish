@@ -8,6 +8,7 @@ complete -c statreport -n "not __fish_seen_subcommand_from $commands" -a blocks 
 complete -c statreport -s h -l help -d "Show a help text"
 complete -c statreport -s v -l version -d "Show the version"
 complete -c statreport -l json-errors -d "Write errors as one line of JSON each"
+complete -c statreport -l language -x -a "English German French Spanish Italian Russian Japanese Korean Arabic ChineseSimple ChineseTraditional Slovakian" -d "Language of texts and reports"
 complete -c statreport -s q -l quiet -d "Write no notes and no progress"
 for command in render stats
     complete -c statreport -n "__fish_seen_subcommand_from $command" -l session -r -F -d "A session of the Measuring Desk"

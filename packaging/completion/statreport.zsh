@@ -7,6 +7,7 @@ _statreport() {
     '(-h --help)'{-h,--help}'[show a help text]'
     '(-v --version)'{-v,--version}'[show the version]'
     '--json-errors[write errors as one line of JSON each]'
+    '--language=[language of texts and reports]:language:(English German French Spanish Italian Russian Japanese Korean Arabic ChineseSimple ChineseTraditional Slovakian)'
     '(-q --quiet)'{-q,--quiet}'[write no notes and no progress]'
   )
   data=(

@@ -439,10 +439,11 @@ void RenderedReportTest::printsTheExamples()
     QCOMPARE(result.exitCode, 0);
     const PdfFile pdf(outPath());
     QVERIFY(pdf.isSound());
-    QVERIFY(pdf.pageCount() > 1);
+    QVERIFY(pdf.pageCount() >= 1);
     const QString all = pdf.pageTexts().join(QString());
     QVERIFY2(!all.contains(QLatin1String("${")), "a keyword was not replaced");
-    QVERIFY(all.contains(QLatin1String("Value")));
+    // Every template shows values, in a table or as a chart with its axes.
+    QVERIFY(all.contains(QRegularExpression(QStringLiteral("\\d[.,]\\d"))));
 }
 
 STATREPORT_TEST_MAIN(RenderedReportTest)

@@ -671,7 +671,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     <name>KvDeskExamples</name>
     <message>
         <source>Coin: first length</source>
-        <translation>Monnaie : première longueur</translation>
+        <translation>Monnaie : longueur</translation>
     </message>
     <message>
         <source>Plate: dimensions</source>

@@ -671,7 +671,7 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     <name>KvDeskExamples</name>
     <message>
         <source>Coin: first length</source>
-        <translation>Moneta: prima lunghezza</translation>
+        <translation>Moneta: lunghezza</translation>
     </message>
     <message>
         <source>Plate: dimensions</source>

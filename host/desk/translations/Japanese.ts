@@ -671,7 +671,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <name>KvDeskExamples</name>
     <message>
         <source>Coin: first length</source>
-        <translation>コイン: はじめての長さ測定</translation>
+        <translation>コイン: 長さ測定</translation>
     </message>
     <message>
         <source>Plate: dimensions</source>

@@ -671,7 +671,7 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     <name>KvDeskExamples</name>
     <message>
         <source>Coin: first length</source>
-        <translation>Moneda: primera longitud</translation>
+        <translation>Moneda: longitud</translation>
     </message>
     <message>
         <source>Plate: dimensions</source>
