@@ -21,7 +21,10 @@ void KvPageSectionWidget::fitToWidth(int width)
     m_sizeUnannounced = false;
     setFixedWidth(width);
     ensurePolished();
-    document()->setTextWidth(width);
+    // A document lays its text out anew even for the width that it has, and this is said to the sections of
+    // all pages.
+    if (document()->textWidth() != width)
+        document()->setTextWidth(width);
     resize(sizeHint());
 }
 

@@ -70,6 +70,9 @@ KvReportPagedView::KvReportPagedView(QWidget *parent)
     // Report pages read from left to right whatever the language of the program around them.
     setLayoutDirection(Qt::LeftToRight);
     m_scene->setBackgroundBrush(QColor(QStringLiteral("#313131")));
+    // Pages are few for a list, and come, go and grow with every measurement: a tree of their places would be
+    // built anew each time, at more than it ever saves.
+    m_scene->setItemIndexMethod(QGraphicsScene::NoIndex);
     setScene(m_scene);
     connect(m_scene, SIGNAL(focusItemChanged(QGraphicsItem*,QGraphicsItem*,Qt::FocusReason)), this,
                             SLOT(slotFocusItemChanged(QGraphicsItem*,QGraphicsItem*,Qt::FocusReason)));
