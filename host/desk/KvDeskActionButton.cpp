@@ -2,6 +2,22 @@
 #include "KvDeskActionButton.h"
 
 #include <QAction>
+#include <QRegularExpression>
+
+namespace {
+
+// Languages without letters of their own put the shortcut's behind the text: "(&O)".
+QString plainText(QString text)
+{
+    static const QRegularExpression letterBehind(QStringLiteral("\\s?\\(&\\w\\)"));
+    text.remove(letterBehind);
+    text.remove(QLatin1Char('&'));
+    if (text.endsWith(QLatin1String("...")))
+        text.chop(3);
+    return text;
+}
+
+} // namespace
 
 KvDeskActionButton::KvDeskActionButton(QAction *action, QWidget *parent)
     : QPushButton(parent)
@@ -20,8 +36,9 @@ void KvDeskActionButton::setObstacle(const QString &reason)
 
 void KvDeskActionButton::slotActionChanged()
 {
-    setText(m_action->iconText());
-    setAccessibleName(m_action->iconText());
+    const QString text = plainText(m_action->text());
+    setText(text);
+    setAccessibleName(text);
     setEnabled(m_action->isEnabled() && m_obstacle.isEmpty());
     setToolTip(m_obstacle.isEmpty() ? m_action->toolTip()
                                     : m_action->toolTip() + QLatin1Char('\n') + m_obstacle);

@@ -2,12 +2,14 @@
 #include "KvDeskCounterBar.h"
 
 #include "KvDeskCounterTool.h"
+#include "KvDeskElidedLabel.h"
 #include "KvDeskImageView.h"
 #include "KvDeskSelection.h"
 #include "KvDeskToolBox.h"
 #include "gui/acss.h"
 #include "kernel/ZtGsManipulator.h"
 #include "kernel/ZtKernelData.h"
+#include "measuring/ZtMeasureFormat.h"
 
 #include <QComboBox>
 #include <QEvent>
@@ -20,6 +22,7 @@ namespace {
 
 constexpr int margin = 8;
 constexpr int classesWidth = 240;
+constexpr int leastClassesWidth = 96;
 constexpr QSize iconSize(24, 24);
 constexpr QSize buttonSize(32, 28);
 
@@ -46,7 +49,9 @@ void KvDeskCounterBar::createWidgets()
 {
     auto *const label = new QLabel(tr("Clicks count for"), this);
     m_classes = new QComboBox(this);
-    m_classes->setFixedWidth(classesWidth);
+    m_classes->setMinimumWidth(leastClassesWidth);
+    m_classes->setMaximumWidth(classesWidth);
+    m_classes->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
     m_classes->setAccessibleName(label->text());
     m_classes->setToolTip(tr("The counter that gets the clicks (1 to 9)"));
     m_newClass = new QToolButton(this);
@@ -56,7 +61,7 @@ void KvDeskCounterBar::createWidgets()
     m_newClass->setAutoRaise(true);
     m_newClass->setToolTip(tr("Count another class"));
     m_newClass->setAccessibleName(m_newClass->toolTip());
-    auto *const hint = new QLabel(tr("A right click takes a place away"), this);
+    auto *const hint = new KvDeskElidedLabel(tr("A right click takes a place away"), this);
     hint->setProperty("caption", true);
     auto *const layout = new QHBoxLayout(this);
     layout->setContentsMargins(margin, margin, margin, margin);
@@ -81,10 +86,10 @@ QString KvDeskCounterBar::classText(const KvDeskObjectId &counter) const
 {
     const ZtGsManipulator *const manipulator = ZtKernelData::getInstance()->getGsManipulator(counter.type);
     const ZtKernelObjectData *const object = ZtKernelData::getInstance()->object(counter.type, counter.id);
-    QStringList parts{manipulator->getObjectName(counter.id)};
+    QStringList values;
     for (const QString &name : manipulator->getValueNames())
-        parts.append(manipulator->valueText(name, object));
-    return parts.join(QStringLiteral("  "));
+        values.append(manipulator->valueText(name, object));
+    return ZtMeasureFormat::named(manipulator->getObjectName(counter.id), values.join(QStringLiteral("  ")));
 }
 
 void KvDeskCounterBar::slotUpdate()
@@ -122,8 +127,10 @@ void KvDeskCounterBar::slotNewClass()
 
 void KvDeskCounterBar::place()
 {
-    adjustSize();
-    move(qMax(0, (parentWidget()->width() - width()) / 2), margin);
+    // In a narrow view the hint goes first, then the names are cut.
+    const QSize wanted = sizeHint();
+    resize(qMin(wanted.width(), parentWidget()->width()), wanted.height());
+    move((parentWidget()->width() - width()) / 2, margin);
 }
 
 bool KvDeskCounterBar::eventFilter(QObject *watched, QEvent *event)

@@ -10,6 +10,7 @@
 #include "measuring/ZtDrawnObjectData.h"
 #include "measuring/ZtDrawnObjectPainter.h"
 #include "measuring/ZtDrawnType.h"
+#include "measuring/ZtMeasureFormat.h"
 
 #include <QKeyEvent>
 #include <QPainter>
@@ -166,7 +167,7 @@ QString KvDeskDrawTool::valueText() const
     const QStringList names = manipulator->getValueNames();
     for (const QString &name : names) {
         const QString value = manipulator->valueText(name, &object);
-        lines.append(names.size() == 1 ? value : name + QStringLiteral("  ") + value);
+        lines.append(names.size() == 1 ? value : ZtMeasureFormat::named(name, value));
     }
     if (m_type.id == ZtDrawnType::ScaleBar)
         lines.append(static_cast<const ZtDrawnManipulator *>(manipulator)->labelText(0, &object));

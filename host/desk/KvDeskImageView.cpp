@@ -592,8 +592,8 @@ void KvDeskImageView::slotSetScaleBarVisible(bool aVisible)
 void KvDeskImageView::drawScaleBar(QPainter *painter) const
 {
     if (m_document && !m_frame.isNull())
-        m_document->objectsPainter()->drawScaleBar(
-            painter, viewportTransform(), page() & viewportTransform().mapRect(m_frame.sceneRect()));
+        m_document->objectsPainter()->drawScaleBar(painter, viewportTransform(),
+                                                   page() & viewportTransform().mapRect(m_frame.sceneRect()));
 }
 
 void KvDeskImageView::placeRulers()

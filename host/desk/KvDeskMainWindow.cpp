@@ -193,6 +193,7 @@ void KvDeskMainWindow::createMenus()
             menu->addAction(m_actions->action(id));
     };
     QMenu *const file = menuBar()->addMenu(tr("&File"));
+    file->setToolTipsVisible(true);
     add(file, {A::NewSession, A::OpenSession});
     m_recentMenu = file->addMenu(acss::createIcon(6, QStringLiteral("Icons/recent"), QSize(24, 24)),
                                  tr("&Recent sessions"));
@@ -228,6 +229,7 @@ void KvDeskMainWindow::createMenus()
     measure->setToolTipsVisible(true);
     add(measure, {A::Calibrate, A::UseFilePixelSize});
     QMenu *const view = menuBar()->addMenu(tr("&View"));
+    view->setToolTipsVisible(true);
     add(view, {A::ZoomIn, A::ZoomOut, A::ZoomFit, A::ZoomActual});
     view->addSeparator();
     add(view, {A::ShowLabels, A::ShowRulers, A::ShowScaleBar});
@@ -236,6 +238,7 @@ void KvDeskMainWindow::createMenus()
     view->addSeparator();
     add(view, {A::ToggleTheme});
     QMenu *const help = menuBar()->addMenu(tr("&Help"));
+    help->setToolTipsVisible(true);
     add(help, {A::StartPage});
     help->addSeparator();
     add(help, {A::About});

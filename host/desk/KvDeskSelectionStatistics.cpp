@@ -7,6 +7,7 @@
 #include "measuring/ZtUnitSettings.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace {
 
@@ -38,6 +39,9 @@ QString inUnit(double value, const KvDeskSelectionStatistics::Group &group, int 
     const auto number = [digits](double shown) {
         return digits > 0 ? ZtMeasureFormat::significant(shown, digits) : ZtMeasureFormat::readable(shown);
     };
+    // A mean of counts may lie between two of them, a count does not.
+    if (group.kind == ZtGsManipulator::Count && value == std::floor(value))
+        return ZtMeasureFormat::drawnText(value, group.kind);
     const ZtUnit unit = unitOf(value, group);
     return unit.isEmpty() ? ZtMeasureFormat::withUnit(number(value), unitTextOf(group))
                           : ZtMeasureFormat::withUnit(number(unit.fromBase(value)), unit.text());

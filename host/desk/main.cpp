@@ -13,6 +13,7 @@
 #include "measuring/ZtMeasuringDocument.h"
 
 #include <QApplication>
+#include <QTranslator>
 
 #include <cstdio>
 
@@ -49,10 +50,26 @@ void openFiles(const KvDeskCommandLine &commandLine, KvDeskMainWindow *window)
         window->openPath(file);
 }
 
+void setProgramInfo()
+{
+    ZtAppSettings::setProgramInfo(QStringLiteral("Measuring Desk"), QStringLiteral(STATREPORT_VERSION),
+                                  QStringLiteral("StatReport"));
+}
+
+// Without a display.
+int printRequestedText(int argc, char **argv, const QStringList &words)
+{
+    const QCoreApplication application(argc, argv);
+    setProgramInfo();
+    QTranslator translator;
+    if (translator.load(QStringLiteral(":/measuringdesk/%1.qm").arg(KvDeskLanguages::effectiveName())))
+        QCoreApplication::installTranslator(&translator);
+    std::fputs(qPrintable(KvDeskCommandLine::requestedText(words)), stdout);
+    return 0;
+}
+
 int run(const KvDeskCommandLine &commandLine)
 {
-    KvDeskResources::ensure();
-    const KvDeskTranslation translation(KvDeskLanguages::effectiveName());
     KvDeskTheme::apply(commandLine.theme().isEmpty() ? KvDeskTheme::stored() : commandLine.theme());
     // At the end these go in the opposite order: plug-ins own windows that belong to the main window.
     ZtMeasuringDocument document;
@@ -74,15 +91,14 @@ int main(int argc, char **argv)
 {
     // Before the application takes those that it knows, of which "--session" is one of ours.
     const QStringList words = wordsOf(argc, argv);
-    const QString text = KvDeskCommandLine::requestedText(words);
-    if (!text.isEmpty()) {
-        std::fputs(qPrintable(text), stdout);
-        return 0;
-    }
+    if (!KvDeskCommandLine::requestedText(words).isEmpty())
+        return printRequestedText(argc, argv, words);
     setAttributes();
-    QApplication application(argc, argv);
-    ZtAppSettings::setProgramInfo(QStringLiteral("Measuring Desk"), QStringLiteral(STATREPORT_VERSION),
-                                  QStringLiteral("StatReport"));
+    const QApplication application(argc, argv);
+    setProgramInfo();
+    QGuiApplication::setDesktopFileName(QStringLiteral("org.statreport.measuringdesk"));
+    KvDeskResources::ensure();
+    const KvDeskTranslation translation(KvDeskLanguages::effectiveName());
     const KvDeskCommandLine commandLine(words);
     if (!commandLine.fault().isEmpty()) {
         std::fprintf(stderr, "measuringdesk: %s (measuringdesk --help tells more)\n",

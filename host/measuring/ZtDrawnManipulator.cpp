@@ -153,7 +153,7 @@ QString ZtDrawnManipulator::labelText(int id, const ZtKernelObjectData *object) 
         return lengthText(drawn(object));
     const QString name = getObjectName(id);
     const QString value = firstValueText(drawn(object));
-    return value.isEmpty() ? name : name + QStringLiteral("  ") + value;
+    return value.isEmpty() ? name : ZtMeasureFormat::named(name, value);
 }
 
 QPainterPath ZtDrawnManipulator::outline(const QPolygonF &points) const

@@ -108,6 +108,14 @@ ZtUnit ZtMeasureFormat::readableUnit(double baseValue, int measureKind)
     return isArea ? unit.squared() : unit;
 }
 
+QString ZtMeasureFormat::named(const QString &name, const QString &valueText)
+{
+    // A number is drawn into a name before it that runs from right to left, and parts from its unit, unless
+    // something that runs to the right stands between them.
+    const QString gap = name.isRightToLeft() ? QStringLiteral("\u200E  ") : QStringLiteral("  ");
+    return name + gap + valueText;
+}
+
 QString ZtMeasureFormat::drawnText(double baseValue, int measureKind)
 {
     if (measureKind == ZtGsManipulator::Count)

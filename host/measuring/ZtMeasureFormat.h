@@ -41,4 +41,6 @@ public:
 
     /** Number and unit with a blank between them; the number alone where there is no unit. */
     static QString withUnit(const QString &number, const QString &unitText);
+    /** A name and, behind it, its value, in this order in any script of the name. */
+    static QString named(const QString &name, const QString &valueText);
 };

@@ -15,7 +15,6 @@
 #include "ui_KvTemplatesEditorWindowUi.h"
 
 #include <QCloseEvent>
-#include <QFile>
 #include <QFileInfo>
 #include <QGuiApplication>
 #include <QKeyEvent>
@@ -355,9 +354,7 @@ void KvTemplatesEditorWindow::printTo(const QString &fileName)
     // Whoever cancels the last page when it is written has a report.
     if (isDone)
         return;
-    if (isCancelled)
-        QFile::remove(fileName);
-    else
+    if (!isCancelled)
         tellPrintFailed(fileName);
 }
 

@@ -9,9 +9,11 @@
 #include "report/KvReportProxyWidgetItem.h"
 #include "templates/KvTemplateModel.h"
 
+#include <QFileInfo>
 #include <QGraphicsScene>
 #include <QPainter>
 #include <QPdfWriter>
+#include <QSaveFile>
 #include <QScopeGuard>
 
 namespace {
@@ -26,7 +28,27 @@ KvReportPrinter::~KvReportPrinter() = default;
 
 bool KvReportPrinter::print(const QString &fileName)
 {
-    QPdfWriter writer(fileName);
+    // A report of that name stays until the new one is complete: a print may be cancelled, and disks are full
+    // at times. Nothing can take the place of a pipe or a device.
+    const QFileInfo target(fileName);
+    QSaveFile file(fileName);
+    file.setDirectWriteFallback(true);
+    if ((target.exists() && !target.isFile()) || !file.open(QIODevice::WriteOnly)) {
+        QPdfWriter writer(fileName);
+        return printTo(writer);
+    }
+    {
+        QPdfWriter writer(&file);
+        if (!printTo(writer)) {
+            file.cancelWriting();
+            return false;
+        }
+    }
+    return file.commit();
+}
+
+bool KvReportPrinter::printTo(QPdfWriter &writer)
+{
     writer.setResolution(kResolution);
     writer.setPageMargins(QMarginsF(0, 0, 0, 0));
     // Until the last page is painted: views of the template keep their hands off the pieces meanwhile.

@@ -30,8 +30,8 @@ public:
     void setProgress(KvPrintProgress *progress) { m_progress = progress; }
 
     /**
-     * False when painting into the file could not begin, as when it cannot be opened for writing, and when
-     * the progress was cancelled; the pages before that are in the file then.
+     * False when painting into the file could not begin, as when it cannot be opened for writing, when the
+     * progress was cancelled, and when the disk is full; a file that was there is as it was then.
      */
     bool print(const QString &fileName);
 
@@ -41,6 +41,7 @@ private:
     void layOut();
     void layOutNodes();
     QRect startPage();
+    bool printTo(QPdfWriter &writer);
     bool render(QPdfWriter &writer);
     void reportProgress(int done) const;
 

@@ -122,6 +122,7 @@ private slots:
     void printOfAVisibleWindowBringsTheBlocksBack();
     void aFailedPrintIsTold_data();
     void aFailedPrintIsTold();
+    void aCancelledPrintLeavesNothing_data();
     void aCancelledPrintLeavesNothing();
 
     void closeOfAnUnmodifiedTemplateNeverAsks();
@@ -922,8 +923,16 @@ void KvTemplatesEditorWindowTest::aFailedPrintIsTold()
     QVERIFY(editor.templateModel()->isModified());
 }
 
+void KvTemplatesEditorWindowTest::aCancelledPrintLeavesNothing_data()
+{
+    QTest::addColumn<bool>("isThereBefore");
+    QTest::newRow("new file") << false;
+    QTest::newRow("file that was there") << true;
+}
+
 void KvTemplatesEditorWindowTest::aCancelledPrintLeavesNothing()
 {
+    QFETCH(bool, isThereBefore);
     FakeMeasurements measurements;
     FakeEditor editor(measurements.kernelData());
     QVERIFY(show(editor));
@@ -942,11 +951,17 @@ void KvTemplatesEditorWindowTest::aCancelledPrintLeavesNothing()
             QTest::qSleep(KvPrintProgressDialog::DefaultShowDelay / 2);
     });
     const QString path = newPath("report.pdf");
+    if (isThereBefore) {
+        QFile before(path);
+        QVERIFY(before.open(QIODevice::WriteOnly) && before.write("before") == 6);
+    }
     const FileDialogAnswerer dialogs(path);
     const MessageBoxAnswerer boxes;
     editor.slotPrintReport();
     QCOMPARE(boxes.boxes().size(), 0);
-    QVERIFY(!QFile::exists(path));
+    QFile after(path);
+    QCOMPARE(after.open(QIODevice::ReadOnly), isThereBefore);
+    QCOMPARE(after.readAll(), isThereBefore ? QByteArray("before") : QByteArray());
     QVERIFY2(painted > 1 && painted < 10, qPrintable(QString::number(painted)));
     QVERIFY(isOnPage(editor, node));
     QVERIFY(!QApplication::overrideCursor());

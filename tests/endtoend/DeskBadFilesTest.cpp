@@ -206,7 +206,7 @@ void DeskBadFilesTest::isToldOnce_data()
 
     struct Row
     {
-        const char *title;
+        QByteArray title;
         QString name;
         QByteArray bytes;
         qint64 size;
@@ -214,8 +214,9 @@ void DeskBadFilesTest::isToldOnce_data()
         QString reason;
     };
     QVector<Row> rows;
-    const auto add = [&rows](const char *title, const char *name, const QByteArray &bytes, const char *reason,
-                             KvDeskActions::Id action = KvDeskActions::OpenImage, qint64 size = 0) {
+    const auto add = [&rows](const QByteArray &title, const char *name, const QByteArray &bytes,
+                             const char *reason, KvDeskActions::Id action = KvDeskActions::OpenImage,
+                             qint64 size = 0) {
         rows.append({title, QString::fromLatin1(name), bytes, qMax<qint64>(size, bytes.size()), action,
                      QString::fromLatin1(reason)});
     };
@@ -254,7 +255,7 @@ void DeskBadFilesTest::isToldOnce_data()
         undecodable);
     add("TIFF with a directory behind the end", "nowhere.tif", tiffWithoutDirectory(), undecodable);
     for (const int percent : {1, 30, 60, 99})
-        add(qPrintable(QStringLiteral("session cut at %1 %").arg(percent)), "cut.json",
+        add("session cut at " + QByteArray::number(percent) + " %", "cut.json",
             session.left(session.size() * percent / 100), "cut.json", KvDeskActions::OpenSession);
     add("session of noise", "noise.json", randomBytes(5000), "noise.json", KvDeskActions::OpenSession);
     add("table of noise", "noise.csv", randomBytes(5000), "noise.csv", KvDeskActions::ImportTable);

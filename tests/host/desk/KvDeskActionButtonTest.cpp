@@ -11,6 +11,8 @@ class KvDeskActionButtonTest : public StatReportTest
 
 private slots:
     void followsItsAction();
+    void showsNoLetterOfAShortcut_data();
+    void showsNoLetterOfAShortcut();
     void heldBack();
 };
 
@@ -29,6 +31,27 @@ void KvDeskActionButtonTest::followsItsAction()
     action.setToolTip(QStringLiteral("Why not"));
     QVERIFY(!button.isEnabled());
     QCOMPARE(button.toolTip(), QStringLiteral("Why not"));
+}
+
+void KvDeskActionButtonTest::showsNoLetterOfAShortcut_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QString>("shown");
+    QTest::newRow("none") << QStringLiteral("Line") << QStringLiteral("Line");
+    QTest::newRow("inside") << QStringLiteral("Open &image...") << QStringLiteral("Open image");
+    QTest::newRow("behind") << QString::fromUtf8("\u753b\u50cf\u3092\u958b\u304f(&I)...")
+                            << QString::fromUtf8("\u753b\u50cf\u3092\u958b\u304f");
+    QTest::newRow("behind a blank") << QStringLiteral("Text (&T)") << QStringLiteral("Text");
+}
+
+void KvDeskActionButtonTest::showsNoLetterOfAShortcut()
+{
+    QFETCH(QString, text);
+    QFETCH(QString, shown);
+    QAction action(text, nullptr);
+    const KvDeskActionButton button(&action);
+    QCOMPARE(button.text(), shown);
+    QCOMPARE(button.accessibleName(), shown);
 }
 
 void KvDeskActionButtonTest::heldBack()

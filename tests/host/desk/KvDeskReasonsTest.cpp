@@ -20,6 +20,8 @@
 #include <QMenu>
 #include <QTimer>
 
+#include <algorithm>
+
 /** Whatever cannot be used says why, whatever is open. */
 class KvDeskReasonsTest : public StatReportTest
 {
@@ -161,6 +163,14 @@ void KvDeskReasonsTest::look(QWidget *window)
 {
     for (const QMenu *const menu : window->findChildren<QMenu *>())
         emit const_cast<QMenu *>(menu)->aboutToShow();
+    for (const QMenu *const menu : window->findChildren<QMenu *>()) {
+        const QList<QAction *> actions = menu->actions();
+        const bool hasDisabled = std::any_of(actions.begin(), actions.end(), [](const QAction *action) {
+            return !action->isEnabled() && !action->isSeparator();
+        });
+        if (hasDisabled && !menu->toolTipsVisible() && !menu->title().isEmpty())
+            m_silent.append(QStringLiteral("menu ") + menu->title());
+    }
     for (const QAction *const action : window->findChildren<QAction *>())
         lookAt(action);
     for (const QWidget *const widget : window->findChildren<QWidget *>()) {

@@ -81,7 +81,7 @@ void KvDeskSelectionStatisticsTest::texts_data()
          group(QStringLiteral("Area"), M::Area, {5})},
         "Width: 10.000 μm");
     row("mean of counts", {group(QStringLiteral("Count"), M::Count, {2, 3})},
-        "n = 2, mean 2.500 pcs, SD 0.707 pcs, min 2.000 pcs, max 3.000 pcs");
+        "n = 2, mean 2.500 pcs, SD 0.707 pcs, min 2 pcs, max 3 pcs");
     row("shares", {group(QStringLiteral("Share"), M::Percentage, {25, 75})},
         "n = 2, mean 50.000 %, SD 35.355 %, min 25.000 %, max 75.000 %");
     row("angles", {group(QStringLiteral("Angle"), M::Angle, {90, 90})},

@@ -21,7 +21,8 @@ private:
         environment.insert(QStringLiteral("QT_QPA_PLATFORM"), platform);
         environment.insert(QStringLiteral("STATREPORT_SETTINGS"),
                            temporaryPath(QStringLiteral("settings.ini")));
-        environment.insert(QStringLiteral("STATREPORT_RECOVERY_DIR"), temporaryPath(QStringLiteral("recovery")));
+        environment.insert(QStringLiteral("STATREPORT_RECOVERY_DIR"),
+                           temporaryPath(QStringLiteral("recovery")));
         return environment;
     }
 };
@@ -29,18 +30,27 @@ private:
 void MeasuringDeskProgramTest::textsNeedNoDisplay_data()
 {
     QTest::addColumn<QString>("option");
+    QTest::addColumn<QString>("language");
     QTest::addColumn<QByteArray>("start");
-    QTest::newRow("help") << QStringLiteral("--help") << QByteArray("Usage: measuringdesk [OPTION...]");
-    QTest::newRow("version") << QStringLiteral("--version")
+    const QString english = QStringLiteral("C.UTF-8");
+    QTest::newRow("help") << QStringLiteral("--help") << english
+                          << QByteArray("Usage: measuringdesk [OPTION...]");
+    QTest::newRow("help in German") << QStringLiteral("--help") << QStringLiteral("de_DE.UTF-8")
+                                    << QByteArray("Aufruf: measuringdesk [OPTION...]");
+    QTest::newRow("version") << QStringLiteral("--version") << english
                              << QByteArray("measuringdesk " STATREPORT_VERSION "\n");
 }
 
 void MeasuringDeskProgramTest::textsNeedNoDisplay()
 {
     QFETCH(QString, option);
+    QFETCH(QString, language);
     QFETCH(QByteArray, start);
+    QProcessEnvironment speaking = environment(QStringLiteral("xcb:none"));
+    speaking.insert(QStringLiteral("LC_ALL"), language);
+    speaking.remove(QStringLiteral("LANGUAGE"));
     QProcess process;
-    process.setProcessEnvironment(environment(QStringLiteral("xcb:none")));
+    process.setProcessEnvironment(speaking);
     process.start(QStringLiteral(MEASURING_DESK), {option});
     QVERIFY(process.waitForFinished(30000));
     QCOMPARE(process.exitCode(), 0);

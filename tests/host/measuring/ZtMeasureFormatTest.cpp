@@ -8,6 +8,7 @@
 #include "measuring/ZtUnitSettings.h"
 
 #include <QLocale>
+#include <QTextLayout>
 
 namespace {
 
@@ -38,6 +39,8 @@ private slots:
     void convertsImportedValues_data();
     void convertsImportedValues();
     void writesADecimalPointInEveryLanguage();
+    void namesStandBeforeTheirValues_data();
+    void namesStandBeforeTheirValues();
 };
 
 void ZtMeasureFormatTest::init()
@@ -241,6 +244,38 @@ void ZtMeasureFormatTest::writesADecimalPointInEveryLanguage()
     QLocale::setDefault(before);
     QCOMPARE(texts, (QStringList{QStringLiteral("1234567.5"), QStringLiteral("1234.5"),
                                  QStringLiteral("1234.5 px")}));
+}
+
+void ZtMeasureFormatTest::namesStandBeforeTheirValues_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::newRow("Latin") << QStringLiteral("Line 1");
+    QTest::newRow("Arabic") << QString::fromUtf8("\u0645\u0633\u0627\u0641\u0629 1");
+    QTest::newRow("Arabic without a number") << QString::fromUtf8("\u0645\u0633\u0627\u0641\u0629");
+    QTest::newRow("Japanese") << QString::fromUtf8("\u76f4\u7dda 1");
+}
+
+// As the letters lie on the line, which images draw from left to right.
+void ZtMeasureFormatTest::namesStandBeforeTheirValues()
+{
+    QFETCH(QString, name);
+    const QString label = ZtMeasureFormat::named(name, QStringLiteral("20.509 mm"));
+    QTextLayout layout(label, QFont());
+    QTextOption option;
+    option.setTextDirection(Qt::LeftToRight);
+    layout.setTextOption(option);
+    layout.beginLayout();
+    const QTextLine line = layout.createLine();
+    layout.endLayout();
+    const auto middle = [&](int position) {
+        return (line.cursorToX(position) + line.cursorToX(position + 1)) / 2;
+    };
+    const int value = label.indexOf(QLatin1String("20.509"));
+    const int unit = label.indexOf(QLatin1String("mm"));
+    QVERIFY(middle(value) < middle(value + 5));
+    QVERIFY(middle(value + 5) < middle(unit));
+    for (int i = 0; i < name.size(); ++i)
+        QVERIFY2(middle(i) < middle(value), qPrintable(QString::number(i)));
 }
 
 STATREPORT_TEST_MAIN(ZtMeasureFormatTest)

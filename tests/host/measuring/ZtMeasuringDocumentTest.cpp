@@ -374,7 +374,8 @@ void ZtMeasuringDocumentTest::remembersTheRowsOfTables()
     const int type = document.importedTypes().first();
     const auto rows = [&document]() {
         QStringList result;
-        for (const ZtSessionRow &row : document.toSession().tables.first().rows)
+        const ZtSession session = document.toSession();
+        for (const ZtSessionRow &row : session.tables.first().rows)
             result.append(QStringLiteral("%1/%2/%3/%4")
                               .arg(row.id)
                               .arg(row.row)
