@@ -8,6 +8,13 @@
 #include "KvDeskNotice.h"
 
 #include <QAction>
+#include <QScreen>
+
+namespace {
+
+constexpr int besideImage = 8; ///< pixels
+
+} // namespace
 
 KvDeskCalibrationCommands::KvDeskCalibrationCommands(KvDeskActions *actions, KvDeskImageView *view,
                                                      KvDeskSession *session, KvDeskObjectEditor *editor,
@@ -35,6 +42,16 @@ void KvDeskCalibrationCommands::connectSignals()
     connect(m_calibrator, SIGNAL(signalOfferWithdrawn()), m_notice, SLOT(slotHide()));
 }
 
+// The user draws on the image while the dialog is open: it goes over the table of values.
+void KvDeskCalibrationCommands::moveBesideImage(QWidget *dialog) const
+{
+    const QRect screen = m_view->screen()->availableGeometry();
+    const QPoint corner = m_view->mapToGlobal(m_view->rect().topRight());
+    const QSize size = dialog->frameGeometry().size();
+    dialog->move(qBound(screen.left(), corner.x() + besideImage, screen.right() - size.width()),
+                 qBound(screen.top(), corner.y() + besideImage, screen.bottom() - size.height()));
+}
+
 KvDeskCalibrationDialog *KvDeskCalibrationCommands::dialog() const
 {
     return m_dialog;
@@ -46,8 +63,11 @@ void KvDeskCalibrationCommands::slotShowDialog()
         m_dialog = new KvDeskCalibrationDialog(m_calibrator, m_view->window());
         m_dialog->setAttribute(Qt::WA_DeleteOnClose);
     }
+    const bool isNew = !m_dialog->isVisible();
     m_dialog->setWindowState(m_dialog->windowState() & ~Qt::WindowMinimized);
     m_dialog->show();
+    if (isNew)
+        moveBesideImage(m_dialog);
     m_dialog->activateWindow();
 }
 

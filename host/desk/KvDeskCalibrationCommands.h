@@ -11,6 +11,7 @@ class KvDeskImageView;
 class KvDeskNotice;
 class KvDeskObjectEditor;
 class KvDeskSession;
+class QWidget;
 
 /** The commands around the calibration: the window for it, the pixel size of the image's file, which a
  * message over the image offers where it differs, and the scale bar. */
@@ -35,6 +36,8 @@ private slots:
     void slotUpdate();
 
 private:
+    void moveBesideImage(QWidget *dialog) const;
+
     void connectSignals();
 
     KvDeskActions *m_actions;

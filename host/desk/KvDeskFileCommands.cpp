@@ -425,8 +425,11 @@ bool KvDeskFileCommands::slotSaveSessionAs()
     dialog.setAcceptMode(QFileDialog::AcceptSave);
     dialog.setFileMode(QFileDialog::AnyFile);
     dialog.setDefaultSuffix(QStringLiteral("json"));
+    const QString image = m_session->document()->imagePath();
     if (!m_session->path().isEmpty())
         dialog.selectFile(m_session->path());
+    else if (!image.isEmpty())
+        dialog.selectFile(QFileInfo(image).completeBaseName() + QStringLiteral(".json"));
     QString path;
     return choose(&dialog, &path) && saveSession(path);
 }

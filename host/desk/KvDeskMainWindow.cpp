@@ -49,6 +49,7 @@
 #include <QMenuBar>
 #include <QMessageBox>
 #include <QMimeData>
+#include <QScreen>
 #include <QSplitter>
 #include <QToolBar>
 #include <QToolButton>
@@ -393,7 +394,7 @@ void KvDeskMainWindow::restoreWindow()
     ZtAppSettings::beginGroupAbsolute(QLatin1String(windowGroup));
     const auto bytes = [](const char *key) { return ZtAppSettings::value(QLatin1String(key)).toByteArray(); };
     if (!restoreGeometry(bytes(geometryKey)))
-        resize(firstSize);
+        resize(firstSize.boundedTo(screen()->availableSize()));
     restoreState(bytes(stateKey));
     m_imageSplitter->restoreState(bytes(imageSplitterKey));
     m_logSplitter->restoreState(bytes(logSplitterKey));

@@ -10,6 +10,7 @@
 #include <QLocale>
 #include <QSettings>
 #include <QStandardPaths>
+#include <QTimer>
 #include <QUrl>
 
 #include <algorithm>
@@ -22,6 +23,7 @@ const QLatin1String profilesPrefix("Profiles/");
 const QLatin1String currentProfileKey("Settings/CurrentProfile");
 
 constexpr int storageStatusCode = 1;
+constexpr int syncDelay = 1000; ///< milliseconds
 
 QString defaultStoragePath()
 {
@@ -263,6 +265,7 @@ void ZtAppSettings::setStoragePath(const QString &path)
 {
     sync();
     m_path = path;
+    m_hasSyncFailed = false;
     m_values.clear();
     m_changes.clear();
     m_unsaved.clear();
@@ -293,7 +296,8 @@ bool ZtAppSettings::sync()
             file.setValue(key, *value);
     }
     file.sync();
-    if (file.status() != QSettings::NoError) {
+    m_hasSyncFailed = file.status() != QSettings::NoError;
+    if (m_hasSyncFailed) {
         logStorageError(tr("The settings could not be saved to %1. Check that the folder is writable.")
                             .arg(QDir::toNativeSeparators(m_path)));
         return false;
@@ -331,7 +335,7 @@ void ZtAppSettings::setCurrentProfile(const QString &profile)
 
     selectProfile(profile);
     m_values.insert(currentProfileKey, profile);
-    m_unsaved.insert(currentProfileKey);
+    noteUnsaved(currentProfileKey);
     emit signalProfileChanged();
 }
 
@@ -418,7 +422,25 @@ void ZtAppSettings::store(const QString &fullKey, const QString &key, const QVar
         m_values.insert(fullKey, value);
     else
         m_values.remove(fullKey);
+    noteUnsaved(fullKey);
+}
+
+void ZtAppSettings::noteUnsaved(const QString &fullKey)
+{
     m_unsaved.insert(fullKey);
+    // A program that is killed loses the last second at most. Settings that live in memory have nowhere to
+    // go.
+    if (m_syncIsDue || m_path.isEmpty() || !QCoreApplication::instance())
+        return;
+    m_syncIsDue = true;
+    QTimer::singleShot(syncDelay, this, SLOT(slotSyncSoon()));
+}
+
+void ZtAppSettings::slotSyncSoon()
+{
+    m_syncIsDue = false;
+    if (!m_hasSyncFailed)
+        sync();
 }
 
 void ZtAppSettings::announceModified()

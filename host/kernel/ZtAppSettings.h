@@ -28,10 +28,10 @@ class QLocale;
  *  - "Settings/CurrentProfile"          the name of the current profile,
  *  - "<groups>/<key>"                   what was written in absolute groups (none of the names above).
  *
- * The file is read at the first use and written by sync() and at the application's end. Only what changed is
- * written, so that two running applications keep each other's values. A file that cannot be understood is
- * renamed to "<name>.broken" and reported to the status log; one that cannot be read is reported and left
- * alone. GUI thread only.
+ * The file is read at the first use and written by sync(), soon after a change while there is an event loop,
+ * and at the application's end. Only what changed is written, so that two running applications keep each
+ * other's values. A file that cannot be understood is renamed to "<name>.broken" and reported to the status
+ * log; one that cannot be read is reported and left alone. GUI thread only.
  */
 class ZT_KERNEL_EXPORT ZtAppSettings : public QObject
 {
@@ -92,6 +92,7 @@ signals:
 
 private slots:
     void slotAboutToQuit();
+    void slotSyncSoon();
 
 private:
     struct Change
@@ -111,6 +112,7 @@ private:
     const QString &prefix() const;
     QString fullKey(const QString &key) const;
     void store(const QString &fullKey, const QString &key, const QVariant &value);
+    void noteUnsaved(const QString &fullKey);
     void announceModified();
 
     QString m_path;
@@ -122,6 +124,8 @@ private:
     QSet<QString> m_unsaved;   ///< full keys that the file does not have yet, or still has
     bool m_loaded = false;
     bool m_writable = true;
+    bool m_syncIsDue = false;     ///< slotSyncSoon() will come
+    bool m_hasSyncFailed = false; ///< the last sync(); said once, not after every change
     QString m_programName;
     QString m_programVersion;
     QString m_vendor;

@@ -28,6 +28,15 @@ void widenColumns(const QFileDialog &dialog)
         files->header()->resizeSection(i, kColumnWidths[i]);
 }
 
+/// Of a folder that is not there, a dialog would take the last part for the name of a file.
+QString existingFolder(const QString &directory)
+{
+    QFileInfo folder(directory);
+    while (!directory.isEmpty() && !folder.isDir() && !folder.isRoot())
+        folder.setFile(folder.absolutePath());
+    return folder.filePath();
+}
+
 void setUp(QFileDialog &dialog, const KvFileQuestion &question)
 {
     dialog.setOption(QFileDialog::DontUseNativeDialog);
@@ -60,14 +69,14 @@ bool mayOverwrite(QFileDialog &dialog, const QString &path)
 
 QString openFileName(QWidget *parent, const KvFileQuestion &question)
 {
-    QFileDialog dialog(parent, question.caption, question.directory);
+    QFileDialog dialog(parent, question.caption, existingFolder(question.directory));
     setUp(dialog, question);
     return chosenFile(dialog);
 }
 
 QString saveFileName(QWidget *parent, const KvFileQuestion &question)
 {
-    QFileDialog dialog(parent, question.caption, question.directory);
+    QFileDialog dialog(parent, question.caption, existingFolder(question.directory));
     setUp(dialog, question);
     dialog.setAcceptMode(QFileDialog::AcceptSave);
     dialog.setLabelText(QFileDialog::Accept, QCoreApplication::translate("KvFileDialogs", "Save"));

@@ -25,6 +25,8 @@ private slots:
     void appendsTheSuffix();
     void openDialogLooksLikeThat();
     void saveDialogLooksLikeThat();
+    void startsInTheNearestFolder_data();
+    void startsInTheNearestFolder();
     void openReturnsTheFile();
     void cancelReturnsNothing();
     void savedNamesGetTheSuffix_data();
@@ -108,6 +110,33 @@ void KvFileDialogsTest::saveDialogLooksLikeThat()
     QCOMPARE(dialog.acceptLabel, QStringLiteral("Save"));
     QCOMPARE(dialog.suggestedName, QStringLiteral("mine.rtp"));
     QVERIFY(!dialog.isNative);
+}
+
+void KvFileDialogsTest::startsInTheNearestFolder_data()
+{
+    QTest::addColumn<QString>("missing");
+    QTest::newRow("it is there") << QString();
+    QTest::newRow("gone") << QStringLiteral("/Documents");
+    QTest::newRow("and the one above") << QStringLiteral("/Home/Documents");
+}
+
+// Else the dialog would propose the folder's name for the file.
+void KvFileDialogsTest::startsInTheNearestFolder()
+{
+    QFETCH(QString, missing);
+    KvFileQuestion asked = question();
+    asked.directory += missing;
+    QString shownFolder;
+    QString shownName;
+    QTimer::singleShot(0, qApp, [&]() {
+        auto *const dialog = qobject_cast<QFileDialog *>(QApplication::activeModalWidget());
+        shownFolder = dialog->directory().absolutePath();
+        shownName = dialog->findChild<QLineEdit *>(QStringLiteral("fileNameEdit"))->text();
+        dialog->reject();
+    });
+    QCOMPARE(KvFileDialogs::saveFileName(nullptr, asked), QString());
+    QCOMPARE(shownFolder, QDir(m_directory).absolutePath());
+    QCOMPARE(shownName, QString());
 }
 
 void KvFileDialogsTest::openReturnsTheFile()

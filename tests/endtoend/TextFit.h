@@ -132,7 +132,8 @@ private:
         const QRect field =
             combo->style()->subControlRect(QStyle::CC_ComboBox, &option, QStyle::SC_ComboBoxEditField, combo);
         // Names of files and folders may be of any length.
-        const bool isData = combo->objectName() == QLatin1String("theTemplatePath");
+        const bool isData = combo->objectName() == QLatin1String("theTemplatePath") ||
+                            combo->objectName() == QLatin1String("lookInCombo");
         for (int i = 0; i < combo->count() && !isData; ++i) {
             if (combo->itemData(i, Qt::ToolTipRole).isNull())
                 need(combo, combo->itemText(i), combo->fontMetrics().boundingRect(combo->itemText(i)).width(),

@@ -138,6 +138,7 @@ private slots:
     void whatCannotBeReadIsLeftAlone();
     void whatCannotBeWrittenStaysPending();
     void theEndOfTheApplicationWrites();
+    void changesAreWrittenSoon();
 
     void languages_data();
     void languages();
@@ -571,6 +572,20 @@ void ZtAppSettingsTest::aMissingFileIsEmpty()
     ZtAppSettings::setValue(QStringLiteral("k"), 1);
     QVERIFY(m_settings->sync());
     QVERIFY(QFile::exists(path));
+}
+
+// A program that is killed has not lost its settings.
+void ZtAppSettingsTest::changesAreWrittenSoon()
+{
+    const QString path = temporaryPath(QStringLiteral("soon.ini"));
+    m_settings->setStoragePath(path);
+    ZtAppSettings::setValue(QStringLiteral("k"), 1);
+    QVERIFY(!QFile::exists(path));
+    QTRY_VERIFY(readFile(path).contains("k=1"));
+    ZtAppSettings::setValue(QStringLiteral("k"), 2);
+    QTRY_VERIFY(readFile(path).contains("k=2"));
+    ZtAppSettings::remove(QStringLiteral("k"));
+    QTRY_VERIFY(!readFile(path).contains("k="));
 }
 
 void ZtAppSettingsTest::nothingIsWrittenWithoutAChange()

@@ -34,6 +34,8 @@ private slots:
     void clicksGoOnAfterChoosing();
     void everythingIsNamed();
     void staysInTheMiddle();
+    void fitsANarrowView_data();
+    void fitsANarrowView();
 
 private:
     KvDeskObjectId counter(int places)
@@ -214,6 +216,26 @@ void KvDeskCounterBarTest::staysInTheMiddle()
         if (viewport->width() > m_bar->width())
             QVERIFY(qAbs(m_bar->geometry().center().x() - viewport->rect().center().x()) <= 1);
     }
+}
+
+void KvDeskCounterBarTest::fitsANarrowView_data()
+{
+    QTest::addColumn<int>("width");
+    QTest::newRow("wide") << 900;
+    QTest::newRow("without the hint") << 480;
+    QTest::newRow("with a narrow list") << 340;
+}
+
+void KvDeskCounterBarTest::fitsANarrowView()
+{
+    QFETCH(int, width);
+    m_desk->view.resize(width, 240);
+    flushBar();
+    QCoreApplication::processEvents();
+    QVERIFY(m_desk->view.viewport()->rect().contains(m_bar->geometry()));
+    QVERIFY(m_bar->rect().contains(m_bar->newClassButton()->geometry()));
+    QVERIFY(m_bar->classes()->geometry().right() < m_bar->newClassButton()->x());
+    QVERIFY(m_bar->classes()->width() >= 96);
 }
 
 STATREPORT_TEST_MAIN(KvDeskCounterBarTest)

@@ -678,7 +678,7 @@ void KvDeskFileCommandsTest::largeSessionsHoldNothingUp()
 
 void KvDeskFileCommandsTest::savingCanBeCancelled()
 {
-    constexpr int rows = 200000;
+    constexpr int rows = 400000;
     QByteArray table = "Name,Length [mm]\n";
     for (int i = 0; i < rows; ++i)
         table += "A" + QByteArray::number(i) + ",1.5\n";
