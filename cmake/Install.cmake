@@ -46,6 +46,14 @@ install(TARGETS ${STATREPORT_HOST_LIBRARIES} EXPORT StatReportHostTargets
   LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT host NAMELINK_COMPONENT sdk
   INCLUDES DESTINATION ${STATREPORT_SDK_INCLUDE_DIR})
 
+# Where Debian's packages have their licence.
+foreach(package libstatreporthost${PROJECT_VERSION_MAJOR}:host measuringdesk:desk statreport-plugin:plugin libstatreporthost-dev:sdk)
+  string(REPLACE ":" ";" package ${package})
+  list(GET package 0 package_name)
+  list(GET package 1 component)
+  install(FILES LICENSE RENAME copyright DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/${package_name} COMPONENT ${component})
+endforeach()
+
 # --- Component desk
 install(TARGETS ${STATREPORT_PROGRAMS} RUNTIME DESTINATION ${STATREPORT_PROGRAM_DIR} COMPONENT desk)
 foreach(program ${STATREPORT_PROGRAMS})

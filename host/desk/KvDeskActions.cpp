@@ -89,7 +89,7 @@ constexpr Definition definitions[] = {
     {KvDeskActions::TakeSnapshot, QT_TRANSLATE_NOOP("KvDeskActions", "&Take snapshot"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Save the image to the gallery"), "snapshot", "F9", false},
     {KvDeskActions::SnapshotMeasurements, QT_TRANSLATE_NOOP("KvDeskActions", "Snapshots &with measurements"),
-     QT_TRANSLATE_NOOP("KvDeskActions", "Draw the measured objects on snapshots"), nullptr, "Shift+F9", true},
+     QT_TRANSLATE_NOOP("KvDeskActions", "Draw the measured objects on snapshots"), "labels", "Shift+F9", true},
     {KvDeskActions::Freeze, QT_TRANSLATE_NOOP("KvDeskActions", "&Freeze"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Freeze the live image"), "freeze", "F12", true},
     {KvDeskActions::ZoomIn, QT_TRANSLATE_NOOP("KvDeskActions", "Zoom &in"),
