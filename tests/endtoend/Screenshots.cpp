@@ -6,11 +6,13 @@
 #include "KvDeskGallerySettings.h"
 #include "KvDeskGalleryView.h"
 #include "KvDeskImageView.h"
+#include "KvDeskLanguages.h"
 #include "KvDeskSelection.h"
 #include "KvDeskSettingsDialog.h"
 #include "KvDeskSourceCommands.h"
 #include "KvDeskTheme.h"
 #include "KvDeskToolColumn.h"
+#include "KvDeskTranslation.h"
 #include "RunningDesk.h"
 
 #include "kernel/ZtAppSettings.h"
@@ -29,17 +31,20 @@
 #include <cstdio>
 #include <set>
 
-/** Photographs every window of the Desk and of the plug-in in it, in one theme, into a folder of PNG files.
+/**
+ * Photographs every window of the Desk and of the plug-in in it, in one theme and language, into a folder of
+ * PNG files.
  */
 class Screenshots
 {
 public:
-    Screenshots(const QString &examples, const QString &theme, const QString &folder)
+    Screenshots(const QString &examples, const QString &theme, const QString &folder, const QString &language)
         : m_examples(QDir(examples).absolutePath())
         , m_theme(theme)
         , m_folder(folder)
     {
         ZtAppSettings::getInstance()->setStoragePath(QString());
+        setLanguage(language);
         KvDeskTheme::store(theme);
         KvDeskGallerySettings::setSnapshotsFolder(m_examples + QStringLiteral("/pictures"));
         KvDeskFirstTemplates::offer(m_examples + QStringLiteral("/templates"));
@@ -56,6 +61,16 @@ public:
     }
 
 private:
+    // As on a system in that language. The plug-in reads the setting.
+    void setLanguage(const QString &language)
+    {
+        KvDeskLanguages::storeChoice(language);
+        QLocale::setDefault(KvDeskLanguages::localeOf(language));
+        m_translation = std::make_unique<KvDeskTranslation>(language);
+        if (!m_translation->isLoaded())
+            std::fprintf(stderr, "screenshots: there is no translation to %s\n", qPrintable(language));
+    }
+
     static void settle() { QTest::qWait(400); }
 
     void take(QWidget *widget, const QString &name) const
@@ -187,13 +202,14 @@ private:
     QString m_examples;
     QString m_theme;
     QString m_folder;
+    std::unique_ptr<KvDeskTranslation> m_translation;
     std::unique_ptr<RunningDesk> m_desk;
 };
 
 int main(int argc, char **argv)
 {
-    if (argc != 4) {
-        std::fputs("Usage: Screenshots EXAMPLES Dark|Light FOLDER\n", stderr);
+    if (argc != 4 && argc != 5) {
+        std::fputs("Usage: Screenshots EXAMPLES Dark|Light FOLDER [LANGUAGE]\n", stderr);
         return 2;
     }
     QCoreApplication::setAttribute(Qt::AA_Use96Dpi);
@@ -204,6 +220,7 @@ int main(int argc, char **argv)
                                   QStringLiteral("StatReport"));
     const QString folder = QString::fromLocal8Bit(argv[3]);
     QDir().mkpath(folder);
-    Screenshots(QString::fromLocal8Bit(argv[1]), QString::fromLocal8Bit(argv[2]), folder).takeAll();
+    const QString language = argc == 5 ? QString::fromLocal8Bit(argv[4]) : QStringLiteral("English");
+    Screenshots(QString::fromLocal8Bit(argv[1]), QString::fromLocal8Bit(argv[2]), folder, language).takeAll();
     return 0;
 }
