@@ -161,14 +161,10 @@ void DeskLiveReportTest::openCamera()
                  qPrintable(bar()->status()->text()));
 }
 
-// Beside the main window: both have to be used.
 void DeskLiveReportTest::openEditor()
 {
     m_user.click(m_desk->button("theEditorButton"));
-    QTRY_VERIFY(m_desk->editor() && m_desk->editor()->isVisible());
-    QVERIFY(QTest::qWaitForWindowExposed(m_desk->editor()));
-    m_desk->editor()->move(860, 0);
-    m_desk->editor()->resize(740, 900);
+    QVERIFY(m_desk->placeEditor());
     m_user.activate(m_desk->editor());
     QTest::qWait(100);
 }

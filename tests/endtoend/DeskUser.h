@@ -60,6 +60,15 @@ public:
             dragOffscreen(from, start, to, end);
     }
 
+    /** The same within one widget that starts no drag and drop, such as for drawing on it. */
+    void stroke(QWidget *widget, const QPoint &start, const QPoint &end)
+    {
+        if (isReal())
+            dragReally(widget->mapToGlobal(start), widget->mapToGlobal(end));
+        else
+            strokeOffscreen(widget, start, end);
+    }
+
     void type(const QString &text)
     {
         if (isReal()) {
@@ -71,10 +80,15 @@ public:
     }
     void press(int key, Qt::KeyboardModifiers modifiers = Qt::NoModifier)
     {
-        if (isReal())
+        if (isReal()) {
             run({QStringLiteral("key"), keyName(key, modifiers)});
-        else
-            QTest::keyClick(keyWindow(), static_cast<Qt::Key>(key), modifiers);
+            return;
+        }
+        // The key may close the window that gets it.
+        const QPointer<QWindow> window = keyWindow();
+        QTest::keyPress(window, static_cast<Qt::Key>(key), modifiers);
+        if (window)
+            QTest::keyRelease(window, static_cast<Qt::Key>(key), modifiers);
     }
 
 private:
@@ -151,6 +165,15 @@ private:
         arguments << QStringLiteral("sleep") << QStringLiteral("0.2") << QStringLiteral("mouseup")
                   << QStringLiteral("1");
         run(arguments);
+    }
+
+    static void strokeOffscreen(QWidget *widget, const QPoint &start, const QPoint &end)
+    {
+        QWindow *window = windowOf(widget);
+        QTest::mousePress(window, Qt::LeftButton, Qt::NoModifier, inWindow(widget, start));
+        for (int i = 1; i <= kSteps; ++i)
+            QTest::mouseMove(window, inWindow(widget, between(start, end, i)));
+        QTest::mouseRelease(window, Qt::LeftButton, Qt::NoModifier, inWindow(widget, end));
     }
 
     /** Keeps what a drag carries: on the off-screen platform drags end as soon as they begin. */

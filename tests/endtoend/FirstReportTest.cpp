@@ -80,16 +80,7 @@ void FirstReportTest::fromTheStartPageToAReport()
     // The coin is 2.25 cm across, with its middle at (360, 228).
     m_user.press(Qt::Key_L);
     QTRY_VERIFY(window->actions()->action(KvDeskActions::LineTool)->isChecked());
-    const QPoint left = inView(180, 228);
-    const QPoint right = inView(540, 228);
-    if (DeskUser::isReal()) {
-        m_user.drag(view->viewport(), left, view->viewport(), right);
-    } else {
-        QTest::mousePress(view->viewport(), Qt::LeftButton, Qt::NoModifier, left);
-        QTest::mouseMove(view->viewport(), inView(300, 228));
-        QTest::mouseMove(view->viewport(), right);
-        QTest::mouseRelease(view->viewport(), Qt::LeftButton, Qt::NoModifier, right);
-    }
+    m_user.stroke(view->viewport(), inView(180, 228), inView(540, 228));
     QTRY_COMPARE(window->session()->objectCount(), 1);
     const QAbstractItemModel *const values = window->valueTable()->findChild<KvDeskTableView *>()->model();
     QTRY_COMPARE(values->rowCount(), 1);

@@ -16,6 +16,7 @@
 #include <QPushButton>
 #include <QTextEdit>
 #include <QToolButton>
+#include <QtTest>
 
 #include <algorithm>
 #include <memory>
@@ -64,6 +65,17 @@ public:
 
     // The editor; null as long as there is none.
     QWidget *editor() const { return topLevel("KvReportTemplatesEditor"); }
+    /** Waits for the editor and puts it beside a main window of 860 pixels, as both have to be used; false
+     * when it does not come. */
+    bool placeEditor() const
+    {
+        if (!QTest::qWaitFor([this]() { return editor() && editor()->isVisible(); }) ||
+            !QTest::qWaitForWindowExposed(editor()))
+            return false;
+        editor()->move(860, 0);
+        editor()->resize(740, 900);
+        return true;
+    }
     QWidget *statisticsWindow() const { return topLevel("KvStatisticsWindow"); }
     QPushButton *editorButton(const char *name) const
     {

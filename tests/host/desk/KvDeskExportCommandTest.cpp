@@ -3,48 +3,14 @@
 
 #include "DeskLog.h"
 #include "DeskValues.h"
+#include "ExportDialogAnswerer.h"
 #include "FileDialogAnswerer.h"
-#include "KvDeskExportDialog.h"
 #include "KvDeskFileCommands.h"
 #include "kernel/ZtAppSettings.h"
 #include "support/MessageBoxAnswerer.h"
 
 #include <QAction>
-#include <QComboBox>
 #include <QProgressDialog>
-
-namespace {
-
-/** While it lives, answers the dialog of the export: takes it with a layout, or cancels it. */
-class ExportDialogAnswerer
-{
-public:
-    explicit ExportDialogAnswerer(int layout)
-        : m_layout(layout)
-    {
-        QObject::connect(&m_timer, &QTimer::timeout, &m_timer, [this]() { answer(); });
-        m_timer.start(5);
-    }
-
-private:
-    void answer()
-    {
-        auto *const dialog = qobject_cast<KvDeskExportDialog *>(QApplication::activeModalWidget());
-        if (!dialog || !dialog->isVisible())
-            return;
-        if (m_layout < 0) {
-            dialog->reject();
-            return;
-        }
-        dialog->layoutBox()->setCurrentIndex(m_layout);
-        dialog->accept();
-    }
-
-    int m_layout;
-    QTimer m_timer;
-};
-
-} // namespace
 
 class KvDeskExportCommandTest : public StatReportTest
 {
