@@ -70,7 +70,7 @@ void KvDeskActionsTest::commands_data()
         "Measure with the pixel size that the image's file states", false);
     row(A::TakeSnapshot, "&Take snapshot", "Save the image to the gallery (F9)");
     row(A::SnapshotMeasurements, "Snapshots &with measurements",
-        "Draw the measured objects on snapshots (Shift+F9)", false, true);
+        "Draw the measured objects on snapshots (Shift+F9)", true, true);
     row(A::Freeze, "&Freeze", "Freeze the live image (F12)", true, true);
     row(A::ZoomIn, "Zoom &in", "Zoom in (Ctrl++)");
     row(A::ZoomOut, "Zoom &out", "Zoom out (Ctrl+-)");
