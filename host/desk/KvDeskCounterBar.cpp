@@ -49,7 +49,8 @@ void KvDeskCounterBar::createWidgets()
 {
     auto *const label = new QLabel(tr("Clicks count for"), this);
     m_classes = new QComboBox(this);
-    // As wide as may be whatever it lists, which changes with every click; narrower only where there is no room.
+    // As wide as may be whatever it lists, which changes with every click; narrower only where there is no
+    // room.
     m_classes->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
     m_classes->setMinimumContentsLength(classesWidth);
     m_classes->setMinimumWidth(leastClassesWidth);

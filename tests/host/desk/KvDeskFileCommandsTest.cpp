@@ -462,8 +462,7 @@ void KvDeskFileCommandsTest::writeProtectedFile()
     QFile::setPermissions(path, QFile::ReadOwner | QFile::ReadGroup | QFile::ReadOther);
     QFile::setPermissions(folder, QFile::Permissions(0x7777));
     const UnprivilegedUser user;
-    if (!user.isUnprivileged())
-        QSKIP("needs a user whom permissions stop");
+    QVERIFY2(user.isUnprivileged(), "needs a user whom permissions stop");
     const MessageBoxAnswerer answerer(button);
     const FileDialogAnswerer dialogs(folder + QStringLiteral("/elsewhere.json"));
     QCOMPARE(m_commands->slotSaveSession(), isSaved);
