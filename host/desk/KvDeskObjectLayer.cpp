@@ -16,6 +16,11 @@ constexpr int lineRoom = 9;        ///< pixels by which lines and markers reach 
 constexpr double roughStays = 0.8; ///< of the most objects in full
 constexpr int mostRectangles = 48; ///< beyond that it is quicker to draw everything between them, too
 
+QSize devicePixels(const QSize &size, double pixelRatio)
+{
+    return QSize(qCeil(size.width() * pixelRatio), qCeil(size.height() * pixelRatio));
+}
+
 bool isWhole(double number)
 {
     return std::abs(number - std::round(number)) < 1e-6;
@@ -56,9 +61,8 @@ void KvDeskObjectLayer::settle(const KvDeskObjectId &object, const QRectF &scene
 
 void KvDeskObjectLayer::prepare(const QTransform &toView, const QSize &size, double pixelRatio)
 {
-    const QSize deviceSize(qCeil(size.width() * pixelRatio), qCeil(size.height() * pixelRatio));
-    const bool isSameImage = m_image.size() == deviceSize && m_image.devicePixelRatio() == pixelRatio;
-    if (!isSameImage) {
+    const QSize deviceSize = devicePixels(size, pixelRatio);
+    if (m_image.size() != deviceSize || m_image.devicePixelRatio() != pixelRatio) {
         m_image = QImage(deviceSize, QImage::Format_ARGB32_Premultiplied);
         m_image.setDevicePixelRatio(pixelRatio);
         m_isStale = true;
@@ -70,6 +74,28 @@ void KvDeskObjectLayer::prepare(const QTransform &toView, const QSize &size, dou
     if (m_isStale)
         m_dirty = QRect(QPoint(), size);
     m_isStale = false;
+}
+
+void KvDeskObjectLayer::sharpen()
+{
+    if (m_isStretched)
+        invalidate();
+}
+
+bool KvDeskObjectLayer::isStretchable(const QTransform &toView, const QSize &size, double pixelRatio) const
+{
+    const bool isOtherScale = toView.m11() != m_toView.m11() || toView.m22() != m_toView.m22();
+    return m_isRough && !m_isStale && isOtherScale && m_image.devicePixelRatio() == pixelRatio &&
+           m_image.size() == devicePixels(size, pixelRatio);
+}
+
+void KvDeskObjectLayer::drawStretched(QPainter *painter, const QTransform &toView) const
+{
+    painter->save();
+    painter->setRenderHint(QPainter::SmoothPixmapTransform, false);
+    painter->setWorldTransform(m_toView.inverted() * toView);
+    painter->drawImage(QPointF(), m_image);
+    painter->restore();
 }
 
 bool KvDeskObjectLayer::scroll(const QTransform &toView)
@@ -98,6 +124,11 @@ bool KvDeskObjectLayer::scroll(const QTransform &toView)
 void KvDeskObjectLayer::draw(QPainter *painter, const KvDeskObjectIndex &index, const QTransform &toView,
                              const QSize &size, double pixelRatio)
 {
+    m_isStretched = isStretchable(toView, size, pixelRatio);
+    if (m_isStretched) {
+        drawStretched(painter, toView);
+        return;
+    }
     prepare(toView, size, pixelRatio);
     if (!m_dirty.isEmpty())
         chooseRoughness(index);

@@ -19,6 +19,9 @@ class QPainter;
  * Where very many objects are in view they are drawn roughly, see KvDeskRoughObjects. They stay so while the
  * user pauses: drawing them in full would take seconds of this thread, and nobody could tell one line from
  * the other.
+ *
+ * Drawing them even roughly takes longer than a step of zooming may. While the scale changes their picture is
+ * stretched, until it is sharpened.
  */
 class KvDeskObjectLayer
 {
@@ -45,12 +48,19 @@ public:
     static constexpr int mostPointsInFull = 10000;
     bool isRough() const { return m_isRough; }
 
+    /** Whether a stretched picture of another scale was drawn last. */
+    bool isStretched() const { return m_isStretched; }
+    /** The next drawing shows the objects as they are, however long that takes. */
+    void sharpen();
+
     /** Objects drawn since the layer was made, to count the work. */
     qint64 drawnObjects() const { return m_drawnObjects; }
 
 private:
     void prepare(const QTransform &toView, const QSize &size, double pixelRatio);
     bool scroll(const QTransform &toView);
+    bool isStretchable(const QTransform &toView, const QSize &size, double pixelRatio) const;
+    void drawStretched(QPainter *painter, const QTransform &toView) const;
     void chooseRoughness(const KvDeskObjectIndex &index);
     QRectF areaOf(const QRectF &rect) const;
     void redraw(const KvDeskObjectIndex &index, const QRect &rect);
@@ -64,5 +74,6 @@ private:
     qint64 m_drawnObjects = 0;
     bool m_isStale = true; ///< all of it is out of date
     bool m_isRough = false;
+    bool m_isStretched = false;
     KvDeskRoughObjects m_rough; ///< of the last part that was drawn roughly
 };

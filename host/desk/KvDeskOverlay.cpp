@@ -18,6 +18,7 @@ namespace {
 
 constexpr int mostLifted = 200;        ///< beyond that they are drawn with the others
 constexpr int mostSelectedLabels = 50; ///< where there is no room for the labels of all objects
+constexpr int zoomPause = 120;         ///< ms; the steps of a turning wheel follow each other faster
 constexpr double lineRoom = 9.0;       ///< pixels by which lines and markers reach beyond an object's bounds
 
 KvDeskObjectShape shapeOf(const KvDeskObjectId &object)
@@ -42,6 +43,9 @@ KvDeskOverlay::KvDeskOverlay(QObject *parent)
     connect(&m_places, SIGNAL(signalChanged(int,int,QRectF,QRectF)), this,
                               SLOT(slotPlaceChanged(int,int,QRectF,QRectF)));
     connect(&m_places, SIGNAL(signalReset()), this, SLOT(slotReset()));
+    m_sharpenTimer.setSingleShot(true);
+    m_sharpenTimer.setInterval(zoomPause);
+    connect(&m_sharpenTimer, SIGNAL(timeout()), this, SLOT(slotSharpen()));
 }
 
 void KvDeskOverlay::setPainter(const ZtObjectsPainter *painter)
@@ -98,6 +102,12 @@ void KvDeskOverlay::slotSelectionChanged()
     slotLabelsChanged();
 }
 
+void KvDeskOverlay::slotSharpen()
+{
+    m_objects.sharpen();
+    emit signalUpdated();
+}
+
 void KvDeskOverlay::settle()
 {
     const QSet<KvDeskObjectId> lifted = m_objects.lifted();
@@ -110,6 +120,8 @@ void KvDeskOverlay::settle()
 void KvDeskOverlay::draw(QPainter *painter, const QTransform &toView, const QSize &size, double pixelRatio)
 {
     m_objects.draw(painter, m_places.index(), toView, size, pixelRatio);
+    if (m_objects.isStretched() && (toView != m_topTransform || !m_sharpenTimer.isActive()))
+        m_sharpenTimer.start();
     const QSize deviceSize(qCeil(size.width() * pixelRatio), qCeil(size.height() * pixelRatio));
     if (m_top.size() != deviceSize || m_top.devicePixelRatio() != pixelRatio) {
         m_top = QImage(deviceSize, QImage::Format_ARGB32_Premultiplied);

@@ -6,6 +6,7 @@
 
 #include <QObject>
 #include <QPointer>
+#include <QTimer>
 
 class KvDeskSelection;
 class ZtObjectsPainter;
@@ -40,6 +41,7 @@ private slots:
     void slotPlaceChanged(int aType, int aId, QRectF aBefore, QRectF aAfter);
     void slotReset();
     void slotSelectionChanged();
+    void slotSharpen();
 
 private:
     bool isLiftable(const KvDeskObjectId &object) const;
@@ -58,4 +60,5 @@ private:
     QImage m_top; ///< selected objects and labels
     QTransform m_topTransform;
     bool m_isTopStale = true;
+    QTimer m_sharpenTimer;
 };

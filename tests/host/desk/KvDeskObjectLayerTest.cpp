@@ -30,6 +30,7 @@ private slots:
     void manyObjectsAreRough();
     void manyPlacesOfACounterAreRough();
     void roughnessFollowsTheView();
+    void stretchedPicturesTurnBackIntoSharpOnes();
     void oneObjectMoreRedrawsEverythingOnce();
     void picturesDrawnAnewAreInFull();
     void roughPicturesAreKept();
@@ -178,10 +179,34 @@ void KvDeskObjectLayerTest::roughnessFollowsTheView()
     draw(&layer);
     QVERIFY(layer.isRough());
     const QTransform enlarged = QTransform::fromScale(4.0, 4.0);
+    QVERIFY(draw(&layer, enlarged) != drawAnew(enlarged));
+    QVERIFY(layer.isStretched());
+    layer.sharpen();
     QCOMPARE(draw(&layer, enlarged), drawAnew(enlarged));
+    QVERIFY(!layer.isStretched());
     QVERIFY(!layer.isRough());
     draw(&layer);
     QVERIFY(layer.isRough());
+}
+
+void KvDeskObjectLayerTest::stretchedPicturesTurnBackIntoSharpOnes()
+{
+    addCircles(KvDeskObjectLayer::mostInFull + 1);
+    KvDeskObjectLayer layer;
+    const QImage before = draw(&layer);
+    const qint64 drawn = layer.drawnObjects();
+    QVERIFY(draw(&layer, QTransform::fromScale(0.5, 0.5)) != before);
+    QVERIFY(layer.isStretched());
+    QCOMPARE(draw(&layer), before);
+    QVERIFY(!layer.isStretched());
+    QCOMPARE(layer.drawnObjects(), drawn);
+    // Nothing is out of date.
+    layer.sharpen();
+    QCOMPARE(draw(&layer), before);
+    QCOMPARE(layer.drawnObjects(), drawn);
+    // Another size of the view's pixels is no zooming.
+    QCOMPARE(draw(&layer, QTransform::fromScale(0.5, 0.5), 2.0),
+             drawAnew(QTransform::fromScale(0.5, 0.5), 2.0));
 }
 
 void KvDeskObjectLayerTest::oneObjectMoreRedrawsEverythingOnce()

@@ -8,6 +8,7 @@
 #include "measuring/ZtObjectsPainter.h"
 
 #include <QPainter>
+#include <QSignalSpy>
 
 namespace {
 
@@ -30,6 +31,8 @@ private slots:
     void labelsCanBeHidden();
     void manySelectedObjectsAreRough();
     void noMoreTextsThanAnybodyReads();
+    void zoomingStretchesManyObjects();
+    void zoomingDrawsFewObjects();
 
 private:
     static QImage draw(KvDeskOverlay *overlay, const QTransform &toView, double ratio = 1.0)
@@ -260,6 +263,48 @@ void KvDeskOverlayTest::noMoreTextsThanAnybodyReads()
     QVERIFY(shown != drawAnew(nullptr, QTransform()));
     const QImage again = draw(&overlay, QTransform::fromTranslate(-1.0, 0.0));
     QVERIFY(again != shown);
+}
+
+void KvDeskOverlayTest::zoomingStretchesManyObjects()
+{
+    ZtMeasuringDocument document;
+    for (int i = 0; i <= KvDeskObjectLayer::mostInFull; ++i) {
+        const QPointF start(4 + 8 * (i % 48), 4 + 8 * (i / 48));
+        document.addObject(ZtDrawnType::Line, polygon({start, start + QPointF(4, 0)}));
+    }
+    KvDeskOverlay overlay;
+    overlay.setPainter(document.objectsPainter());
+    draw(&overlay, QTransform());
+    QSignalSpy updated(&overlay, SIGNAL(signalUpdated()));
+    const qint64 before = overlay.drawnObjects();
+    QTransform toView;
+    for (int step = 0; step < 5; ++step) {
+        toView.scale(1.1, 1.1);
+        const QImage stretched = draw(&overlay, toView);
+        // The first line, which has grown.
+        QVERIFY(stretched.pixelColor(toView.map(QPoint(6, 4))).alpha() > 0);
+    }
+    QCOMPARE(overlay.drawnObjects(), before);
+
+    // What changes meanwhile is seen as soon as the picture is sharp again.
+    document.addObject(ZtDrawnType::Line, polygon({{4, 200}, {390, 200}}));
+    updated.clear();
+    QVERIFY(updated.wait(5000));
+    QCOMPARE(updated.count(), 1);
+    QVERIFY(draw(&overlay, toView) == drawAnew(document.objectsPainter(), toView));
+    QVERIFY(overlay.drawnObjects() > before);
+    QVERIFY(!updated.wait(500));
+}
+
+void KvDeskOverlayTest::zoomingDrawsFewObjects()
+{
+    ZtMeasuringDocument document;
+    addGrid(&document);
+    KvDeskOverlay overlay;
+    overlay.setPainter(document.objectsPainter());
+    draw(&overlay, QTransform());
+    const QTransform toView = QTransform::fromScale(1.1, 1.1);
+    QVERIFY(draw(&overlay, toView) == drawAnew(document.objectsPainter(), toView));
 }
 
 STATREPORT_TEST_MAIN(KvDeskOverlayTest)
