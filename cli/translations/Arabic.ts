@@ -139,7 +139,7 @@
     </message>
     <message>
         <source>--format must be %1, not &quot;%2&quot;</source>
-        <translation>يجب أن يكون --format هو %1، لا «%2»</translation>
+        <translation>يجب أن يكون ‎--format هو %1، لا «%2»</translation>
     </message>
     <message>
         <source>text, csv or json</source>
@@ -151,19 +151,19 @@
     </message>
     <message>
         <source>--group-by must be object or measurement, not &quot;%1&quot;</source>
-        <translation>يجب أن يكون --group-by هو object أو measurement، لا «%1»</translation>
+        <translation>يجب أن يكون ‎--group-by هو object أو measurement، لا «%1»</translation>
     </message>
     <message>
         <source>--digits must be a number from 0 to 15, not &quot;%1&quot;</source>
-        <translation>يجب أن يكون --digits عددًا من 0 إلى 15، لا «%1»</translation>
+        <translation>يجب أن يكون ‎--digits عددًا من 0 إلى 15، لا «%1»</translation>
     </message>
     <message>
         <source>give the measurements: either --session or --table</source>
-        <translation>حدد القياسات: إما --session أو --table</translation>
+        <translation>حدد القياسات: إما ‎--session أو ‎--table</translation>
     </message>
     <message>
         <source>--decimal must be point or comma, not &quot;%1&quot;</source>
-        <translation>يجب أن يكون --decimal هو point أو comma، لا «%1»</translation>
+        <translation>يجب أن يكون ‎--decimal هو point أو comma، لا «%1»</translation>
     </message>
     <message>
         <source>the template is missing</source>
@@ -175,7 +175,7 @@
     </message>
     <message>
         <source>the file to write is missing: -o OUT.pdf</source>
-        <translation>الملف المراد كتابته مفقود: -o OUT.pdf</translation>
+        <translation>الملف المراد كتابته مفقود: ‎-o OUT.pdf</translation>
     </message>
     <message>
         <source>only one file can be read from standard input</source>
@@ -183,7 +183,7 @@
     </message>
     <message>
         <source>--language must be one of %1, not &quot;%2&quot;</source>
-        <translation>يجب أن يكون --language واحدًا من %1، لا «%2»</translation>
+        <translation>يجب أن يكون ‎--language واحدًا من %1، لا «%2»</translation>
     </message>
     <message>
         <source>a command is missing: render, stats, check or blocks</source>
@@ -383,7 +383,7 @@
     </message>
     <message>
         <source>unknown keyword %1; it stays as it is</source>
-        <translation>حقل غير معروف %1؛ يبقى كما هو</translation>
+        <translation>وسم غير معروف %1؛ يبقى كما هو</translation>
     </message>
 </context>
 <context>

@@ -16,7 +16,7 @@
     </message>
     <message>
         <source>note: %1</source>
-        <translation>注意：%1</translation>
+        <translation>提示：%1</translation>
     </message>
     <message>
         <source>&lt;standard output&gt;</source>
@@ -35,7 +35,7 @@
     </message>
     <message>
         <source>Prints the statistics of every measured value, in the table&apos;s own units.</source>
-        <translation>以表格的单位显示每个测量值的统计。</translation>
+        <translation>按表格自身的单位输出每个测量值的统计。</translation>
     </message>
     <message>
         <source>Says what a template holds and what would be skipped or refused.</source>
@@ -47,7 +47,7 @@
     </message>
     <message>
         <source>Turns measurements and a report template into a PDF report, without a display.</source>
-        <translation>由测量数据和报告模板生成 PDF 报告，无需显示器。</translation>
+        <translation>由测量数据和报告模板生成 PDF 报告，无需图形界面。</translation>
     </message>
     <message>
         <source>Commands:</source>
@@ -67,7 +67,7 @@
     </message>
     <message>
         <source>Writes no notes and no progress.</source>
-        <translation>不输出注意事项和进度。</translation>
+        <translation>不输出提示和进度。</translation>
     </message>
     <message>
         <source>Writes errors as one line of JSON each.</source>
@@ -95,7 +95,7 @@
     </message>
     <message>
         <source>Unit of the table&apos;s values that state none, or Name=unit for one value. May be given several times.</source>
-        <translation>表格中未注明单位的数值的单位，或用 Name=unit 指定某个数值的单位。可多次指定。</translation>
+        <translation>表格中未注明单位的数值的单位，或用“名称=单位”指定某个数值的单位。可多次指定。</translation>
     </message>
     <message>
         <source>The table&apos;s column with the object types.</source>
@@ -111,7 +111,7 @@
     </message>
     <message>
         <source>Significant digits of measured values; 0 is automatic.</source>
-        <translation>测量值的有效位数；0 为自动。</translation>
+        <translation>测量值的有效数字位数；0 为自动。</translation>
     </message>
     <message>
         <source>Output: text, csv or json.</source>
@@ -135,7 +135,7 @@
     </message>
     <message>
         <source>Groups: object (type and value) or measurement.</source>
-        <translation>分组：object（类型和数值）或 measurement。</translation>
+        <translation>分组：object（类型和数值名称）或 measurement。</translation>
     </message>
     <message>
         <source>--format must be %1, not &quot;%2&quot;</source>
@@ -291,7 +291,7 @@
     </message>
     <message>
         <source>missing</source>
-        <translation>缺失</translation>
+        <translation>未定义</translation>
     </message>
     <message>
         <source>&quot;%1&quot; is missing</source>
@@ -335,7 +335,7 @@
     </message>
     <message>
         <source>is no whole number of pixels above 0</source>
-        <translation>不是大于 0 的整数像素</translation>
+        <translation>不是大于 0 的整数像素数</translation>
     </message>
     <message>
         <source>page width %1 px</source>
@@ -383,7 +383,7 @@
     </message>
     <message>
         <source>unknown keyword %1; it stays as it is</source>
-        <translation>未知字段 %1；保持原样</translation>
+        <translation>未知标记 %1；保持原样</translation>
     </message>
 </context>
 <context>

@@ -16,7 +16,7 @@
     </message>
     <message>
         <source>note: %1</source>
-        <translation>注意：%1</translation>
+        <translation>提示：%1</translation>
     </message>
     <message>
         <source>&lt;standard output&gt;</source>
@@ -35,7 +35,7 @@
     </message>
     <message>
         <source>Prints the statistics of every measured value, in the table&apos;s own units.</source>
-        <translation>以表格的單位顯示每個量測值的統計。</translation>
+        <translation>依表格本身的單位輸出每個量測值的統計。</translation>
     </message>
     <message>
         <source>Says what a template holds and what would be skipped or refused.</source>
@@ -47,7 +47,7 @@
     </message>
     <message>
         <source>Turns measurements and a report template into a PDF report, without a display.</source>
-        <translation>由量測資料和報告範本產生 PDF 報告，不需要螢幕。</translation>
+        <translation>由量測資料和報告範本產生 PDF 報告，不需要圖形介面。</translation>
     </message>
     <message>
         <source>Commands:</source>
@@ -67,7 +67,7 @@
     </message>
     <message>
         <source>Writes no notes and no progress.</source>
-        <translation>不輸出注意事項和進度。</translation>
+        <translation>不輸出提示和進度。</translation>
     </message>
     <message>
         <source>Writes errors as one line of JSON each.</source>
@@ -95,7 +95,7 @@
     </message>
     <message>
         <source>Unit of the table&apos;s values that state none, or Name=unit for one value. May be given several times.</source>
-        <translation>表格中未註明單位的數值的單位，或用 Name=unit 指定某個數值的單位。可多次指定。</translation>
+        <translation>表格中未註明單位的數值的單位，或用「名稱=單位」指定某個數值的單位。可多次指定。</translation>
     </message>
     <message>
         <source>The table&apos;s column with the object types.</source>
@@ -135,7 +135,7 @@
     </message>
     <message>
         <source>Groups: object (type and value) or measurement.</source>
-        <translation>分組：object（類型和數值）或 measurement。</translation>
+        <translation>分組：object（類型和數值名稱）或 measurement。</translation>
     </message>
     <message>
         <source>--format must be %1, not &quot;%2&quot;</source>
@@ -291,7 +291,7 @@
     </message>
     <message>
         <source>missing</source>
-        <translation>缺少</translation>
+        <translation>未定義</translation>
     </message>
     <message>
         <source>&quot;%1&quot; is missing</source>
@@ -335,7 +335,7 @@
     </message>
     <message>
         <source>is no whole number of pixels above 0</source>
-        <translation>不是大於 0 的整數像素</translation>
+        <translation>不是大於 0 的整數像素數</translation>
     </message>
     <message>
         <source>page width %1 px</source>
@@ -383,7 +383,7 @@
     </message>
     <message>
         <source>unknown keyword %1; it stays as it is</source>
-        <translation>未知欄位 %1；保持原樣</translation>
+        <translation>未知標記 %1；保持原樣</translation>
     </message>
 </context>
 <context>

@@ -43,7 +43,7 @@
     </message>
     <message>
         <source>Lists the block types and their settings with defaults.</source>
-        <translation>Liste les types de blocs et leurs réglages par défaut.</translation>
+        <translation>Liste les types de blocs et leurs paramètres, avec les valeurs par défaut.</translation>
     </message>
     <message>
         <source>Turns measurements and a report template into a PDF report, without a display.</source>
@@ -67,7 +67,7 @@
     </message>
     <message>
         <source>Writes no notes and no progress.</source>
-        <translation>N’écrit ni remarques ni progression.</translation>
+        <translation>N’affiche ni remarques ni progression.</translation>
     </message>
     <message>
         <source>Writes errors as one line of JSON each.</source>
@@ -79,7 +79,7 @@
     </message>
     <message>
         <source>Exit codes: 0 done, 1 the work failed, 2 wrong usage.</source>
-        <translation>Codes de retour&#xa0;: 0 terminé, 1 échec du travail, 2 utilisation incorrecte.</translation>
+        <translation>Codes de retour : 0 terminé, 1 échec, 2 utilisation incorrecte.</translation>
     </message>
     <message>
         <source>Shows this text.</source>
@@ -127,7 +127,7 @@
     </message>
     <message>
         <source>The image that was measured.</source>
-        <translation>L’image sur laquelle on a mesuré.</translation>
+        <translation>L’image mesurée.</translation>
     </message>
     <message>
         <source>The PDF file to write.</source>
@@ -167,7 +167,7 @@
     </message>
     <message>
         <source>the template is missing</source>
-        <translation>le modèle manque</translation>
+        <translation>modèle manquant</translation>
     </message>
     <message>
         <source>unexpected argument &quot;%1&quot;</source>
@@ -175,7 +175,7 @@
     </message>
     <message>
         <source>the file to write is missing: -o OUT.pdf</source>
-        <translation>le fichier à écrire manque&#xa0;: -o OUT.pdf</translation>
+        <translation>fichier à écrire manquant : -o OUT.pdf</translation>
     </message>
     <message>
         <source>only one file can be read from standard input</source>
@@ -187,7 +187,7 @@
     </message>
     <message>
         <source>a command is missing: render, stats, check or blocks</source>
-        <translation>une commande manque&#xa0;: render, stats, check ou blocks</translation>
+        <translation>commande manquante : render, stats, check ou blocks</translation>
     </message>
     <message>
         <source>unknown command &quot;%1&quot;; it must be render, stats, check or blocks</source>
@@ -195,7 +195,7 @@
     </message>
     <message>
         <source>%1 (statreport --help tells more)</source>
-        <translation>%1 (statreport --help en dit plus)</translation>
+        <translation>%1 (aide : statreport --help)</translation>
     </message>
 </context>
 <context>
@@ -307,7 +307,7 @@
     </message>
     <message>
         <source>the block refuses its settings</source>
-        <translation>le bloc refuse ses réglages</translation>
+        <translation>le bloc refuse ses paramètres</translation>
     </message>
     <message>
         <source>cannot be opened: %1</source>
@@ -339,7 +339,7 @@
     </message>
     <message>
         <source>page width %1 px</source>
-        <translation>largeur de page %1 px</translation>
+        <translation>largeur de page %1 px</translation>
     </message>
     <message>
         <source>is no fraction of the page width from 0 to 0.5</source>

@@ -39,11 +39,11 @@
     </message>
     <message>
         <source>Says what a template holds and what would be skipped or refused.</source>
-        <translation>Sagt, was eine Vorlage enthält und was übersprungen oder abgelehnt würde.</translation>
+        <translation>Zeigt, was eine Vorlage enthält und was übersprungen oder abgelehnt würde.</translation>
     </message>
     <message>
         <source>Lists the block types and their settings with defaults.</source>
-        <translation>Listet die Blocktypen und ihre Einstellungen mit Vorgaben auf.</translation>
+        <translation>Listet die Blocktypen und ihre Einstellungen mit Standardwerten auf.</translation>
     </message>
     <message>
         <source>Turns measurements and a report template into a PDF report, without a display.</source>
@@ -95,7 +95,7 @@
     </message>
     <message>
         <source>Unit of the table&apos;s values that state none, or Name=unit for one value. May be given several times.</source>
-        <translation>Einheit der Tabellenwerte, bei denen keine steht, oder Name=Einheit für eine Messgröße. Mehrfach möglich.</translation>
+        <translation>Einheit für Tabellenwerte ohne eigene Einheit, oder Name=Einheit für eine Messgröße. Mehrfach möglich.</translation>
     </message>
     <message>
         <source>The table&apos;s column with the object types.</source>
@@ -111,7 +111,7 @@
     </message>
     <message>
         <source>Significant digits of measured values; 0 is automatic.</source>
-        <translation>Gültige Ziffern der Messwerte; 0 ist automatisch.</translation>
+        <translation>Signifikante Stellen der Messwerte; 0 ist automatisch.</translation>
     </message>
     <message>
         <source>Output: text, csv or json.</source>
@@ -183,7 +183,7 @@
     </message>
     <message>
         <source>--language must be one of %1, not &quot;%2&quot;</source>
-        <translation>--language muss eins von %1 sein, nicht „%2“</translation>
+        <translation>--language muss einer der Werte %1 sein, nicht „%2“</translation>
     </message>
     <message>
         <source>a command is missing: render, stats, check or blocks</source>
@@ -195,7 +195,7 @@
     </message>
     <message>
         <source>%1 (statreport --help tells more)</source>
-        <translation>%1 (mehr sagt statreport --help)</translation>
+        <translation>%1 (weitere Hilfe: statreport --help)</translation>
     </message>
 </context>
 <context>
@@ -331,15 +331,15 @@
     </message>
     <message>
         <source>is %1; the page keeps its defaults</source>
-        <translation>gefunden: %1; die Seite behält ihre Vorgaben</translation>
+        <translation>gefunden: %1; die Seite behält ihre Standardwerte</translation>
     </message>
     <message>
         <source>is no whole number of pixels above 0</source>
-        <translation>ist keine ganze Zahl von Pixeln über 0</translation>
+        <translation>ist keine ganzzahlige Pixelanzahl größer als 0</translation>
     </message>
     <message>
         <source>page width %1 px</source>
-        <translation>Seitenbreite %1 px</translation>
+        <translation>Seitenbreite %1 px</translation>
     </message>
     <message>
         <source>is no fraction of the page width from 0 to 0.5</source>

@@ -299,7 +299,7 @@
     </message>
     <message>
         <source>&quot;%1&quot; is %2, not %3</source>
-        <translation>“%1”: trovato %2, atteso %3</translation>
+        <translation>“%1”: trovato: %2, atteso: %3</translation>
     </message>
     <message>
         <source>&quot;%1&quot; has a value that the block refuses</source>
@@ -331,7 +331,7 @@
     </message>
     <message>
         <source>is %1; the page keeps its defaults</source>
-        <translation>trovato %1; la pagina mantiene i valori predefiniti</translation>
+        <translation>trovato: %1; la pagina mantiene i valori predefiniti</translation>
     </message>
     <message>
         <source>is no whole number of pixels above 0</source>
@@ -347,23 +347,23 @@
     </message>
     <message>
         <source>is %1, not an object; it is off</source>
-        <translation>trovato %1, atteso un oggetto JSON; resta disattivato</translation>
+        <translation>trovato: %1, atteso: un oggetto JSON; resta disattivato</translation>
     </message>
     <message>
         <source>is %1, not a boolean; it is off</source>
-        <translation>trovato %1, atteso un valore logico; resta disattivato</translation>
+        <translation>trovato: %1, atteso: un valore logico; resta disattivato</translation>
     </message>
     <message>
         <source>is %1, not a string; the section is off</source>
-        <translation>trovato %1, attesa una stringa; la sezione resta disattivata</translation>
+        <translation>trovato: %1, atteso: una stringa; la sezione resta disattivata</translation>
     </message>
     <message>
         <source>is %1, not an array; there are no blocks</source>
-        <translation>trovato %1, atteso un elenco; non ci sono blocchi</translation>
+        <translation>trovato: %1, atteso: un elenco; non ci sono blocchi</translation>
     </message>
     <message>
         <source>is %1, not a string; the block is skipped</source>
-        <translation>trovato %1, attesa una stringa; il blocco viene saltato</translation>
+        <translation>trovato: %1, atteso: una stringa; il blocco viene saltato</translation>
     </message>
     <message>
         <source>there is no block type &quot;%1&quot;; the block is skipped</source>
@@ -371,7 +371,7 @@
     </message>
     <message>
         <source>is %1, not an object</source>
-        <translation>trovato %1, atteso un oggetto JSON</translation>
+        <translation>trovato: %1, atteso: un oggetto JSON</translation>
     </message>
     <message>
         <source>block &quot;%1&quot;</source>
@@ -379,7 +379,7 @@
     </message>
     <message>
         <source>is %1, not %2; it is ignored</source>
-        <translation>trovato %1, atteso %2; viene ignorato</translation>
+        <translation>trovato: %1, atteso: %2; viene ignorato</translation>
     </message>
     <message>
         <source>unknown keyword %1; it stays as it is</source>

@@ -131,7 +131,7 @@
     </message>
     <message>
         <source>The PDF file to write.</source>
-        <translation>書き込む PDF ファイル。</translation>
+        <translation>出力する PDF ファイル。</translation>
     </message>
     <message>
         <source>Groups: object (type and value) or measurement.</source>
@@ -175,7 +175,7 @@
     </message>
     <message>
         <source>the file to write is missing: -o OUT.pdf</source>
-        <translation>書き込むファイルが指定されていません: -o OUT.pdf</translation>
+        <translation>出力ファイルが指定されていません: -o OUT.pdf</translation>
     </message>
     <message>
         <source>only one file can be read from standard input</source>
@@ -187,7 +187,7 @@
     </message>
     <message>
         <source>a command is missing: render, stats, check or blocks</source>
-        <translation>コマンドがありません: render、stats、check または blocks</translation>
+        <translation>コマンドが指定されていません: render、stats、check または blocks</translation>
     </message>
     <message>
         <source>unknown command &quot;%1&quot;; it must be render, stats, check or blocks</source>
@@ -299,7 +299,7 @@
     </message>
     <message>
         <source>&quot;%1&quot; is %2, not %3</source>
-        <translation>「%1」は %2 です (必要な型: %3)</translation>
+        <translation>「%1」の型: %2、必要な型: %3</translation>
     </message>
     <message>
         <source>&quot;%1&quot; has a value that the block refuses</source>
@@ -327,15 +327,15 @@
     </message>
     <message>
         <source>is no template: the JSON document is no object</source>
-        <translation>テンプレートではありません: JSON 文書がオブジェクトではありません</translation>
+        <translation>テンプレートではありません: 最上位が JSON オブジェクトではありません</translation>
     </message>
     <message>
         <source>is %1; the page keeps its defaults</source>
-        <translation>%1 です。ページは既定値のままです</translation>
+        <translation>実際の型: %1。ページは既定値のままです</translation>
     </message>
     <message>
         <source>is no whole number of pixels above 0</source>
-        <translation>0 より大きいピクセル数の整数ではありません</translation>
+        <translation>0 より大きい整数のピクセル数ではありません</translation>
     </message>
     <message>
         <source>page width %1 px</source>
@@ -347,23 +347,23 @@
     </message>
     <message>
         <source>is %1, not an object; it is off</source>
-        <translation>%1 です (必要な型: JSON オブジェクト)。オフになります</translation>
+        <translation>実際の型: %1、必要な型: JSON オブジェクト。オフになります</translation>
     </message>
     <message>
         <source>is %1, not a boolean; it is off</source>
-        <translation>%1 です (必要な型: 真偽値)。オフになります</translation>
+        <translation>実際の型: %1、必要な型: 真偽値。オフになります</translation>
     </message>
     <message>
         <source>is %1, not a string; the section is off</source>
-        <translation>%1 です (必要な型: 文字列)。セクションはオフになります</translation>
+        <translation>実際の型: %1、必要な型: 文字列。セクションはオフになります</translation>
     </message>
     <message>
         <source>is %1, not an array; there are no blocks</source>
-        <translation>%1 です (必要な型: 配列)。ブロックはありません</translation>
+        <translation>実際の型: %1、必要な型: 配列。ブロックはありません</translation>
     </message>
     <message>
         <source>is %1, not a string; the block is skipped</source>
-        <translation>%1 です (必要な型: 文字列)。ブロックは無視されます</translation>
+        <translation>実際の型: %1、必要な型: 文字列。ブロックは無視されます</translation>
     </message>
     <message>
         <source>there is no block type &quot;%1&quot;; the block is skipped</source>
@@ -371,7 +371,7 @@
     </message>
     <message>
         <source>is %1, not an object</source>
-        <translation>%1 です (必要な型: JSON オブジェクト)</translation>
+        <translation>実際の型: %1、必要な型: JSON オブジェクト</translation>
     </message>
     <message>
         <source>block &quot;%1&quot;</source>
@@ -379,11 +379,11 @@
     </message>
     <message>
         <source>is %1, not %2; it is ignored</source>
-        <translation>%1 です (必要な型: %2)。無視されます</translation>
+        <translation>実際の型: %1、必要な型: %2。無視されます</translation>
     </message>
     <message>
         <source>unknown keyword %1; it stays as it is</source>
-        <translation>不明なフィールド %1 はそのまま残ります</translation>
+        <translation>不明なタグ %1 はそのまま残ります</translation>
     </message>
 </context>
 <context>

@@ -95,7 +95,7 @@
     </message>
     <message>
         <source>Unit of the table&apos;s values that state none, or Name=unit for one value. May be given several times.</source>
-        <translation>단위가 없는 표 값의 단위 또는 한 값에 대한 Name=unit. 여러 번 지정할 수 있습니다.</translation>
+        <translation>표에서 단위가 없는 값의 단위. Name=unit 형식으로 쓰면 해당 값에만 적용됩니다. 여러 번 지정할 수 있습니다.</translation>
     </message>
     <message>
         <source>The table&apos;s column with the object types.</source>
@@ -131,7 +131,7 @@
     </message>
     <message>
         <source>The PDF file to write.</source>
-        <translation>쓸 PDF 파일.</translation>
+        <translation>출력할 PDF 파일.</translation>
     </message>
     <message>
         <source>Groups: object (type and value) or measurement.</source>
@@ -139,7 +139,7 @@
     </message>
     <message>
         <source>--format must be %1, not &quot;%2&quot;</source>
-        <translation>--format은 %1이어야 합니다(“%2”은(는) 안 됨)</translation>
+        <translation>--format은 %1이어야 합니다(“%2”은(는) 사용할 수 없음)</translation>
     </message>
     <message>
         <source>text, csv or json</source>
@@ -151,11 +151,11 @@
     </message>
     <message>
         <source>--group-by must be object or measurement, not &quot;%1&quot;</source>
-        <translation>--group-by는 object 또는 measurement여야 합니다(“%1”은(는) 안 됨)</translation>
+        <translation>--group-by는 object 또는 measurement여야 합니다(“%1”은(는) 사용할 수 없음)</translation>
     </message>
     <message>
         <source>--digits must be a number from 0 to 15, not &quot;%1&quot;</source>
-        <translation>--digits는 0에서 15까지의 숫자여야 합니다(“%1”은(는) 안 됨)</translation>
+        <translation>--digits는 0에서 15까지의 숫자여야 합니다(“%1”은(는) 사용할 수 없음)</translation>
     </message>
     <message>
         <source>give the measurements: either --session or --table</source>
@@ -163,11 +163,11 @@
     </message>
     <message>
         <source>--decimal must be point or comma, not &quot;%1&quot;</source>
-        <translation>--decimal은 point 또는 comma여야 합니다(“%1”은(는) 안 됨)</translation>
+        <translation>--decimal은 point 또는 comma여야 합니다(“%1”은(는) 사용할 수 없음)</translation>
     </message>
     <message>
         <source>the template is missing</source>
-        <translation>템플릿이 없습니다</translation>
+        <translation>템플릿이 지정되지 않았습니다</translation>
     </message>
     <message>
         <source>unexpected argument &quot;%1&quot;</source>
@@ -175,7 +175,7 @@
     </message>
     <message>
         <source>the file to write is missing: -o OUT.pdf</source>
-        <translation>쓸 파일이 없습니다: -o OUT.pdf</translation>
+        <translation>출력 파일이 지정되지 않았습니다: -o OUT.pdf</translation>
     </message>
     <message>
         <source>only one file can be read from standard input</source>
@@ -183,11 +183,11 @@
     </message>
     <message>
         <source>--language must be one of %1, not &quot;%2&quot;</source>
-        <translation>--language는 %1 중 하나여야 합니다(“%2”은(는) 안 됨)</translation>
+        <translation>--language는 %1 중 하나여야 합니다(“%2”은(는) 사용할 수 없음)</translation>
     </message>
     <message>
         <source>a command is missing: render, stats, check or blocks</source>
-        <translation>명령이 없습니다: render, stats, check 또는 blocks</translation>
+        <translation>명령이 지정되지 않았습니다: render, stats, check 또는 blocks</translation>
     </message>
     <message>
         <source>unknown command &quot;%1&quot;; it must be render, stats, check or blocks</source>
@@ -299,15 +299,15 @@
     </message>
     <message>
         <source>&quot;%1&quot; is %2, not %3</source>
-        <translation>“%1”: 찾은 것은 %2, 필요한 것은 %3</translation>
+        <translation>“%1”의 형식: %2, 필요한 형식: %3</translation>
     </message>
     <message>
         <source>&quot;%1&quot; has a value that the block refuses</source>
-        <translation>“%1”의 값을 블록이 거부합니다</translation>
+        <translation>“%1”의 값을 블록에 사용할 수 없습니다</translation>
     </message>
     <message>
         <source>the block refuses its settings</source>
-        <translation>블록이 설정을 거부합니다</translation>
+        <translation>이 설정을 블록에 사용할 수 없습니다</translation>
     </message>
     <message>
         <source>cannot be opened: %1</source>
@@ -327,11 +327,11 @@
     </message>
     <message>
         <source>is no template: the JSON document is no object</source>
-        <translation>템플릿이 아닙니다: JSON 문서가 객체가 아닙니다</translation>
+        <translation>템플릿이 아닙니다: 최상위 요소가 JSON 객체가 아닙니다</translation>
     </message>
     <message>
         <source>is %1; the page keeps its defaults</source>
-        <translation>찾은 것은 %1. 페이지는 기본값을 유지합니다</translation>
+        <translation>실제 형식: %1. 페이지는 기본값을 유지합니다</translation>
     </message>
     <message>
         <source>is no whole number of pixels above 0</source>
@@ -347,23 +347,23 @@
     </message>
     <message>
         <source>is %1, not an object; it is off</source>
-        <translation>찾은 것은 %1, 필요한 것은 JSON 객체. 꺼집니다</translation>
+        <translation>실제 형식: %1, 필요한 형식: JSON 객체. 사용되지 않습니다</translation>
     </message>
     <message>
         <source>is %1, not a boolean; it is off</source>
-        <translation>찾은 것은 %1, 필요한 것은 논리값. 꺼집니다</translation>
+        <translation>실제 형식: %1, 필요한 형식: 논리값. 사용되지 않습니다</translation>
     </message>
     <message>
         <source>is %1, not a string; the section is off</source>
-        <translation>찾은 것은 %1, 필요한 것은 문자열. 구역이 꺼집니다</translation>
+        <translation>실제 형식: %1, 필요한 형식: 문자열. 이 구역은 사용되지 않습니다</translation>
     </message>
     <message>
         <source>is %1, not an array; there are no blocks</source>
-        <translation>찾은 것은 %1, 필요한 것은 배열. 블록이 없습니다</translation>
+        <translation>실제 형식: %1, 필요한 형식: 배열. 블록이 없습니다</translation>
     </message>
     <message>
         <source>is %1, not a string; the block is skipped</source>
-        <translation>찾은 것은 %1, 필요한 것은 문자열. 블록을 건너뜁니다</translation>
+        <translation>실제 형식: %1, 필요한 형식: 문자열. 블록을 건너뜁니다</translation>
     </message>
     <message>
         <source>there is no block type &quot;%1&quot;; the block is skipped</source>
@@ -371,7 +371,7 @@
     </message>
     <message>
         <source>is %1, not an object</source>
-        <translation>찾은 것은 %1, 필요한 것은 JSON 객체</translation>
+        <translation>실제 형식: %1, 필요한 형식: JSON 객체</translation>
     </message>
     <message>
         <source>block &quot;%1&quot;</source>
@@ -379,11 +379,11 @@
     </message>
     <message>
         <source>is %1, not %2; it is ignored</source>
-        <translation>찾은 것은 %1, 필요한 것은 %2. 무시됩니다</translation>
+        <translation>실제 형식: %1, 필요한 형식: %2. 무시됩니다</translation>
     </message>
     <message>
         <source>unknown keyword %1; it stays as it is</source>
-        <translation>알 수 없는 필드 %1은(는) 그대로 남습니다</translation>
+        <translation>알 수 없는 태그 %1은(는) 그대로 남습니다</translation>
     </message>
 </context>
 <context>
@@ -397,7 +397,7 @@
     <name>KvTerminalProgress</name>
     <message>
         <source>page %1 of %2</source>
-        <translation>%2페이지 중 %1페이지</translation>
+        <translation>%1/%2페이지</translation>
     </message>
 </context>
 <context>

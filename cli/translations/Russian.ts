@@ -47,7 +47,7 @@
     </message>
     <message>
         <source>Turns measurements and a report template into a PDF report, without a display.</source>
-        <translation>Создаёт отчёт PDF из измерений и шаблона отчёта, без экрана.</translation>
+        <translation>Создаёт отчёт PDF из измерений и шаблона отчёта; дисплей не требуется.</translation>
     </message>
     <message>
         <source>Commands:</source>
@@ -79,7 +79,7 @@
     </message>
     <message>
         <source>Exit codes: 0 done, 1 the work failed, 2 wrong usage.</source>
-        <translation>Коды завершения: 0 — готово, 1 — ошибка в работе, 2 — неверный вызов.</translation>
+        <translation>Коды завершения: 0 — готово, 1 — сбой при выполнении, 2 — неверный вызов.</translation>
     </message>
     <message>
         <source>Shows this text.</source>
@@ -135,7 +135,7 @@
     </message>
     <message>
         <source>Groups: object (type and value) or measurement.</source>
-        <translation>Группы: object (тип и значение) или measurement.</translation>
+        <translation>Группы: object (тип и величина) или measurement.</translation>
     </message>
     <message>
         <source>--format must be %1, not &quot;%2&quot;</source>
@@ -256,15 +256,15 @@
     </message>
     <message>
         <source>Sigma</source>
-        <translation>Сигма</translation>
+        <translation>σ</translation>
     </message>
     <message>
         <source>3 Sigma</source>
-        <translation>3 сигма</translation>
+        <translation>3σ</translation>
     </message>
     <message>
         <source>6 Sigma</source>
-        <translation>6 сигма</translation>
+        <translation>6σ</translation>
     </message>
 </context>
 <context>
@@ -339,7 +339,7 @@
     </message>
     <message>
         <source>page width %1 px</source>
-        <translation>ширина страницы %1 пикс.</translation>
+        <translation>ширина страницы %1 px</translation>
     </message>
     <message>
         <source>is no fraction of the page width from 0 to 0.5</source>

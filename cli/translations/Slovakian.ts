@@ -27,19 +27,19 @@
     <name>KvCliParser</name>
     <message>
         <source>Language of messages and reports, such as German or de; otherwise the system&apos;s.</source>
-        <translation>Jazyk hlásení a správ, napríklad German alebo de; inak jazyk systému.</translation>
+        <translation>Jazyk hlásení a protokolov, napríklad German alebo de; inak jazyk systému.</translation>
     </message>
     <message>
         <source>Prints a report: template and measurements in, PDF out.</source>
-        <translation>Vytlačí správu: zo šablóny a meraní vznikne PDF.</translation>
+        <translation>Vytlačí protokol: zo šablóny a meraní vznikne PDF.</translation>
     </message>
     <message>
         <source>Prints the statistics of every measured value, in the table&apos;s own units.</source>
-        <translation>Vypíše štatistiku každej nameranej hodnoty v jednotkách tabuľky.</translation>
+        <translation>Vypíše štatistiku každej meranej veličiny v jednotkách tabuľky.</translation>
     </message>
     <message>
         <source>Says what a template holds and what would be skipped or refused.</source>
-        <translation>Povie, čo šablóna obsahuje a čo by sa preskočilo alebo odmietlo.</translation>
+        <translation>Vypíše, čo šablóna obsahuje a čo by sa preskočilo alebo odmietlo.</translation>
     </message>
     <message>
         <source>Lists the block types and their settings with defaults.</source>
@@ -47,7 +47,7 @@
     </message>
     <message>
         <source>Turns measurements and a report template into a PDF report, without a display.</source>
-        <translation>Z meraní a šablóny vytvorí správu PDF, bez obrazovky.</translation>
+        <translation>Z meraní a šablóny vytvorí protokol PDF, bez obrazovky.</translation>
     </message>
     <message>
         <source>Commands:</source>
@@ -79,7 +79,7 @@
     </message>
     <message>
         <source>Exit codes: 0 done, 1 the work failed, 2 wrong usage.</source>
-        <translation>Návratové kódy: 0 hotovo, 1 práca zlyhala, 2 nesprávne použitie.</translation>
+        <translation>Návratové kódy: 0 hotovo, 1 zlyhanie, 2 nesprávne použitie.</translation>
     </message>
     <message>
         <source>Shows this text.</source>
@@ -95,7 +95,7 @@
     </message>
     <message>
         <source>Unit of the table&apos;s values that state none, or Name=unit for one value. May be given several times.</source>
-        <translation>Jednotka hodnôt tabuľky, ktoré žiadnu neuvádzajú, alebo Názov=jednotka pre jednu hodnotu. Možno zadať viackrát.</translation>
+        <translation>Jednotka hodnôt tabuľky, ktoré žiadnu neuvádzajú, alebo Názov=jednotka pre jednu veličinu. Možno zadať viackrát.</translation>
     </message>
     <message>
         <source>The table&apos;s column with the object types.</source>
@@ -123,7 +123,7 @@
     </message>
     <message>
         <source>The report template.</source>
-        <translation>Šablóna správy.</translation>
+        <translation>Šablóna protokolu.</translation>
     </message>
     <message>
         <source>The image that was measured.</source>
@@ -135,7 +135,7 @@
     </message>
     <message>
         <source>Groups: object (type and value) or measurement.</source>
-        <translation>Skupiny: object (typ a hodnota) alebo measurement.</translation>
+        <translation>Skupiny: object (typ a veličina) alebo measurement.</translation>
     </message>
     <message>
         <source>--format must be %1, not &quot;%2&quot;</source>
@@ -183,7 +183,7 @@
     </message>
     <message>
         <source>--language must be one of %1, not &quot;%2&quot;</source>
-        <translation>--language musí byť jedno z %1, nie „%2“</translation>
+        <translation>--language musí byť jedna z hodnôt %1, nie „%2“</translation>
     </message>
     <message>
         <source>a command is missing: render, stats, check or blocks</source>
@@ -195,7 +195,7 @@
     </message>
     <message>
         <source>%1 (statreport --help tells more)</source>
-        <translation>%1 (viac povie statreport --help)</translation>
+        <translation>%1 (ďalšia pomoc: statreport --help)</translation>
     </message>
 </context>
 <context>
@@ -232,7 +232,7 @@
     </message>
     <message>
         <source>Measurement Type</source>
-        <translation>Druh merania</translation>
+        <translation>Veličina</translation>
     </message>
     <message>
         <source>Unit</source>
@@ -335,11 +335,11 @@
     </message>
     <message>
         <source>is no whole number of pixels above 0</source>
-        <translation>nie je celé číslo pixelov väčšie ako 0</translation>
+        <translation>nie je celý počet pixelov väčší ako 0</translation>
     </message>
     <message>
         <source>page width %1 px</source>
-        <translation>šírka strany %1 px</translation>
+        <translation>šírka strany %1 px</translation>
     </message>
     <message>
         <source>is no fraction of the page width from 0 to 0.5</source>

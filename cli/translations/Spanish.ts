@@ -43,7 +43,7 @@
     </message>
     <message>
         <source>Lists the block types and their settings with defaults.</source>
-        <translation>Enumera los tipos de bloque y sus ajustes con los valores predeterminados.</translation>
+        <translation>Enumera los tipos de bloque y su configuración con los valores predeterminados.</translation>
     </message>
     <message>
         <source>Turns measurements and a report template into a PDF report, without a display.</source>
@@ -299,7 +299,7 @@
     </message>
     <message>
         <source>&quot;%1&quot; is %2, not %3</source>
-        <translation>«%1»: se encontró %2, se esperaba %3</translation>
+        <translation>«%1»: valor encontrado: %2; se esperaba %3</translation>
     </message>
     <message>
         <source>&quot;%1&quot; has a value that the block refuses</source>
@@ -307,7 +307,7 @@
     </message>
     <message>
         <source>the block refuses its settings</source>
-        <translation>el bloque rechaza sus ajustes</translation>
+        <translation>el bloque rechaza su configuración</translation>
     </message>
     <message>
         <source>cannot be opened: %1</source>
@@ -331,7 +331,7 @@
     </message>
     <message>
         <source>is %1; the page keeps its defaults</source>
-        <translation>se encontró %1; la página conserva sus valores predeterminados</translation>
+        <translation>valor encontrado: %1; la página conserva sus valores predeterminados</translation>
     </message>
     <message>
         <source>is no whole number of pixels above 0</source>
@@ -347,23 +347,23 @@
     </message>
     <message>
         <source>is %1, not an object; it is off</source>
-        <translation>se encontró %1, se esperaba un objeto JSON; queda desactivado</translation>
+        <translation>valor encontrado: %1; se esperaba un objeto JSON; queda desactivado</translation>
     </message>
     <message>
         <source>is %1, not a boolean; it is off</source>
-        <translation>se encontró %1, se esperaba un valor lógico; queda desactivado</translation>
+        <translation>valor encontrado: %1; se esperaba un valor lógico; queda desactivado</translation>
     </message>
     <message>
         <source>is %1, not a string; the section is off</source>
-        <translation>se encontró %1, se esperaba una cadena; la sección queda desactivada</translation>
+        <translation>valor encontrado: %1; se esperaba una cadena; la sección queda desactivada</translation>
     </message>
     <message>
         <source>is %1, not an array; there are no blocks</source>
-        <translation>se encontró %1, se esperaba una lista; no hay bloques</translation>
+        <translation>valor encontrado: %1; se esperaba una lista; no hay bloques</translation>
     </message>
     <message>
         <source>is %1, not a string; the block is skipped</source>
-        <translation>se encontró %1, se esperaba una cadena; el bloque se omite</translation>
+        <translation>valor encontrado: %1; se esperaba una cadena; el bloque se omite</translation>
     </message>
     <message>
         <source>there is no block type &quot;%1&quot;; the block is skipped</source>
@@ -371,7 +371,7 @@
     </message>
     <message>
         <source>is %1, not an object</source>
-        <translation>se encontró %1, se esperaba un objeto JSON</translation>
+        <translation>valor encontrado: %1; se esperaba un objeto JSON</translation>
     </message>
     <message>
         <source>block &quot;%1&quot;</source>
@@ -379,7 +379,7 @@
     </message>
     <message>
         <source>is %1, not %2; it is ignored</source>
-        <translation>se encontró %1, se esperaba %2; se ignora</translation>
+        <translation>valor encontrado: %1; se esperaba %2; se ignora</translation>
     </message>
     <message>
         <source>unknown keyword %1; it stays as it is</source>

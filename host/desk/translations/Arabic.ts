@@ -242,11 +242,11 @@
     </message>
     <message>
         <source>Parallel &amp;distance</source>
-        <translation>مسافة &amp;متوازية</translation>
+        <translation>&amp;مسافة نقطة عن خط</translation>
     </message>
     <message>
         <source>Measure the distance of a point from a line</source>
-        <translation>قياس بُعد نقطة عن خط</translation>
+        <translation>قياس مسافة نقطة عن خط</translation>
     </message>
     <message>
         <source>&amp;Arc</source>
@@ -608,7 +608,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <name>KvDeskCounterBar</name>
     <message>
         <source>Clicks count for</source>
-        <translation>احتساب النقرات في</translation>
+        <translation>تُحتسب النقرات في</translation>
     </message>
     <message>
         <source>The counter that gets the clicks (1 to 9)</source>
@@ -683,7 +683,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>Fibres: statistics</source>
-        <translation>ألياف: الإحصاء</translation>
+        <translation>ألياف: الإحصاءات</translation>
     </message>
 </context>
 <context>
@@ -963,7 +963,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>Overwrite</source>
-        <translation>كتابة فوقه</translation>
+        <translation>الكتابة فوقها</translation>
     </message>
     <message>
         <source>Save as...</source>
@@ -1273,7 +1273,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>None yet</source>
-        <translation>لا شيء بعد</translation>
+        <translation>لا توجد بعد</translation>
     </message>
     <message>
         <source>About Measuring Desk</source>
@@ -1423,7 +1423,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>It failed for a reason of its own</source>
-        <translation>فشلت لسبب داخلي فيها</translation>
+        <translation>فشلت لسبب غير معروف</translation>
     </message>
 </context>
 <context>
@@ -1607,7 +1607,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>System default</source>
-        <translation>افتراضي النظام</translation>
+        <translation>لغة النظام</translation>
     </message>
     <message>
         <source>Nothing was changed yet</source>
@@ -1743,7 +1743,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
-        <translation>اسحب خطًا فوق الصورة: يظهر طوله في القائمة فورًا. تُنشئ لوحة التقرير ملف PDF بجميع القيم.</translation>
+        <translation>ارسم خطًا على الصورة بالسحب: يظهر طوله في القائمة فورًا. تُنشئ لوحة التقرير ملف PDF بجميع القيم.</translation>
     </message>
     <message>
         <source>Examples to try</source>
@@ -2080,11 +2080,11 @@ Reported by %2</source>
     <name>ZtAravisSource</name>
     <message>
         <source>%1 is disconnected; its last picture stays</source>
-        <translation>انقطع اتصال %1؛ وتبقى صورته الأخيرة</translation>
+        <translation>انقطع اتصال الكاميرا %1؛ وتبقى صورتها الأخيرة</translation>
     </message>
     <message>
         <source>%1 delivers pictures of a kind that cannot be shown</source>
-        <translation>يرسل %1 صورًا من نوع لا يمكن عرضه</translation>
+        <translation>ترسل الكاميرا %1 صورًا من نوع لا يمكن عرضه</translation>
     </message>
     <message>
         <source>The camera does not take the setting (%1)</source>
@@ -2092,7 +2092,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>%1 cannot be opened (%2)</source>
-        <translation>تعذر فتح %1 (%2)</translation>
+        <translation>تعذر فتح الكاميرا %1 (%2)</translation>
     </message>
 </context>
 <context>
@@ -2173,7 +2173,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>Parallel distance</source>
-        <translation>مسافة متوازية</translation>
+        <translation>مسافة نقطة عن خط</translation>
     </message>
     <message>
         <source>Distance</source>
@@ -2311,7 +2311,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>A point must be a list of two numbers between -1e9 and 1e9</source>
-        <translation>يجب أن تكون النقطة قائمة من عددين بين -1e9 و1e9</translation>
+        <translation>يجب أن تكون النقطة قائمة من عددين بين ‎-1e9 و1e9</translation>
     </message>
     <message>
         <source>This must be the name of a value</source>
@@ -2379,7 +2379,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>This must be a date such as 2026-01-31T12:00:00Z</source>
-        <translation>يجب أن يكون هذا تاريخًا مثل 2026-01-31T12:00:00Z</translation>
+        <translation>يجب أن يكون هذا تاريخًا مثل ‎2026-01-31T12:00:00Z</translation>
     </message>
     <message>
         <source>This must be &quot;knownDistance&quot;, &quot;metadata&quot; or &quot;typed&quot;</source>
@@ -2599,11 +2599,11 @@ Reported by %2</source>
     <name>ZtUvcCameraSource</name>
     <message>
         <source>%1 is not connected</source>
-        <translation>%1 غير متصل</translation>
+        <translation>الكاميرا %1 غير متصلة</translation>
     </message>
     <message>
         <source>%1 is disconnected or in use (%2)</source>
-        <translation>%1 غير متصل أو قيد الاستخدام (%2)</translation>
+        <translation>الكاميرا %1 غير متصلة أو قيد الاستخدام (%2)</translation>
     </message>
 </context>
 <context>

@@ -49,7 +49,7 @@
     </message>
     <message>
         <source>Save session to another file</source>
-        <translation>将会话保存为其他文件</translation>
+        <translation>将会话另存为其他文件</translation>
     </message>
     <message>
         <source>&amp;Quit</source>
@@ -101,7 +101,7 @@
     </message>
     <message>
         <source>Stat&amp;us log</source>
-        <translation>状态日志(&amp;T)</translation>
+        <translation>状态日志(&amp;U)</translation>
     </message>
     <message>
         <source>Show or hide the status log</source>
@@ -117,7 +117,7 @@
     </message>
     <message>
         <source>Settin&amp;gs...</source>
-        <translation>设置(&amp;P)...</translation>
+        <translation>设置(&amp;G)...</translation>
     </message>
     <message>
         <source>Settings</source>
@@ -451,7 +451,7 @@
     </message>
     <message>
         <source>Who</source>
-        <translation>操作人</translation>
+        <translation>校准人</translation>
     </message>
     <message>
         <source>Note</source>
@@ -510,7 +510,7 @@
     </message>
     <message>
         <source>Who</source>
-        <translation>操作人</translation>
+        <translation>校准人</translation>
     </message>
     <message>
         <source>Pixel size</source>
@@ -596,7 +596,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
   --image 文件        打开图像
   --table 文件        导入测量值表格
   --theme Dark|Light  本次运行使用的主题
-  --plugins 目录      同时在此目录中查找插件；可多次指定
+  --plugins 目录      也在此目录中查找插件；可多次指定
   --help              显示此帮助
   --version           显示版本
 
@@ -612,7 +612,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>The counter that gets the clicks (1 to 9)</source>
-        <translation>接收点击的计数器（1 至 9）</translation>
+        <translation>接收点击的计数器（按键 1 至 9）</translation>
     </message>
     <message>
         <source>Count another class</source>
@@ -754,7 +754,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>Apostrophe before names that spreadsheets take for formulas</source>
-        <translation>在会被电子表格视为公式的名称前加撇号</translation>
+        <translation>在会被电子表格视为公式的名称前加单引号</translation>
     </message>
     <message>
         <source>Changes names that begin with =, +, - or @: they are others when the table is imported again</source>
@@ -935,15 +935,15 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>The measurements were not restored.</source>
-        <translation>未能恢复测量。</translation>
+        <translation>未能恢复测量数据。</translation>
     </message>
     <message>
         <source>Restoring measurements</source>
-        <translation>正在恢复测量</translation>
+        <translation>正在恢复测量数据</translation>
     </message>
     <message>
         <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>已恢复测量：%1（对象数：%2）</translation>
+        <translation>已恢复测量数据：%1（对象数：%2）</translation>
     </message>
     <message>
         <source>Importing &quot;%1&quot;</source>
@@ -1443,7 +1443,7 @@ Dropped, because newer ones came first: %1</source>
     <name>KvDeskRecoveryBar</name>
     <message>
         <source>Show other measurements that were not saved</source>
-        <translation>显示其他未保存的测量</translation>
+        <translation>显示其他未保存的测量数据</translation>
     </message>
     <message>
         <source>Restore</source>
@@ -1451,7 +1451,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Open these measurements as a session with unsaved changes</source>
-        <translation>将这些测量作为含未保存更改的会话打开</translation>
+        <translation>将这些测量数据作为含未保存更改的会话打开</translation>
     </message>
     <message>
         <source>Discard</source>
@@ -1459,7 +1459,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Delete these measurements for good</source>
-        <translation>永久删除这些测量</translation>
+        <translation>永久删除这些测量数据</translation>
     </message>
     <message>
         <source>%1: %2</source>
@@ -1475,7 +1475,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Measurements from %1 were not saved.</source>
-        <translation>%1 的测量未保存。</translation>
+        <translation>%1 的测量数据未保存。</translation>
     </message>
 </context>
 <context>
@@ -1502,11 +1502,11 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Selected values: %1</source>
-        <translation>所选数值：%1</translation>
+        <translation>已选择 %1 个数值</translation>
     </message>
     <message>
         <source>&quot;%1&quot; among them: %2</source>
-        <translation>其中“%1”：%2</translation>
+        <translation>其中“%1”：%2 个</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -1712,7 +1712,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Choose a camera or another source</source>
-        <translation>选择相机或其他源</translation>
+        <translation>选择相机或其他图像源</translation>
     </message>
     <message>
         <source>Calibrate</source>
@@ -1728,7 +1728,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
-        <translation>在图像上拖出一条直线，其长度会立即列出。报告面板可将所有数值生成 PDF。</translation>
+        <translation>在图像上拖出一条直线，其长度会立即列出。报告面板可用所有数值生成 PDF。</translation>
     </message>
     <message>
         <source>Examples to try</source>
@@ -1823,7 +1823,7 @@ Dropped, because newer ones came first: %1</source>
 Reported by %2</source>
         <comment>message, source</comment>
         <translation>%1
-报告者：%2</translation>
+来源：%2</translation>
     </message>
     <message>
         <source>Category</source>
@@ -2024,7 +2024,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>Discard</source>
-        <translation>放弃</translation>
+        <translation>不保存</translation>
     </message>
     <message>
         <source>&amp;Yes</source>
@@ -2292,7 +2292,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>An object of type &quot;%1&quot; cannot have this number of points (%2)</source>
-        <translation>“%1”类型的对象不能有这个数目的点（%2）</translation>
+        <translation>“%1”类型对象的点数不能为 %2</translation>
     </message>
     <message>
         <source>A point must be a list of two numbers between -1e9 and 1e9</source>
@@ -2407,7 +2407,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>The picture has %1 x %2 pixels, which is too many</source>
-        <translation>图像为 %1 x %2 像素，超出上限</translation>
+        <translation>图像为 %1 × %2 像素，超出上限</translation>
     </message>
     <message>
         <source>The picture cannot be decoded (%1)</source>

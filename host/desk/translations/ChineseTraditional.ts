@@ -49,7 +49,7 @@
     </message>
     <message>
         <source>Save session to another file</source>
-        <translation>將工作階段儲存為其他檔案</translation>
+        <translation>將工作階段另存為其他檔案</translation>
     </message>
     <message>
         <source>&amp;Quit</source>
@@ -101,7 +101,7 @@
     </message>
     <message>
         <source>Stat&amp;us log</source>
-        <translation>狀態記錄(&amp;T)</translation>
+        <translation>狀態記錄(&amp;U)</translation>
     </message>
     <message>
         <source>Show or hide the status log</source>
@@ -117,7 +117,7 @@
     </message>
     <message>
         <source>Settin&amp;gs...</source>
-        <translation>設定(&amp;P)...</translation>
+        <translation>設定(&amp;G)...</translation>
     </message>
     <message>
         <source>Settings</source>
@@ -451,7 +451,7 @@
     </message>
     <message>
         <source>Who</source>
-        <translation>人員</translation>
+        <translation>校正人員</translation>
     </message>
     <message>
         <source>Note</source>
@@ -467,7 +467,7 @@
     </message>
     <message>
         <source>Calibrations of this objective appear here</source>
-        <translation>此物鏡的校正紀錄會顯示在這裡</translation>
+        <translation>此物鏡的校正記錄會顯示在這裡</translation>
     </message>
     <message>
         <source>Use again</source>
@@ -510,7 +510,7 @@
     </message>
     <message>
         <source>Who</source>
-        <translation>人員</translation>
+        <translation>校正人員</translation>
     </message>
     <message>
         <source>Pixel size</source>
@@ -596,7 +596,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
   --image 檔案        開啟影像
   --table 檔案        匯入量測值表格
   --theme Dark|Light  本次執行使用的主題
-  --plugins 目錄      同時在此目錄中尋找外掛程式；可多次指定
+  --plugins 目錄      也在此目錄中尋找外掛程式；可多次指定
   --help              顯示此說明
   --version           顯示版本
 
@@ -612,7 +612,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>The counter that gets the clicks (1 to 9)</source>
-        <translation>接收點擊的計數器（1 至 9）</translation>
+        <translation>接收點擊的計數器（按鍵 1 至 9）</translation>
     </message>
     <message>
         <source>Count another class</source>
@@ -750,7 +750,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
-        <translation>位元組順序記號 (BOM)，供預設不使用 UTF-8 的試算表軟體辨識</translation>
+        <translation>位元組順序標記 (BOM)，供預設不使用 UTF-8 的試算表軟體辨識</translation>
     </message>
     <message>
         <source>Apostrophe before names that spreadsheets take for formulas</source>
@@ -935,15 +935,15 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>The measurements were not restored.</source>
-        <translation>未能還原量測。</translation>
+        <translation>未能還原量測資料。</translation>
     </message>
     <message>
         <source>Restoring measurements</source>
-        <translation>正在還原量測</translation>
+        <translation>正在還原量測資料</translation>
     </message>
     <message>
         <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>已還原量測：%1（物件數：%2）</translation>
+        <translation>已還原量測資料：%1（物件數：%2）</translation>
     </message>
     <message>
         <source>Importing &quot;%1&quot;</source>
@@ -1093,7 +1093,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
-        <translation>檔案仍在原處。檔案受防寫保護，或沒有可用的垃圾桶。</translation>
+        <translation>檔案仍在原處。檔案有寫入保護，或沒有可用的垃圾桶。</translation>
     </message>
 </context>
 <context>
@@ -1443,7 +1443,7 @@ Dropped, because newer ones came first: %1</source>
     <name>KvDeskRecoveryBar</name>
     <message>
         <source>Show other measurements that were not saved</source>
-        <translation>顯示其他尚未儲存的量測</translation>
+        <translation>顯示其他尚未儲存的量測資料</translation>
     </message>
     <message>
         <source>Restore</source>
@@ -1451,7 +1451,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Open these measurements as a session with unsaved changes</source>
-        <translation>將這些量測開啟為含有未儲存變更的工作階段</translation>
+        <translation>將這些量測資料開啟為含有未儲存變更的工作階段</translation>
     </message>
     <message>
         <source>Discard</source>
@@ -1459,7 +1459,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Delete these measurements for good</source>
-        <translation>永久刪除這些量測</translation>
+        <translation>永久刪除這些量測資料</translation>
     </message>
     <message>
         <source>%1: %2</source>
@@ -1475,7 +1475,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Measurements from %1 were not saved.</source>
-        <translation>%1 的量測尚未儲存。</translation>
+        <translation>%1 的量測資料尚未儲存。</translation>
     </message>
 </context>
 <context>
@@ -1502,11 +1502,11 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Selected values: %1</source>
-        <translation>選取的數值：%1</translation>
+        <translation>已選取 %1 個數值</translation>
     </message>
     <message>
         <source>&quot;%1&quot; among them: %2</source>
-        <translation>其中「%1」：%2</translation>
+        <translation>其中「%1」：%2 個</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -1592,7 +1592,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>System default</source>
-        <translation>系統預設值</translation>
+        <translation>系統預設</translation>
     </message>
     <message>
         <source>Nothing was changed yet</source>
@@ -1712,7 +1712,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Choose a camera or another source</source>
-        <translation>選擇相機或其他來源</translation>
+        <translation>選擇相機或其他影像來源</translation>
     </message>
     <message>
         <source>Calibrate</source>
@@ -1728,7 +1728,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
-        <translation>在影像上拖曳出一條直線，其長度會立即列出。報告面板可將所有數值產生為 PDF。</translation>
+        <translation>在影像上拖曳出一條直線，其長度會立即列出。報告面板可用所有數值產生 PDF。</translation>
     </message>
     <message>
         <source>Examples to try</source>
@@ -1805,7 +1805,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Clear the status log</source>
-        <translation>清除狀態記錄</translation>
+        <translation>清空狀態記錄</translation>
     </message>
     <message>
         <source>Messages of the program and its plug-ins appear here</source>
@@ -1823,7 +1823,7 @@ Dropped, because newer ones came first: %1</source>
 Reported by %2</source>
         <comment>message, source</comment>
         <translation>%1
-回報者：%2</translation>
+來源：%2</translation>
     </message>
     <message>
         <source>Category</source>
@@ -2024,7 +2024,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>Discard</source>
-        <translation>捨棄</translation>
+        <translation>不儲存</translation>
     </message>
     <message>
         <source>&amp;Yes</source>
@@ -2292,7 +2292,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>An object of type &quot;%1&quot; cannot have this number of points (%2)</source>
-        <translation>「%1」類型的物件不能有這個數目的點（%2）</translation>
+        <translation>「%1」類型物件的點數不能為 %2</translation>
     </message>
     <message>
         <source>A point must be a list of two numbers between -1e9 and 1e9</source>
@@ -2372,7 +2372,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>The file is write-protected</source>
-        <translation>檔案受防寫保護</translation>
+        <translation>檔案有寫入保護</translation>
     </message>
     <message>
         <source>Writing was cancelled</source>
@@ -2407,7 +2407,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>The picture has %1 x %2 pixels, which is too many</source>
-        <translation>影像為 %1 x %2 像素，超出上限</translation>
+        <translation>影像為 %1 × %2 像素，超出上限</translation>
     </message>
     <message>
         <source>The picture cannot be decoded (%1)</source>

@@ -530,12 +530,12 @@
     <message>
         <source>%1 μm</source>
         <comment>size of a pixel</comment>
-        <translation>%1 μm</translation>
+        <translation>%1 μm</translation>
     </message>
     <message>
         <source>%1 × %2 μm</source>
         <comment>width and height of a pixel</comment>
-        <translation>%1 × %2 μm</translation>
+        <translation>%1 × %2 μm</translation>
     </message>
     <message>
         <source>Known distance</source>
@@ -600,7 +600,7 @@ Mesure des objets sur des images et affiche leurs valeurs.
   --help              afficher ce texte
   --version           afficher la version
 
-STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
+La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de plug-ins.
 </translation>
     </message>
 </context>
@@ -671,7 +671,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     <name>KvDeskExamples</name>
     <message>
         <source>Coin: first length</source>
-        <translation>Monnaie : longueur</translation>
+        <translation>Pièce : longueur</translation>
     </message>
     <message>
         <source>Plate: dimensions</source>
@@ -1102,7 +1102,7 @@ STATREPORT_PLUGINS (variable d’environnement) : autres dossiers de plug-ins.
     <message>
         <source>%1 × %2 px</source>
         <comment>width, height</comment>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2 px</translation>
     </message>
 </context>
 <context>
@@ -1457,7 +1457,7 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     </message>
     <message>
         <source>Discard</source>
-        <translation>Abandonner</translation>
+        <translation>Supprimer</translation>
     </message>
     <message>
         <source>Delete these measurements for good</source>
@@ -1731,7 +1731,7 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     </message>
     <message>
         <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
-        <translation>Tracez une ligne sur l’image en faisant glisser la souris : sa longueur s’affiche aussitôt dans la liste. Le panneau de rapport crée un PDF de toutes les valeurs.</translation>
+        <translation>Tracez une ligne sur l’image en faisant glisser la souris : sa longueur s’affiche aussitôt dans la liste. Le panneau de rapport crée un PDF avec toutes les valeurs.</translation>
     </message>
     <message>
         <source>Examples to try</source>
@@ -1769,7 +1769,7 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     <name>KvDeskStatusBar</name>
     <message>
         <source>%1 × %2 px</source>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2 px</translation>
     </message>
     <message>
         <source>%1 %</source>
@@ -2027,7 +2027,7 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>Discard</source>
-        <translation>Abandonner</translation>
+        <translation>Ne pas enregistrer</translation>
     </message>
     <message>
         <source>&amp;Yes</source>
@@ -2271,7 +2271,7 @@ Signalé par %2</translation>
     </message>
     <message>
         <source>This must be a whole number from 1</source>
-        <translation>Un nombre entier à partir de 1 est attendu ici</translation>
+        <translation>Un nombre entier supérieur ou égal à 1 est attendu ici</translation>
     </message>
     <message>
         <source>This must be a number</source>

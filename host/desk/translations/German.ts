@@ -286,7 +286,7 @@
     </message>
     <message>
         <source>Count by clicks</source>
-        <translation>Mit Klicks zählen</translation>
+        <translation>Durch Klicken zählen</translation>
     </message>
     <message>
         <source>&amp;Text note</source>
@@ -487,7 +487,7 @@
     </message>
     <message>
         <source>Measure with this pixel size and remember it</source>
-        <translation>Mit dieser Pixelgröße messen und sie merken</translation>
+        <translation>Mit dieser Pixelgröße messen und sie speichern</translation>
     </message>
     <message>
         <source>Complete the fields above first</source>
@@ -530,12 +530,12 @@
     <message>
         <source>%1 μm</source>
         <comment>size of a pixel</comment>
-        <translation>%1 μm</translation>
+        <translation>%1 μm</translation>
     </message>
     <message>
         <source>%1 × %2 μm</source>
         <comment>width and height of a pixel</comment>
-        <translation>%1 × %2 μm</translation>
+        <translation>%1 × %2 μm</translation>
     </message>
     <message>
         <source>Known distance</source>
@@ -1102,7 +1102,7 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     <message>
         <source>%1 × %2 px</source>
         <comment>width, height</comment>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2 px</translation>
     </message>
 </context>
 <context>
@@ -1142,7 +1142,7 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     </message>
     <message>
         <source>Use selected line</source>
-        <translation>Gewählte Linie nutzen</translation>
+        <translation>Auswahl verwenden</translation>
     </message>
     <message>
         <source>Length of the line</source>
@@ -1171,7 +1171,7 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     </message>
     <message>
         <source>Take the selected line as the known distance</source>
-        <translation>Die ausgewählte Linie als bekannte Strecke nehmen</translation>
+        <translation>Die ausgewählte Linie als bekannte Strecke verwenden</translation>
     </message>
     <message>
         <source>Select one line on the image first</source>
@@ -1191,7 +1191,7 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     <message>
         <source>%1 fps</source>
         <extracomment>frames per second</extracomment>
-        <translation>%1 fps</translation>
+        <translation>%1 fps</translation>
     </message>
     <message>
         <source>%1 delivers no pictures any more; this is the last one</source>
@@ -1237,7 +1237,7 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
     </message>
     <message>
         <source>Stop the live image; other programs can use the camera then</source>
-        <translation>Livebild beenden; andere Programme können die Kamera dann verwenden</translation>
+        <translation>Livebild anhalten; andere Programme können die Kamera dann verwenden</translation>
     </message>
 </context>
 <context>
@@ -1769,7 +1769,7 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
     <name>KvDeskStatusBar</name>
     <message>
         <source>%1 × %2 px</source>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2 px</translation>
     </message>
     <message>
         <source>%1 %</source>
@@ -1834,7 +1834,7 @@ Gemeldet von %2</translation>
     </message>
     <message>
         <source>Time</source>
-        <translation>Zeit</translation>
+        <translation>Uhrzeit</translation>
     </message>
     <message>
         <source>Message</source>

@@ -97,7 +97,7 @@
     </message>
     <message>
         <source>Show or hide the measured values</source>
-        <translation>Mostra o nasconde i valori misurati</translation>
+        <translation>Mostra o nascondi i valori misurati</translation>
     </message>
     <message>
         <source>Stat&amp;us log</source>
@@ -105,7 +105,7 @@
     </message>
     <message>
         <source>Show or hide the status log</source>
-        <translation>Mostra o nasconde il registro di stato</translation>
+        <translation>Mostra o nascondi il registro di stato</translation>
     </message>
     <message>
         <source>&amp;Dark or light theme</source>
@@ -158,7 +158,7 @@
     </message>
     <message>
         <source>Redo what was undone</source>
-        <translation>Ripete l&apos;operazione annullata</translation>
+        <translation>Ripeti l&apos;operazione annullata</translation>
     </message>
     <message>
         <source>Cu&amp;t</source>
@@ -242,7 +242,7 @@
     </message>
     <message>
         <source>Parallel &amp;distance</source>
-        <translation>&amp;Distanza parallela</translation>
+        <translation>&amp;Distanza punto-linea</translation>
     </message>
     <message>
         <source>Measure the distance of a point from a line</source>
@@ -350,7 +350,7 @@
     </message>
     <message>
         <source>Show or hide the labels of objects</source>
-        <translation>Mostra o nasconde le etichette degli oggetti</translation>
+        <translation>Mostra o nascondi le etichette degli oggetti</translation>
     </message>
     <message>
         <source>&amp;Rulers</source>
@@ -358,7 +358,7 @@
     </message>
     <message>
         <source>Show or hide the rulers</source>
-        <translation>Mostra o nasconde i righelli</translation>
+        <translation>Mostra o nascondi i righelli</translation>
     </message>
     <message>
         <source>&amp;Scale bar on the image</source>
@@ -366,7 +366,7 @@
     </message>
     <message>
         <source>Show or hide the scale bar, on reports, too</source>
-        <translation>Mostra o nasconde la barra di scala, anche nei report</translation>
+        <translation>Mostra o nascondi la barra di scala, anche nei report</translation>
     </message>
     <message>
         <source>&amp;Gallery</source>
@@ -374,7 +374,7 @@
     </message>
     <message>
         <source>Show or hide the gallery</source>
-        <translation>Mostra o nasconde la galleria</translation>
+        <translation>Mostra o nascondi la galleria</translation>
     </message>
     <message>
         <source>&amp;Start page</source>
@@ -487,7 +487,7 @@
     </message>
     <message>
         <source>Measure with this pixel size and remember it</source>
-        <translation>Misura con questa dimensione pixel e la memorizza</translation>
+        <translation>Misura con questa dimensione pixel e memorizzala</translation>
     </message>
     <message>
         <source>Complete the fields above first</source>
@@ -683,7 +683,7 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     </message>
     <message>
         <source>Fibres: statistics</source>
-        <translation>Fibre: statistica</translation>
+        <translation>Fibre: statistiche</translation>
     </message>
 </context>
 <context>
@@ -923,7 +923,7 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     </message>
     <message>
         <source>Neither a session, an image nor a table: %1</source>
-        <translation>Non è una sessione, un&apos;immagine o una tabella: %1</translation>
+        <translation>Non è né una sessione, né un&apos;immagine, né una tabella: %1</translation>
     </message>
     <message>
         <source>There is not enough memory</source>
@@ -1094,7 +1094,7 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     </message>
     <message>
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
-        <translation>I file sono ancora al loro posto. Sono protetti da scrittura o per essi non c&apos;è un cestino.</translation>
+        <translation>I file sono ancora al loro posto. Sono protetti da scrittura oppure per loro non è disponibile un cestino.</translation>
     </message>
 </context>
 <context>
@@ -1453,7 +1453,7 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     </message>
     <message>
         <source>Open these measurements as a session with unsaved changes</source>
-        <translation>Apre queste misure come sessione con modifiche non salvate</translation>
+        <translation>Apri queste misure come sessione con modifiche non salvate</translation>
     </message>
     <message>
         <source>Discard</source>
@@ -1671,7 +1671,7 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     </message>
     <message>
         <source>Play the images of a folder like a camera</source>
-        <translation>Riproduce le immagini di una cartella come una telecamera</translation>
+        <translation>Riproduci le immagini di una cartella come una telecamera</translation>
     </message>
     <message>
         <source>&amp;Video...</source>
@@ -1679,7 +1679,7 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     </message>
     <message>
         <source>Play a video like a camera</source>
-        <translation>Riproduce un video come una telecamera</translation>
+        <translation>Riproduci un video come una telecamera</translation>
     </message>
     <message>
         <source>Looking for cameras...</source>
@@ -1711,7 +1711,7 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     </message>
     <message>
         <source>A picture file, or the live image of a camera.</source>
-        <translation>Un file di immagine o l&apos;immagine dal vivo di una telecamera.</translation>
+        <translation>Un file immagine o l&apos;immagine dal vivo di una telecamera.</translation>
     </message>
     <message>
         <source>Choose a camera or another source</source>
@@ -1731,7 +1731,7 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     </message>
     <message>
         <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
-        <translation>Trascinare una linea sull&apos;immagine: la sua lunghezza appare subito nell&apos;elenco. Il pannello del report crea un PDF con tutti i valori.</translation>
+        <translation>Tracciare una linea sull&apos;immagine: la sua lunghezza appare subito nell&apos;elenco. Il pannello del report crea un PDF con tutti i valori.</translation>
     </message>
     <message>
         <source>Examples to try</source>
@@ -1762,7 +1762,7 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation>Informazione</translation>
+        <translation>Informazioni</translation>
     </message>
 </context>
 <context>
@@ -2161,7 +2161,7 @@ Segnalato da %2</translation>
     </message>
     <message>
         <source>Parallel distance</source>
-        <translation>Distanza parallela</translation>
+        <translation>Distanza punto-linea</translation>
     </message>
     <message>
         <source>Distance</source>

@@ -9,7 +9,7 @@
     </message>
     <message>
         <source>Start an empty session</source>
-        <translation>空のセッションを開始します</translation>
+        <translation>空のセッションを開始</translation>
     </message>
     <message>
         <source>Open &amp;image...</source>
@@ -101,7 +101,7 @@
     </message>
     <message>
         <source>Stat&amp;us log</source>
-        <translation>ステータスログ(&amp;T)</translation>
+        <translation>ステータスログ(&amp;U)</translation>
     </message>
     <message>
         <source>Show or hide the status log</source>
@@ -330,11 +330,11 @@
     </message>
     <message>
         <source>Snapshots &amp;with measurements</source>
-        <translation>測定付きスナップショット(&amp;E)</translation>
+        <translation>測定結果付きスナップショット(&amp;W)</translation>
     </message>
     <message>
         <source>Draw the measured objects on snapshots</source>
-        <translation>測定したオブジェクトをスナップショットに描画</translation>
+        <translation>測定オブジェクトをスナップショットに描画</translation>
     </message>
     <message>
         <source>&amp;Freeze</source>
@@ -419,7 +419,7 @@
     </message>
     <message>
         <source>Choose an objective, or type the name of a new one</source>
-        <translation>対物レンズを選択するか、新しい名前を入力します</translation>
+        <translation>対物レンズを選択するか、新しい対物レンズの名前を入力します</translation>
     </message>
     <message>
         <source>Such as 10x</source>
@@ -632,7 +632,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>&amp;Undo %1</source>
         <extracomment>%1 is what is undone or redone, such as &quot;move of Line 3&quot;</extracomment>
-        <translation>元に戻す: %1(&amp;U)</translation>
+        <translation>元に戻す(&amp;U): %1</translation>
     </message>
     <message>
         <source>&amp;Undo</source>
@@ -640,7 +640,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>&amp;Redo %1</source>
-        <translation>やり直し: %1(&amp;R)</translation>
+        <translation>やり直し(&amp;R): %1</translation>
     </message>
     <message>
         <source>&amp;Redo</source>
@@ -671,7 +671,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <name>KvDeskExamples</name>
     <message>
         <source>Coin: first length</source>
-        <translation>コイン: 長さ測定</translation>
+        <translation>コイン: はじめての測定</translation>
     </message>
     <message>
         <source>Plate: dimensions</source>
@@ -1157,7 +1157,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>Draw a line over a distance that you know, such as on a stage micrometer, and select it.</source>
-        <translation>対物ミクロメーターなど、距離がわかっている箇所に直線を引いて選択してください。</translation>
+        <translation>対物ミクロメーターなど、距離がわかっている箇所に直線を引き、その直線を選択してください。</translation>
     </message>
     <message>
         <source>No line yet</source>

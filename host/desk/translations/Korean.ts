@@ -9,7 +9,7 @@
     </message>
     <message>
         <source>Start an empty session</source>
-        <translation>빈 세션을 시작합니다</translation>
+        <translation>빈 세션 시작</translation>
     </message>
     <message>
         <source>Open &amp;image...</source>
@@ -101,7 +101,7 @@
     </message>
     <message>
         <source>Stat&amp;us log</source>
-        <translation>상태 로그(&amp;T)</translation>
+        <translation>상태 로그(&amp;U)</translation>
     </message>
     <message>
         <source>Show or hide the status log</source>
@@ -310,7 +310,7 @@
     </message>
     <message>
         <source>Say how large a pixel of the image is</source>
-        <translation>이미지의 픽셀 크기 지정</translation>
+        <translation>이미지의 픽셀 하나의 크기 지정</translation>
     </message>
     <message>
         <source>Use the file&apos;s pixel size</source>
@@ -330,11 +330,11 @@
     </message>
     <message>
         <source>Snapshots &amp;with measurements</source>
-        <translation>측정 포함 스냅샷(&amp;E)</translation>
+        <translation>측정 결과 포함 스냅샷(&amp;W)</translation>
     </message>
     <message>
         <source>Draw the measured objects on snapshots</source>
-        <translation>측정한 개체를 스냅샷에 그리기</translation>
+        <translation>측정 개체를 스냅샷에 그리기</translation>
     </message>
     <message>
         <source>&amp;Freeze</source>
@@ -389,7 +389,7 @@
     <name>KvDeskAutosave</name>
     <message>
         <source>the folder &quot;%1&quot; cannot be written</source>
-        <translation>“%1” 폴더에 쓸 수 없습니다</translation>
+        <translation>“%1” 폴더에 쓸 수 없음</translation>
     </message>
     <message>
         <source>Unsaved changes are not being copied: %1</source>
@@ -487,7 +487,7 @@
     </message>
     <message>
         <source>Measure with this pixel size and remember it</source>
-        <translation>이 픽셀 크기로 측정하고 기억합니다</translation>
+        <translation>이 픽셀 크기로 측정하고 이력에 저장합니다</translation>
     </message>
     <message>
         <source>Complete the fields above first</source>
@@ -632,7 +632,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>&amp;Undo %1</source>
         <extracomment>%1 is what is undone or redone, such as &quot;move of Line 3&quot;</extracomment>
-        <translation>실행 취소: %1(&amp;U)</translation>
+        <translation>실행 취소(&amp;U): %1</translation>
     </message>
     <message>
         <source>&amp;Undo</source>
@@ -640,7 +640,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>&amp;Redo %1</source>
-        <translation>다시 실행: %1(&amp;R)</translation>
+        <translation>다시 실행(&amp;R): %1</translation>
     </message>
     <message>
         <source>&amp;Redo</source>
@@ -671,11 +671,11 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <name>KvDeskExamples</name>
     <message>
         <source>Coin: first length</source>
-        <translation>동전: 첫 길이 측정</translation>
+        <translation>동전: 첫 측정</translation>
     </message>
     <message>
         <source>Plate: dimensions</source>
-        <translation>플레이트: 치수</translation>
+        <translation>금속판: 치수</translation>
     </message>
     <message>
         <source>Cells: counting</source>
@@ -750,7 +750,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
-        <translation>BOM 추가(UTF-8을 예상하지 않는 스프레드시트용)</translation>
+        <translation>BOM 추가(UTF-8을 기본으로 하지 않는 스프레드시트용)</translation>
     </message>
     <message>
         <source>Apostrophe before names that spreadsheets take for formulas</source>
@@ -795,7 +795,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>For spreadsheets. Headings name the units.</source>
-        <translation>스프레드시트용입니다. 머리글에 단위가 표시됩니다.</translation>
+        <translation>스프레드시트용입니다. 열 머리글에 단위가 표시됩니다.</translation>
     </message>
     <message>
         <source>For programs. Numbers always have a decimal point.</source>
@@ -1194,11 +1194,11 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>%1 delivers no pictures any more; this is the last one</source>
-        <translation>%1에서 더 이상 이미지가 들어오지 않습니다. 마지막 이미지입니다</translation>
+        <translation>%1에서 더 이상 이미지가 수신되지 않습니다. 마지막 이미지입니다</translation>
     </message>
     <message>
         <source>%1 delivers no pictures</source>
-        <translation>%1에서 이미지가 들어오지 않습니다</translation>
+        <translation>%1에서 이미지가 수신되지 않습니다</translation>
     </message>
     <message>
         <source>%1 is stopped</source>
@@ -1232,7 +1232,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Frames per second
 Dropped, because newer ones came first: %1</source>
         <translation>초당 프레임 수
-더 새로운 프레임이 먼저 들어와 버려짐: %1</translation>
+더 새로운 프레임이 먼저 도착하여 버린 수: %1</translation>
     </message>
     <message>
         <source>Stop the live image; other programs can use the camera then</source>
@@ -1618,7 +1618,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>No snapshot was taken: earlier ones are still being saved</source>
-        <translation>이전 스냅샷을 저장하는 중이라 스냅샷을 찍지 못했습니다</translation>
+        <translation>이전 스냅샷을 저장하는 중이므로 스냅샷을 찍지 못했습니다</translation>
     </message>
     <message>
         <source>Snapshot saved: %1</source>
@@ -1720,7 +1720,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Say how large a pixel is. The examples are calibrated already.</source>
-        <translation>픽셀의 크기를 지정합니다. 예제는 이미 교정되어 있습니다.</translation>
+        <translation>픽셀 하나의 크기를 지정합니다. 예제는 이미 교정되어 있습니다.</translation>
     </message>
     <message>
         <source>Measure and report</source>
@@ -1876,7 +1876,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>Type how large a pixel of the image is in reality.</source>
-        <translation>이미지의 픽셀이 실제로 얼마나 큰지 입력하세요.</translation>
+        <translation>이미지의 픽셀 하나가 실제로 얼마나 큰지 입력하세요.</translation>
     </message>
 </context>
 <context>
@@ -2069,7 +2069,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>%1 delivers pictures of a kind that cannot be shown</source>
-        <translation>%1에서 들어오는 이미지는 표시할 수 없는 형식입니다</translation>
+        <translation>%1에서 수신되는 이미지는 표시할 수 없는 형식입니다</translation>
     </message>
     <message>
         <source>The camera does not take the setting (%1)</source>
@@ -2227,14 +2227,14 @@ Reported by %2</source>
     <name>ZtKernelImage</name>
     <message>
         <source>%1 delivers pictures again</source>
-        <translation>%1에서 다시 이미지가 들어옵니다</translation>
+        <translation>%1에서 이미지가 다시 수신됩니다</translation>
     </message>
 </context>
 <context>
     <name>ZtLiveFrameSource</name>
     <message>
         <source>%1 has stopped delivering pictures; the last one stays</source>
-        <translation>%1에서 이미지가 들어오지 않게 되었습니다. 마지막 이미지를 계속 표시합니다</translation>
+        <translation>%1에서 이미지가 수신되지 않습니다. 마지막 이미지를 계속 표시합니다</translation>
     </message>
 </context>
 <context>
@@ -2466,7 +2466,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>%1 is not a finite number</source>
-        <translation>%1은(는) 유한한 숫자가 아닙니다</translation>
+        <translation>%1은(는) 유한한 수가 아닙니다</translation>
     </message>
     <message>
         <source>%1 is not a number</source>
@@ -2490,7 +2490,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>The first line announces %1 rows, but there are %2</source>
-        <translation>첫 줄에는 %1행으로 되어 있지만 실제로는 %2행입니다</translation>
+        <translation>첫 줄에는 %1행이 선언되어 있지만 실제로는 %2행입니다</translation>
     </message>
     <message>
         <source>The first line announces rows without values</source>
@@ -2510,7 +2510,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>행에 필드가 %1개 있지만 첫 줄에는 값 %2개와 클래스 하나로 되어 있습니다</translation>
+        <translation>행에는 필드가 %1개 있지만 첫 줄에는 값 %2개와 클래스 하나가 선언되어 있습니다</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>

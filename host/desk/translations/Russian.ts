@@ -29,7 +29,7 @@
     </message>
     <message>
         <source>Import &amp;table...</source>
-        <translation>Импортировать &amp;таблицу...</translation>
+        <translation>Импорт &amp;таблицы...</translation>
     </message>
     <message>
         <source>Import table of measured values</source>
@@ -286,7 +286,7 @@
     </message>
     <message>
         <source>Count by clicks</source>
-        <translation>Подсчитывать щелчками</translation>
+        <translation>Подсчитывать щелчками мыши</translation>
     </message>
     <message>
         <source>&amp;Text note</source>
@@ -342,7 +342,7 @@
     </message>
     <message>
         <source>Freeze the live image</source>
-        <translation>Остановить живое изображение</translation>
+        <translation>Зафиксировать текущий кадр живого изображения</translation>
     </message>
     <message>
         <source>&amp;Labels on the image</source>
@@ -389,7 +389,7 @@
     <name>KvDeskAutosave</name>
     <message>
         <source>the folder &quot;%1&quot; cannot be written</source>
-        <translation>нет доступа на запись в папку «%1»</translation>
+        <translation>запись в папку «%1» невозможна</translation>
     </message>
     <message>
         <source>Unsaved changes are not being copied: %1</source>
@@ -447,7 +447,7 @@
     </message>
     <message>
         <source>Name</source>
-        <translation>Имя</translation>
+        <translation>Название</translation>
     </message>
     <message>
         <source>Who</source>
@@ -463,7 +463,7 @@
     </message>
     <message>
         <source>History of the objective</source>
-        <translation>История объектива</translation>
+        <translation>История калибровок объектива</translation>
     </message>
     <message>
         <source>Calibrations of this objective appear here</source>
@@ -522,7 +522,7 @@
     </message>
     <message>
         <source>Name</source>
-        <translation>Имя</translation>
+        <translation>Название</translation>
     </message>
 </context>
 <context>
@@ -612,7 +612,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>The counter that gets the clicks (1 to 9)</source>
-        <translation>Счётчик, которому засчитываются щелчки (1–9)</translation>
+        <translation>Счётчик, которому засчитываются щелчки (клавиши 1–9)</translation>
     </message>
     <message>
         <source>Count another class</source>
@@ -664,7 +664,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>No measured objects were copied</source>
-        <translation>Измеренные объекты не скопированы</translation>
+        <translation>Нет скопированных измеренных объектов</translation>
     </message>
 </context>
 <context>
@@ -758,7 +758,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>Changes names that begin with =, +, - or @: they are others when the table is imported again</source>
-        <translation>Изменяет имена, начинающиеся с =, +, - или @: при обратном импорте таблицы они будут другими</translation>
+        <translation>Изменяет имена, начинающиеся с =, +, - или @: при обратном импорте таблицы они будут отличаться от исходных</translation>
     </message>
     <message>
         <source>Export...</source>
@@ -791,7 +791,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>For statistics programs. Can be imported here again.</source>
-        <translation>Для программ статистики. Можно снова импортировать сюда.</translation>
+        <translation>Для программ статистики. Такую таблицу можно снова импортировать.</translation>
     </message>
     <message>
         <source>For spreadsheets. Headings name the units.</source>
@@ -1159,7 +1159,7 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message>
         <source>Draw a line over a distance that you know, such as on a stage micrometer, and select it.</source>
-        <translation>Проведите линию вдоль известного расстояния, например по объект-микрометру, и выделите её.</translation>
+        <translation>Проведите линию вдоль отрезка известной длины, например по шкале объект-микрометра, и выделите её.</translation>
     </message>
     <message>
         <source>No line yet</source>
@@ -1520,7 +1520,7 @@ Dropped, because newer ones came first: %1</source>
     </message>
     <message>
         <source>Standard deviation: %1</source>
-        <translation>Среднеквадратическое отклонение (СКО): %1</translation>
+        <translation>Среднее квадратическое отклонение (СКО): %1</translation>
     </message>
     <message>
         <source>Smallest: %1</source>
@@ -1870,7 +1870,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>Same size in both directions</source>
-        <translation>Одинаково в обоих направлениях</translation>
+        <translation>Одинаковый размер в обоих направлениях</translation>
     </message>
     <message>
         <source>Width</source>
@@ -2413,7 +2413,7 @@ Reported by %2</source>
     </message>
     <message>
         <source>The picture has %1 x %2 pixels, which is too many</source>
-        <translation>Размер изображения %1 x %2 пикселей слишком велик</translation>
+        <translation>Размер изображения %1 × %2 пикселей слишком велик</translation>
     </message>
     <message>
         <source>The picture cannot be decoded (%1)</source>

@@ -89,7 +89,7 @@
     </message>
     <message>
         <source>Show the image at 100 %</source>
-        <translation>Zobraziť obrázok na 100 %</translation>
+        <translation>Zobraziť obrázok na 100 %</translation>
     </message>
     <message>
         <source>&amp;Measured values</source>
@@ -286,7 +286,7 @@
     </message>
     <message>
         <source>Count by clicks</source>
-        <translation>Počítať kliknutiami</translation>
+        <translation>Počítať klikaním</translation>
     </message>
     <message>
         <source>&amp;Text note</source>
@@ -530,12 +530,12 @@
     <message>
         <source>%1 μm</source>
         <comment>size of a pixel</comment>
-        <translation>%1 μm</translation>
+        <translation>%1 μm</translation>
     </message>
     <message>
         <source>%1 × %2 μm</source>
         <comment>width and height of a pixel</comment>
-        <translation>%1 × %2 μm</translation>
+        <translation>%1 × %2 μm</translation>
     </message>
     <message>
         <source>Known distance</source>
@@ -1103,7 +1103,7 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     <message>
         <source>%1 × %2 px</source>
         <comment>width, height</comment>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2 px</translation>
     </message>
 </context>
 <context>
@@ -1159,7 +1159,7 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     </message>
     <message>
         <source>Draw a line over a distance that you know, such as on a stage micrometer, and select it.</source>
-        <translation>Nakreslite úsečku cez známu vzdialenosť, napríklad na objektovom mikrometri, a vyberte ju.</translation>
+        <translation>Nakreslite úsečku cez známu dĺžku, napríklad na objektovom mikrometri, a vyberte ju.</translation>
     </message>
     <message>
         <source>No line yet</source>
@@ -1192,7 +1192,7 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     <message>
         <source>%1 fps</source>
         <extracomment>frames per second</extracomment>
-        <translation>%1 sn./s</translation>
+        <translation>%1 sn./s</translation>
     </message>
     <message>
         <source>%1 delivers no pictures any more; this is the last one</source>
@@ -1266,7 +1266,7 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     <message>
         <source>%1[*] - Measuring Desk</source>
         <extracomment>%1 is the name of a session; [*] is replaced by a star when it has unsaved changes</extracomment>
-        <translation>%1[*] - Measuring Desk</translation>
+        <translation>%1[*] – Measuring Desk</translation>
     </message>
     <message>
         <source>None yet</source>
@@ -1566,7 +1566,7 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     </message>
     <message>
         <source>Another language takes effect when the program is started again.</source>
-        <translation>Zmena jazyka sa prejaví po novom spustení programu.</translation>
+        <translation>Zmena jazyka sa prejaví po opätovnom spustení programu.</translation>
     </message>
     <message>
         <source>Measured values</source>
@@ -1701,7 +1701,7 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     </message>
     <message>
         <source>Back to the image</source>
-        <translation>Späť na obrázok</translation>
+        <translation>Späť k obrázku</translation>
     </message>
     <message>
         <source>%1 (%2)</source>
@@ -1772,12 +1772,12 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     <name>KvDeskStatusBar</name>
     <message>
         <source>%1 × %2 px</source>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2 px</translation>
     </message>
     <message>
         <source>%1 %</source>
         <comment>zoom</comment>
-        <translation>%1 %</translation>
+        <translation>%1 %</translation>
     </message>
     <message>
         <source>x %1, y %2</source>
@@ -2294,7 +2294,7 @@ Ohlásil: %2</translation>
     </message>
     <message>
         <source>&quot;%1&quot; is not a type of objects</source>
-        <translation>„%1“ nie je typ objektov</translation>
+        <translation>„%1“ nie je typ objektu</translation>
     </message>
     <message>
         <source>An object of type &quot;%1&quot; cannot have this number of points (%2)</source>
@@ -2346,7 +2346,7 @@ Ohlásil: %2</translation>
     </message>
     <message>
         <source>The file is nested too deeply</source>
-        <translation>Súbor je príliš hlboko vnorený</translation>
+        <translation>Štruktúra súboru je príliš hlboko vnorená</translation>
     </message>
     <message>
         <source>The file is not valid JSON (%1)</source>

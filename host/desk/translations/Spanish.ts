@@ -242,7 +242,7 @@
     </message>
     <message>
         <source>Parallel &amp;distance</source>
-        <translation>&amp;Distancia paralela</translation>
+        <translation>&amp;Distancia punto-línea</translation>
     </message>
     <message>
         <source>Measure the distance of a point from a line</source>
@@ -683,7 +683,7 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     </message>
     <message>
         <source>Fibres: statistics</source>
-        <translation>Fibras: estadística</translation>
+        <translation>Fibras: estadísticas</translation>
     </message>
 </context>
 <context>
@@ -1142,7 +1142,7 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     </message>
     <message>
         <source>Use selected line</source>
-        <translation>Usar la línea seleccionada</translation>
+        <translation>Usar línea seleccionada</translation>
     </message>
     <message>
         <source>Length of the line</source>
@@ -1731,7 +1731,7 @@ Descartados porque llegaron antes otros más nuevos: %1</translation>
     </message>
     <message>
         <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
-        <translation>Arrastre una línea sobre la imagen: su longitud aparece al momento en la lista. El panel de informes crea un PDF con todos los valores.</translation>
+        <translation>Trace una línea sobre la imagen: su longitud aparece al momento en la lista. El panel de informes crea un PDF con todos los valores.</translation>
     </message>
     <message>
         <source>Examples to try</source>
@@ -2076,7 +2076,7 @@ Notificado por %2</translation>
     </message>
     <message>
         <source>The camera does not take the setting (%1)</source>
-        <translation>La cámara no acepta el ajuste (%1)</translation>
+        <translation>La cámara no acepta la configuración (%1)</translation>
     </message>
     <message>
         <source>%1 cannot be opened (%2)</source>
@@ -2161,7 +2161,7 @@ Notificado por %2</translation>
     </message>
     <message>
         <source>Parallel distance</source>
-        <translation>Distancia paralela</translation>
+        <translation>Distancia punto-línea</translation>
     </message>
     <message>
         <source>Distance</source>

@@ -13,7 +13,7 @@
     </message>
     <message>
         <source>Opens Report Template Editor</source>
-        <translation>يفتح محرر قوالب التقارير</translation>
+        <translation>فتح محرر قوالب التقارير</translation>
     </message>
     <message>
         <source>Generate Report File</source>
@@ -21,7 +21,7 @@
     </message>
     <message>
         <source>Exports current measurments to pdf file.</source>
-        <translation>يصدّر القياسات الحالية إلى ملف PDF.</translation>
+        <translation>تصدير القياسات الحالية إلى ملف PDF.</translation>
     </message>
     <message>
         <source>Open Statistics Window</source>
@@ -37,7 +37,7 @@
     </message>
     <message>
         <source>Opens default template for report generation</source>
-        <translation>يفتح القالب الافتراضي لإنشاء التقارير</translation>
+        <translation>اختيار القالب الافتراضي لإنشاء التقارير</translation>
     </message>
 </context>
 <context>
@@ -93,11 +93,11 @@
     </message>
     <message>
         <source>Camera Image View</source>
-        <translation>عرض صورة الكاميرا</translation>
+        <translation>صورة الكاميرا</translation>
     </message>
     <message>
         <source>Image View</source>
-        <translation>عرض صورة</translation>
+        <translation>صورة</translation>
     </message>
     <message>
         <source>Statistics</source>
@@ -124,7 +124,7 @@
     <name>KvCameraImageNodeOptionsWidget</name>
     <message>
         <source>Camera image view</source>
-        <translation>عرض صورة الكاميرا</translation>
+        <translation>صورة الكاميرا</translation>
     </message>
     <message>
         <source>Render measurements</source>
@@ -139,7 +139,7 @@
     <name>KvCameraImageWidget</name>
     <message>
         <source>Camera Image View</source>
-        <translation>عرض صورة الكاميرا</translation>
+        <translation>صورة الكاميرا</translation>
     </message>
 </context>
 <context>
@@ -263,7 +263,7 @@ Do you want to replace it?</source>
     <name>KvImageNodeOptionsWidget</name>
     <message>
         <source>Image view</source>
-        <translation>عرض صورة</translation>
+        <translation>صورة</translation>
     </message>
     <message>
         <source>Browse</source>
@@ -286,14 +286,14 @@ Do you want to replace it?</source>
     <name>KvImageWidget</name>
     <message>
         <source>Image View</source>
-        <translation>عرض صورة</translation>
+        <translation>صورة</translation>
     </message>
 </context>
 <context>
     <name>KvPageCountWidget</name>
     <message>
         <source>Page count</source>
-        <translation>عدد الصفحات</translation>
+        <translation>رقم الصفحة</translation>
     </message>
 </context>
 <context>
@@ -636,7 +636,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Save as ...</source>
-        <translation>حفظ باسم ...</translation>
+        <translation>حفظ باسم...</translation>
     </message>
     <message>
         <source>Save</source>

@@ -21,7 +21,7 @@
     </message>
     <message>
         <source>Exports current measurments to pdf file.</source>
-        <translation>将当前测量结果导出为 PDF 文件。</translation>
+        <translation>将当前测量数据导出为 PDF 文件。</translation>
     </message>
     <message>
         <source>Open Statistics Window</source>
@@ -85,7 +85,7 @@
     <name>KvBaseEditorNodeFactory</name>
     <message>
         <source>Measurements Table</source>
-        <translation>测量表</translation>
+        <translation>测量数据表</translation>
     </message>
     <message>
         <source>Text Document</source>
@@ -113,7 +113,7 @@
     </message>
     <message>
         <source>Min / Median / Max Box</source>
-        <translation>最小/中位/最大箱线图</translation>
+        <translation>最小值/中位数/最大值箱线图</translation>
     </message>
     <message>
         <source>Trend</source>
@@ -238,7 +238,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Measurement</source>
-        <translation>测量</translation>
+        <translation>测量类型</translation>
     </message>
 </context>
 <context>
@@ -293,7 +293,7 @@ Do you want to replace it?</source>
     <name>KvPageCountWidget</name>
     <message>
         <source>Page count</source>
-        <translation>页数</translation>
+        <translation>页码</translation>
     </message>
 </context>
 <context>
@@ -413,7 +413,7 @@ Do you want to replace it?</source>
     <name>KvStatisticsMeasurementsTableOptionsWidget</name>
     <message>
         <source>Measurements table</source>
-        <translation>测量表</translation>
+        <translation>测量数据表</translation>
     </message>
     <message>
         <source>Order by:</source>
@@ -436,7 +436,7 @@ Do you want to replace it?</source>
     <name>KvStatisticsMeasurementsTableWidget</name>
     <message>
         <source>Measurements Table</source>
-        <translation>测量表</translation>
+        <translation>测量数据表</translation>
     </message>
 </context>
 <context>
@@ -511,7 +511,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Choose a statistics view on the right.</source>
-        <translation>请在侧边栏中选择统计视图。</translation>
+        <translation>请在右侧选择一个统计视图。</translation>
     </message>
     <message>
         <source>No statistics blocks are installed.</source>
@@ -557,7 +557,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Save the template to another file</source>
-        <translation>将模板保存为其他文件</translation>
+        <translation>将模板另存为其他文件</translation>
     </message>
     <message>
         <source>Save the template</source>
@@ -589,7 +589,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Are you sure?</source>
-        <translation>确定要继续吗？</translation>
+        <translation>确认</translation>
     </message>
     <message>
         <source>The template is modified, do you want to save it first?</source>
@@ -621,7 +621,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>[new]</source>
-        <translation>[新建]</translation>
+        <translation>[新模板]</translation>
     </message>
 </context>
 <context>
@@ -636,7 +636,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Save as ...</source>
-        <translation>另存为 ...</translation>
+        <translation>另存为...</translation>
     </message>
     <message>
         <source>Save</source>

@@ -21,7 +21,7 @@
     </message>
     <message>
         <source>Exports current measurments to pdf file.</source>
-        <translation>將目前的量測結果匯出為 PDF 檔案。</translation>
+        <translation>將目前的量測資料匯出為 PDF 檔案。</translation>
     </message>
     <message>
         <source>Open Statistics Window</source>
@@ -85,7 +85,7 @@
     <name>KvBaseEditorNodeFactory</name>
     <message>
         <source>Measurements Table</source>
-        <translation>量測表</translation>
+        <translation>量測資料表</translation>
     </message>
     <message>
         <source>Text Document</source>
@@ -113,7 +113,7 @@
     </message>
     <message>
         <source>Min / Median / Max Box</source>
-        <translation>最小/中位/最大盒鬚圖</translation>
+        <translation>最小值/中位數/最大值盒鬚圖</translation>
     </message>
     <message>
         <source>Trend</source>
@@ -238,7 +238,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Measurement</source>
-        <translation>量測</translation>
+        <translation>量測類型</translation>
     </message>
 </context>
 <context>
@@ -293,7 +293,7 @@ Do you want to replace it?</source>
     <name>KvPageCountWidget</name>
     <message>
         <source>Page count</source>
-        <translation>頁數</translation>
+        <translation>頁碼</translation>
     </message>
 </context>
 <context>
@@ -413,7 +413,7 @@ Do you want to replace it?</source>
     <name>KvStatisticsMeasurementsTableOptionsWidget</name>
     <message>
         <source>Measurements table</source>
-        <translation>量測表</translation>
+        <translation>量測資料表</translation>
     </message>
     <message>
         <source>Order by:</source>
@@ -436,7 +436,7 @@ Do you want to replace it?</source>
     <name>KvStatisticsMeasurementsTableWidget</name>
     <message>
         <source>Measurements Table</source>
-        <translation>量測表</translation>
+        <translation>量測資料表</translation>
     </message>
 </context>
 <context>
@@ -511,7 +511,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Choose a statistics view on the right.</source>
-        <translation>請在側邊欄中選擇統計檢視。</translation>
+        <translation>請在右側選擇一個統計檢視。</translation>
     </message>
     <message>
         <source>No statistics blocks are installed.</source>
@@ -557,7 +557,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Save the template to another file</source>
-        <translation>將範本儲存為其他檔案</translation>
+        <translation>將範本另存為其他檔案</translation>
     </message>
     <message>
         <source>Save the template</source>
@@ -589,7 +589,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Are you sure?</source>
-        <translation>確定要繼續嗎？</translation>
+        <translation>確認</translation>
     </message>
     <message>
         <source>The template is modified, do you want to save it first?</source>
@@ -632,11 +632,11 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Clear</source>
-        <translation>清除</translation>
+        <translation>清空</translation>
     </message>
     <message>
         <source>Save as ...</source>
-        <translation>另存新檔 ...</translation>
+        <translation>另存新檔...</translation>
     </message>
     <message>
         <source>Save</source>

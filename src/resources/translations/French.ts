@@ -113,7 +113,7 @@
     </message>
     <message>
         <source>Min / Median / Max Box</source>
-        <translation>Boîte min / médiane / max</translation>
+        <translation>Boîte à moustaches</translation>
     </message>
     <message>
         <source>Trend</source>
@@ -323,11 +323,11 @@ Voulez-vous le remplacer&#xa0;?</translation>
     <name>KvReportGlyphs</name>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1</source>
-        <translation>Aucune police installée ne contient ces caractères, le rapport les omet&#xa0;: %1</translation>
+        <translation>Aucune police installée ne contient ces caractères ; le rapport les omet : %1</translation>
     </message>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
-        <translation>Aucune police installée ne contient ces caractères, le rapport les omet&#xa0;: %1 (polices à installer&#xa0;: %2)</translation>
+        <translation>Aucune police installée ne contient ces caractères ; le rapport les omet : %1 (polices à installer : %2)</translation>
     </message>
 </context>
 <context>
@@ -775,7 +775,7 @@ Voulez-vous le remplacer&#xa0;?</translation>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>Outils statistiques</translation>
+        <translation>Rapport et statistiques</translation>
     </message>
     <message>
         <source>Select Template File</source>

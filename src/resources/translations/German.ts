@@ -113,7 +113,7 @@
     </message>
     <message>
         <source>Min / Median / Max Box</source>
-        <translation>Min-/Median-/Max-Box</translation>
+        <translation>Boxplot (Min/Median/Max)</translation>
     </message>
     <message>
         <source>Trend</source>
@@ -323,11 +323,11 @@ Möchten Sie die Datei ersetzen?</translation>
     <name>KvReportGlyphs</name>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1</source>
-        <translation>Keine installierte Schriftart enthält diese Zeichen, im Bericht fehlen sie: %1</translation>
+        <translation>Keine installierte Schriftart enthält diese Zeichen; im Bericht fehlen sie: %1</translation>
     </message>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
-        <translation>Keine installierte Schriftart enthält diese Zeichen, im Bericht fehlen sie: %1 (zu installierende Schriften: %2)</translation>
+        <translation>Keine installierte Schriftart enthält diese Zeichen; im Bericht fehlen sie: %1 (zu installierende Schriftarten: %2)</translation>
     </message>
 </context>
 <context>
@@ -342,7 +342,7 @@ Möchten Sie die Datei ersetzen?</translation>
     </message>
     <message>
         <source>Creation time</source>
-        <translation>Erstellungsuhrzeit</translation>
+        <translation>Erstellungszeit</translation>
     </message>
     <message>
         <source>Program name</source>
@@ -648,7 +648,7 @@ Möchten Sie die Datei ersetzen?</translation>
     </message>
     <message>
         <source>Add block</source>
-        <translation>Block einfügen</translation>
+        <translation>Block hinzufügen</translation>
     </message>
     <message>
         <source>The template is empty. Drag a block from here onto the page.</source>
@@ -775,7 +775,7 @@ Möchten Sie die Datei ersetzen?</translation>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>Statistikwerkzeuge</translation>
+        <translation>Bericht und Statistik</translation>
     </message>
     <message>
         <source>Select Template File</source>

@@ -13,7 +13,7 @@
     </message>
     <message>
         <source>Opens Report Template Editor</source>
-        <translation>Apre l&apos;editor dei modelli di report</translation>
+        <translation>Apri l&apos;editor dei modelli di report</translation>
     </message>
     <message>
         <source>Generate Report File</source>
@@ -37,7 +37,7 @@
     </message>
     <message>
         <source>Opens default template for report generation</source>
-        <translation>Sceglie il modello predefinito per generare i report</translation>
+        <translation>Scegli il modello predefinito per generare i report</translation>
     </message>
 </context>
 <context>
@@ -323,11 +323,11 @@ Sostituirlo?</translation>
     <name>KvReportGlyphs</name>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1</source>
-        <translation>Nessun carattere tipografico installato contiene questi simboli, il report li omette: %1</translation>
+        <translation>Nessun font installato contiene questi caratteri; il report li omette: %1</translation>
     </message>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
-        <translation>Nessun carattere tipografico installato contiene questi simboli, il report li omette: %1 (pacchetti da installare: %2)</translation>
+        <translation>Nessun font installato contiene questi caratteri; il report li omette: %1 (pacchetti di font da installare: %2)</translation>
     </message>
 </context>
 <context>
@@ -723,7 +723,7 @@ Sostituirlo?</translation>
     </message>
     <message>
         <source>Insert a tag that the report replaces by its value</source>
-        <translation>Inserisce un campo che nel report viene sostituito dal valore</translation>
+        <translation>Inserisci un campo che il report sostituisce con il suo valore</translation>
     </message>
 </context>
 <context>

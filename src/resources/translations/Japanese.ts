@@ -128,7 +128,7 @@
     </message>
     <message>
         <source>Render measurements</source>
-        <translation>測定を描画</translation>
+        <translation>測定結果を描画</translation>
     </message>
     <message>
         <source>Draw the measurement objects on the picture</source>
@@ -376,7 +376,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Rotation of the picture, clockwise</source>
-        <translation>画像の回転 (時計回り)</translation>
+        <translation>画像の回転角度 (時計回り)</translation>
     </message>
 </context>
 <context>
@@ -775,11 +775,11 @@ Do you want to replace it?</source>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>統計ツール</translation>
+        <translation>レポートと統計</translation>
     </message>
     <message>
         <source>Select Template File</source>
-        <translation>テンプレートファイルの選択</translation>
+        <translation>レポートテンプレートファイルの選択</translation>
     </message>
     <message>
         <source>Report Template File (*.rtp)</source>

@@ -128,7 +128,7 @@
     </message>
     <message>
         <source>Render measurements</source>
-        <translation>측정 표시</translation>
+        <translation>측정 결과 표시</translation>
     </message>
     <message>
         <source>Draw the measurement objects on the picture</source>
@@ -230,7 +230,7 @@ Do you want to replace it?</source>
     <name>KvGroupByOptionsRow</name>
     <message>
         <source>Group by:</source>
-        <translation>그룹화:</translation>
+        <translation>그룹화 기준:</translation>
     </message>
     <message>
         <source>Object</source>
@@ -376,7 +376,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Rotation of the picture, clockwise</source>
-        <translation>이미지 회전(시계 방향)</translation>
+        <translation>이미지 회전 각도(시계 방향)</translation>
     </message>
 </context>
 <context>
@@ -775,11 +775,11 @@ Do you want to replace it?</source>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>통계 도구</translation>
+        <translation>보고서 및 통계</translation>
     </message>
     <message>
         <source>Select Template File</source>
-        <translation>템플릿 파일 선택</translation>
+        <translation>보고서 템플릿 파일 선택</translation>
     </message>
     <message>
         <source>Report Template File (*.rtp)</source>

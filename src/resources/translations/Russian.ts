@@ -113,7 +113,7 @@
     </message>
     <message>
         <source>Min / Median / Max Box</source>
-        <translation>Ящик: мин. / медиана / макс.</translation>
+        <translation>Размах: мин. / медиана / макс.</translation>
     </message>
     <message>
         <source>Trend</source>
@@ -455,15 +455,15 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Sigma</source>
-        <translation>Сигма</translation>
+        <translation>σ</translation>
     </message>
     <message>
         <source>3 Sigma</source>
-        <translation>3 сигма</translation>
+        <translation>3σ</translation>
     </message>
     <message>
         <source>6 Sigma</source>
-        <translation>6 сигма</translation>
+        <translation>6σ</translation>
     </message>
 </context>
 <context>
@@ -553,7 +553,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Start a new, empty template</source>
-        <translation>Начать новый пустой шаблон</translation>
+        <translation>Создать новый пустой шаблон</translation>
     </message>
     <message>
         <source>Save the template to another file</source>
@@ -636,7 +636,7 @@ Do you want to replace it?</source>
     </message>
     <message>
         <source>Save as ...</source>
-        <translation>Сохранить как ...</translation>
+        <translation>Сохранить как...</translation>
     </message>
     <message>
         <source>Save</source>

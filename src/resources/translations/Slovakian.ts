@@ -113,7 +113,7 @@
     </message>
     <message>
         <source>Min / Median / Max Box</source>
-        <translation>Krabica: min. / medián / max.</translation>
+        <translation>Krabicový graf</translation>
     </message>
     <message>
         <source>Trend</source>
@@ -238,7 +238,7 @@ Chcete ho nahradiť?</translation>
     </message>
     <message>
         <source>Measurement</source>
-        <translation>Meranie</translation>
+        <translation>Veličina</translation>
     </message>
 </context>
 <context>
@@ -323,11 +323,11 @@ Chcete ho nahradiť?</translation>
     <name>KvReportGlyphs</name>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1</source>
-        <translation>Tieto znaky nie sú v žiadnom nainštalovanom písme, v správe chýbajú: %1</translation>
+        <translation>Tieto znaky nie sú v žiadnom nainštalovanom písme; v protokole chýbajú: %1</translation>
     </message>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
-        <translation>Tieto znaky nie sú v žiadnom nainštalovanom písme, v správe chýbajú: %1 (písma na inštaláciu: %2)</translation>
+        <translation>Tieto znaky nie sú v žiadnom nainštalovanom písme; v protokole chýbajú: %1 (písma na inštaláciu: %2)</translation>
     </message>
 </context>
 <context>
@@ -485,7 +485,7 @@ Chcete ho nahradiť?</translation>
     </message>
     <message>
         <source>Measurement Type</source>
-        <translation>Druh merania</translation>
+        <translation>Veličina</translation>
     </message>
 </context>
 <context>
@@ -636,7 +636,7 @@ Chcete ho nahradiť?</translation>
     </message>
     <message>
         <source>Save as ...</source>
-        <translation>Uložiť ako ...</translation>
+        <translation>Uložiť ako...</translation>
     </message>
     <message>
         <source>Save</source>
@@ -775,7 +775,7 @@ Chcete ho nahradiť?</translation>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>Štatistické nástroje</translation>
+        <translation>Protokol a štatistika</translation>
     </message>
     <message>
         <source>Select Template File</source>

@@ -13,7 +13,7 @@
     </message>
     <message>
         <source>Opens Report Template Editor</source>
-        <translation>Abre el editor de plantillas de informe</translation>
+        <translation>Abrir el editor de plantillas de informe</translation>
     </message>
     <message>
         <source>Generate Report File</source>
@@ -21,7 +21,7 @@
     </message>
     <message>
         <source>Exports current measurments to pdf file.</source>
-        <translation>Exporta las mediciones actuales a un archivo PDF.</translation>
+        <translation>Exportar las mediciones actuales a un archivo PDF.</translation>
     </message>
     <message>
         <source>Open Statistics Window</source>
@@ -37,7 +37,7 @@
     </message>
     <message>
         <source>Opens default template for report generation</source>
-        <translation>Elige la plantilla predeterminada para generar informes</translation>
+        <translation>Elegir la plantilla predeterminada para generar informes</translation>
     </message>
 </context>
 <context>
