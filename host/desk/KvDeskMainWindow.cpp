@@ -36,6 +36,7 @@
 #include "gui/KvToolBase.h"
 #include "gui/acss.h"
 #include "kernel/ZtAppSettings.h"
+#include "kernel/ZtLeftToRight.h"
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtFrameSourceCatalogue.h"
 #include "measuring/ZtMeasuringDocument.h"
@@ -556,10 +557,10 @@ void KvDeskMainWindow::slotFillRecentMenu()
     m_recentMenu->clear();
     for (const QString &path : KvDeskRecentFiles::paths()) {
         // An ampersand would underline the letter after it.
-        QAction *const action = m_recentMenu->addAction(
-            QFileInfo(path).fileName().replace(QLatin1Char('&'), QLatin1String("&&")));
+        QAction *const action = m_recentMenu->addAction(ZtLeftToRight::isolated(QFileInfo(path).fileName())
+                                                            .replace(QLatin1Char('&'), QLatin1String("&&")));
         action->setData(path);
-        action->setToolTip(QDir::toNativeSeparators(path));
+        action->setToolTip(ZtLeftToRight::isolated(QDir::toNativeSeparators(path)));
     }
     if (m_recentMenu->isEmpty())
         m_recentMenu->addAction(tr("None yet"))->setEnabled(false);
