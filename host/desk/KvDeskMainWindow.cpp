@@ -9,8 +9,10 @@
 #include "KvDeskEmptyState.h"
 #include "KvDeskExamples.h"
 #include "KvDeskExportCommand.h"
+#include "KvDeskFieldKeys.h"
 #include "KvDeskFileCommands.h"
 #include "KvDeskGallery.h"
+#include "KvDeskImageMenu.h"
 #include "KvDeskImageView.h"
 #include "KvDeskInlineEditor.h"
 #include "KvDeskLiveBar.h"
@@ -139,6 +141,8 @@ void KvDeskMainWindow::createPanels()
     m_toolStrip = new KvDeskToolStrip(m_toolBox, this);
     new KvDeskCounterBar(m_toolBox, m_imageView);
     m_editCommands = new KvDeskEditCommands(m_actions, m_imageView, m_objectEditor, this);
+    new KvDeskImageMenu(m_actions, m_imageView);
+    new KvDeskFieldKeys(m_actions, this);
     m_calibrationCommands =
         new KvDeskCalibrationCommands(m_actions, m_imageView, m_session, m_objectEditor, this);
     m_valueTable = new KvDeskValueTable(this);
