@@ -2,13 +2,13 @@
 #include "KvCliOutput.h"
 
 #include "measuring/ZtFault.h"
+#include "measuring/ZtFileFault.h"
 
 #include <QJsonDocument>
 #include <QJsonObject>
 
 #include <cerrno>
 #include <cstdio>
-#include <cstring>
 
 #include <unistd.h>
 
@@ -39,7 +39,7 @@ bool KvCliOutput::result(const QByteArray &bytes) const
     if (write(stdout, bytes))
         return true;
     ZtFault fault;
-    fault.message = tr("cannot be written: %1").arg(QString::fromLocal8Bit(std::strerror(errno)));
+    fault.message = tr("cannot be written: %1").arg(ZtFileFault::text(errno));
     fault.file = standardOutputName();
     error(fault);
     return false;

@@ -9,6 +9,7 @@
 #include "KvTerminalProgress.h"
 
 #include "common/ZtAppStatus.h"
+#include "measuring/ZtFileFault.h"
 #include "templates/KvBlockRegistry.h"
 #include "templates/KvTemplateModel.h"
 #include "templates/KvUserMessages.h"
@@ -19,7 +20,6 @@
 
 #include <cerrno>
 #include <cstdio>
-#include <cstring>
 
 #include <sys/stat.h>
 
@@ -135,14 +135,14 @@ bool KvRenderCommand::print(KvTemplateModel &model) const
         target.isSymLink() && target.exists() ? target.canonicalFilePath() : target.absoluteFilePath();
     QTemporaryFile part(QFileInfo(path).absolutePath() + QStringLiteral("/.statreport-XXXXXX.pdf"));
     if (!part.open())
-        return failToWrite(m_arguments.outputPath, part.errorString());
+        return failToWrite(m_arguments.outputPath, ZtFileFault::text(part));
     part.close();
     if (!printToFile(model, part.fileName()))
         return false;
     QFile::setPermissions(part.fileName(), target.exists() ? target.permissions() : permissionsOfNewFiles());
     const QByteArray partName = QFile::encodeName(part.fileName());
     if (std::rename(partName.constData(), QFile::encodeName(path).constData()) != 0)
-        return failToWrite(m_arguments.outputPath, QString::fromLocal8Bit(std::strerror(errno)));
+        return failToWrite(m_arguments.outputPath, ZtFileFault::text(errno));
     part.setAutoRemove(false);
     return true;
 }
@@ -163,18 +163,18 @@ bool KvRenderCommand::printThroughCopy(KvTemplateModel &model) const
     const QString name = isStandardOutput ? KvCliOutput::standardOutputName() : m_arguments.outputPath;
     QTemporaryFile part;
     if (!part.open())
-        return failToWrite(name, part.errorString());
+        return failToWrite(name, ZtFileFault::text(part));
     if (!printToFile(model, part.fileName()))
         return false;
     QFile written(part.fileName());
     if (!written.open(QIODevice::ReadOnly))
-        return failToWrite(name, written.errorString());
+        return failToWrite(name, ZtFileFault::text(written));
     const QByteArray bytes = written.readAll();
     if (isStandardOutput)
         return m_output.result(bytes);
     QFile target(m_arguments.outputPath);
     if (!target.open(QIODevice::WriteOnly | QIODevice::Unbuffered) || target.write(bytes) != bytes.size())
-        return failToWrite(name, target.errorString());
+        return failToWrite(name, ZtFileFault::text(target));
     return true;
 }
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvTemplateCheck.h"
 
+#include "measuring/ZtFileFault.h"
 #include "templates/KvBaseEditorNodeCfg.h"
 #include "templates/KvBaseEditorNodeFactory.h"
 #include "templates/KvBlockRegistry.h"
@@ -109,10 +110,10 @@ bool KvTemplateCheck::readRoot(const QString &path, QJsonObject &root)
 {
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly))
-        return fail(QString(), tr("cannot be opened: %1").arg(file.errorString()));
+        return fail(QString(), tr("cannot be opened: %1").arg(ZtFileFault::text(file)));
     const QByteArray bytes = file.read(kLargestFile + 1);
     if (file.error() != QFileDevice::NoError)
-        return fail(QString(), tr("cannot be read: %1").arg(file.errorString()));
+        return fail(QString(), tr("cannot be read: %1").arg(ZtFileFault::text(file)));
     if (bytes.size() > kLargestFile)
         return fail(QString(), tr("is larger than 256 MB"));
     QJsonParseError error;

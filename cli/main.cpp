@@ -51,6 +51,8 @@ int runApplication(int argc, char **argv, const QString &language, const KvCliAr
     QCoreApplication::setAttribute(Qt::AA_Use96Dpi);
     QApplication application(argc, argv);
     const KvCliTranslation translation(arguments.isForPrograms() ? QStringLiteral("English") : language);
+    // Pages are the same in every language, and messages go to files and other programs: no marks in them.
+    QGuiApplication::setLayoutDirection(Qt::LeftToRight);
     acss::QtAdvancedStylesheet::substituteFonts();
     ZtAppSettings::getInstance()->setStoragePath(QString());
     ZtAppSettings::setProgramInfo(QStringLiteral("StatReport"), QStringLiteral(STATREPORT_VERSION),

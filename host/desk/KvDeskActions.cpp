@@ -2,6 +2,7 @@
 #include "KvDeskActions.h"
 
 #include "gui/acss.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QAction>
 #include <QCoreApplication>
@@ -129,7 +130,9 @@ QString toolTip(const Definition &definition, const QAction &action)
 {
     const QString name = KvDeskActions::tr(definition.toolTip);
     const QString keys = action.shortcut().toString(QKeySequence::NativeText);
-    return keys.isEmpty() ? name : KvDeskActions::tr("%1 (%2)", "command (shortcut)").arg(name, keys);
+    return keys.isEmpty()
+               ? name
+               : KvDeskActions::tr("%1 (%2)", "command (shortcut)").arg(name, ZtLeftToRight::isolated(keys));
 }
 
 QAction *createAction(const Definition &definition, QObject *parent)

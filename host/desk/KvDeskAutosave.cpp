@@ -5,6 +5,7 @@
 #include "KvDeskSession.h"
 #include "KvDeskStatus.h"
 #include "common/ZtAppStatus.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "measuring/ZtProgress.h"
@@ -122,7 +123,8 @@ bool KvDeskAutosave::claim()
         QFile::setPermissions(m_folder, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
     if (m_lock.tryLock(0))
         return true;
-    report(tr("the folder \"%1\" cannot be written").arg(QDir::toNativeSeparators(m_folder)));
+    report(tr("the folder \"%1\" cannot be written")
+               .arg(ZtLeftToRight::isolated(QDir::toNativeSeparators(m_folder))));
     return false;
 }
 

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskCalibrationText.h"
 
+#include "kernel/ZtLeftToRight.h"
+
 #include <QLocale>
 #include <QStringList>
 
@@ -21,8 +23,8 @@ QString KvDeskCalibrationText::pixelSize(const ZtCalibration &calibration)
         return QString();
     const QString x = number(calibration.micrometresPerPixelX());
     const QString y = number(calibration.micrometresPerPixelY());
-    return x == y ? tr("%1 μm", "size of a pixel").arg(x)
-                  : tr("%1 × %2 μm", "width and height of a pixel").arg(x, y);
+    return ZtLeftToRight::isolated(x == y ? tr("%1 μm", "size of a pixel").arg(x)
+                                          : tr("%1 × %2 μm", "width and height of a pixel").arg(x, y));
 }
 
 QString KvDeskCalibrationText::origin(ZtCalibration::Origin origin)

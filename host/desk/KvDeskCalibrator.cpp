@@ -4,6 +4,9 @@
 #include "KvDeskCalibrationText.h"
 #include "KvDeskObjectEditor.h"
 #include "KvDeskSession.h"
+#include "KvDeskStatus.h"
+#include "common/ZtAppStatus.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtMeasuringDocument.h"
 
 KvDeskCalibrator::KvDeskCalibrator(KvDeskSession *session, KvDeskObjectEditor *editor, QObject *parent)
@@ -41,6 +44,19 @@ void KvDeskCalibrator::measureWith(const ZtCalibration &calibration)
 {
     m_store.setLastObjective(calibration.objective());
     m_editor->setCalibration(calibration);
+    logCalibrated(calibration);
+}
+
+void KvDeskCalibrator::logCalibrated(const ZtCalibration &calibration)
+{
+    QString name = calibration.objective().isEmpty() ? calibration.name() : calibration.objective();
+    if (name.isEmpty())
+        name = KvDeskCalibrationText::origin(calibration.origin());
+    //: %1 is an objective or a file, %2 the size of a pixel with its unit
+    const QString text =
+        tr("Calibrated: %1, %2 per pixel")
+            .arg(ZtLeftToRight::isolated(name), KvDeskCalibrationText::pixelSize(calibration));
+    KvDeskStatus::log(ZtAppStatus::Information, text, QStringLiteral("KvDeskCalibrator::logCalibrated"));
 }
 
 void KvDeskCalibrator::calibrate(ZtCalibration calibration)
@@ -75,12 +91,21 @@ bool KvDeskCalibrator::isOtherOffered() const
     return offered().isCalibrated() && !offered().hasNearlySamePixelSize(current());
 }
 
+// The first image of a session calibrates it without being asked.
+bool KvDeskCalibrator::isOfferInUse() const
+{
+    return offered().isCalibrated() && current().hasSamePixelSize(offered()) &&
+           current().origin() == ZtCalibration::Origin::Metadata && current().name() == offered().name();
+}
+
 void KvDeskCalibrator::slotImageOpened()
 {
+    if (isOfferInUse())
+        logCalibrated(current());
     if (!isOtherOffered())
         return;
     const QString size = KvDeskCalibrationText::pixelSize(offered());
-    const QString name = offered().name();
+    const QString name = ZtLeftToRight::isolated(offered().name());
     const QString text = current().isCalibrated()
                              ? tr("%1 states pixels of %2; the session measures with %3")
                                    .arg(name, size, KvDeskCalibrationText::pixelSize(current()))

@@ -52,6 +52,8 @@ private slots:
 private:
     void connectSignals();
     void measureWith(const ZtCalibration &calibration);
+    static void logCalibrated(const ZtCalibration &calibration);
+    bool isOfferInUse() const;
     bool isOtherOffered() const;
 
     KvDeskSession *m_session;

@@ -10,6 +10,7 @@
 #include "kernel/ZtAppSettings.h"
 #include "kernel/ZtGsManipulator.h"
 #include "kernel/ZtKernelData.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtSafeFile.h"
 
@@ -131,7 +132,7 @@ QString KvDeskExportCommand::choosePath(ZtTableExport::Layout layout)
 bool KvDeskExportCommand::exportTo(const QString &path, const ZtTableExport::Options &options)
 {
     const QString source = QStringLiteral("KvDeskExportCommand::exportTo");
-    const QString name = QFileInfo(path).fileName();
+    const QString name = ZtLeftToRight::isolated(QFileInfo(path).fileName());
     QByteArray bytes;
     if (!collect(options, &bytes)) {
         KvDeskStatus::log(ZtAppStatus::Information, tr("Export cancelled: %1").arg(name), source);

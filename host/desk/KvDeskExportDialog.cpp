@@ -69,7 +69,7 @@ void KvDeskExportDialog::createFields()
     for (QWidget *const field : {static_cast<QWidget *>(m_layout), static_cast<QWidget *>(m_note),
                                  static_cast<QWidget *>(m_numbers)})
         field->setMinimumWidth(fieldWidth);
-    m_selectionOnly = new QCheckBox(tr("Only the selected objects (%1)").arg(m_selection.size()));
+    m_selectionOnly = new QCheckBox(tr("Only the selected object(s) (%n)", "", m_selection.size()));
     m_mark = new QCheckBox(tr("Byte order mark, for spreadsheets that do not expect UTF-8"));
     m_guard = new QCheckBox(tr("Apostrophe before names that spreadsheets take for formulas"));
     m_guard->setToolTip(tr("Changes names that begin with =, +, - or @: they are others when the table is "

@@ -10,6 +10,7 @@
 #include "KvDeskWaitCursor.h"
 #include "common/ZtAppStatus.h"
 #include "kernel/ZtAppSettings.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtImportedTable.h"
 #include "measuring/ZtLoadedSession.h"
@@ -52,7 +53,7 @@ void rememberFolder(const QString &path)
 
 QString fileName(const QString &path)
 {
-    return QFileInfo(path).fileName();
+    return ZtLeftToRight::isolated(QFileInfo(path).fileName());
 }
 
 QString filterOf(const QString &name, const QStringList &patterns)
@@ -225,7 +226,7 @@ void KvDeskFileCommands::logOpened(const QString &path)
 {
     KvDeskStatus::log(
         ZtAppStatus::Information,
-        tr("Session opened: %1 (objects: %2)").arg(fileName(path)).arg(m_session->objectCount()),
+        tr("Session opened: %1 (%n object(s))", "", m_session->objectCount()).arg(fileName(path)),
         QStringLiteral("KvDeskFileCommands::openSession"));
 }
 
@@ -261,9 +262,8 @@ bool KvDeskFileCommands::restoreSession(const QString &file, const KvDeskRecover
     if (!missing.isNull())
         KvDeskStatus::log(ZtAppStatus::Warning, missing.text(), source);
     KvDeskStatus::log(ZtAppStatus::Information,
-                      tr("Measurements restored: %1 (objects: %2)")
-                          .arg(m_session->displayName())
-                          .arg(m_session->objectCount()),
+                      tr("Measurements restored: %1 (%n object(s))", "", m_session->objectCount())
+                          .arg(m_session->displayName()),
                       source);
     return true;
 }
@@ -310,7 +310,7 @@ bool KvDeskFileCommands::importTable(const QString &path)
         KvDeskStatus::log(ZtAppStatus::Warning, tr("%1: %2", "file, remark").arg(fileName(path), note),
                           source);
     KvDeskStatus::log(ZtAppStatus::Information,
-                      tr("Table imported: %1 (objects: %2)").arg(fileName(path)).arg(table.objectCount()),
+                      tr("Table imported: %1 (%n object(s))", "", table.objectCount()).arg(fileName(path)),
                       source);
     return true;
 }

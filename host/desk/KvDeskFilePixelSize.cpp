@@ -3,6 +3,7 @@
 
 #include "KvDeskCalibrationText.h"
 #include "KvDeskCalibrator.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QLabel>
 #include <QVBoxLayout>
@@ -34,9 +35,9 @@ QString KvDeskFilePixelSize::text() const
 void KvDeskFilePixelSize::refresh()
 {
     const ZtCalibration offered = m_calibrator->offered();
-    m_text->setText(offered.isCalibrated()
-                        ? tr("%1 states pixels of %2.", "file, size")
-                              .arg(offered.name(), KvDeskCalibrationText::pixelSize(offered))
-                        : tr("The image's file does not state how large its pixels are."));
+    m_text->setText(offered.isCalibrated() ? tr("%1 states pixels of %2.", "file, size")
+                                                 .arg(ZtLeftToRight::isolated(offered.name()),
+                                                      KvDeskCalibrationText::pixelSize(offered))
+                                           : tr("The image's file does not state how large its pixels are."));
     emit signalChanged();
 }

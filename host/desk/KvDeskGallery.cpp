@@ -11,6 +11,7 @@
 #include "KvDeskStatus.h"
 #include "common/ZtAppStatus.h"
 #include "gui/acss.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QAction>
 #include <QClipboard>
@@ -47,11 +48,16 @@ bool isTrashWritable()
     return !QFileInfo(folder).isDir() || probe.open();
 }
 
+QString shownPath(const QString &path)
+{
+    return ZtLeftToRight::isolated(QDir::toNativeSeparators(path));
+}
+
 QStringList fileNames(const QStringList &paths)
 {
     QStringList names;
     for (const QString &path : paths)
-        names.append(QFileInfo(path).fileName());
+        names.append(ZtLeftToRight::isolated(QFileInfo(path).fileName()));
     return names;
 }
 
@@ -145,15 +151,15 @@ void KvDeskGallery::fillFolders()
 {
     const auto add = [this](const QString &text, const QString &path) {
         m_folders->addItem(text, path);
-        m_folders->setItemData(m_folders->count() - 1, QDir::toNativeSeparators(path), Qt::ToolTipRole);
+        m_folders->setItemData(m_folders->count() - 1, shownPath(path), Qt::ToolTipRole);
     };
     m_folders->clear();
     add(tr("Snapshots"), KvDeskGallerySettings::snapshotsFolder());
     for (const QString &path : KvDeskGallerySettings::folders())
-        add(QDir(path).isRoot() ? QDir::toNativeSeparators(path) : QDir(path).dirName(), path);
+        add(QDir(path).isRoot() ? shownPath(path) : QDir(path).dirName(), path);
     const QString shown = KvDeskGallerySettings::folder();
     m_folders->setCurrentIndex(qMax(0, m_folders->findData(shown)));
-    m_folders->setToolTip(QDir::toNativeSeparators(shown));
+    m_folders->setToolTip(shownPath(shown));
 }
 
 void KvDeskGallery::slotFolderActivated(int aIndex)
@@ -174,10 +180,9 @@ void KvDeskGallery::slotUseForSnapshots()
 {
     KvDeskGallerySettings::setSnapshotsFolder(m_model->folder()->path());
     fillFolders();
-    KvDeskStatus::log(
-        ZtAppStatus::Information,
-        tr("Snapshots are saved in %1").arg(QDir::toNativeSeparators(m_model->folder()->path())),
-        QStringLiteral("KvDeskGallery::slotUseForSnapshots"));
+    KvDeskStatus::log(ZtAppStatus::Information,
+                      tr("Snapshots are saved in %1").arg(shownPath(m_model->folder()->path())),
+                      QStringLiteral("KvDeskGallery::slotUseForSnapshots"));
 }
 
 void KvDeskGallery::slotShowFile(const QString &aPath)
@@ -217,7 +222,7 @@ QString KvDeskGallery::emptyText() const
         return tr("Snapshots (%1) and the images of a folder appear here; drag them onto report pages")
             .arg(key.toString(QKeySequence::NativeText));
     }
-    const QString name = QDir::toNativeSeparators(folder);
+    const QString name = shownPath(folder);
     return m_model->folder()->exists() ? tr("There are no images in %1").arg(name)
                                        : tr("The folder %1 does not exist").arg(name);
 }
@@ -289,7 +294,7 @@ bool KvDeskGallery::askToRemove(const QStringList &paths)
 {
     const QString question = paths.size() == 1
                                  ? tr("Move \"%1\" to the trash?").arg(fileNames(paths).first())
-                                 : tr("Move the selected images (%1) to the trash?").arg(paths.size());
+                                 : tr("Move %n selected image(s) to the trash?", "", paths.size());
     QMessageBox box(QMessageBox::Question, tr("Move to trash"), question,
                     QMessageBox::Yes | QMessageBox::Cancel, this);
     box.button(QMessageBox::Yes)->setText(tr("Move to trash"));

@@ -4,6 +4,7 @@
 #include "KvDeskGalleryModel.h"
 #include "gui/QtAdvancedStylesheet.h"
 #include "gui/acss.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QFileInfo>
 #include <QPainter>
@@ -111,8 +112,9 @@ void KvDeskGalleryDelegate::paint(QPainter *painter, const QStyleOptionViewItem 
     painter->setPen(color(isSelected ? "on-accent" : image.isNull() ? "muted" : "text"));
     // Without the suffix there is room for the time that snapshots are named after.
     const QString name = QFileInfo(index.data().toString()).completeBaseName();
-    painter->drawText(text, Qt::AlignCenter | Qt::TextSingleLine,
-                      QFontMetrics(font).elidedText(name, Qt::ElideMiddle, text.width()));
+    painter->drawText(
+        text, Qt::AlignCenter | Qt::TextSingleLine,
+        ZtLeftToRight::isolated(QFontMetrics(font).elidedText(name, Qt::ElideMiddle, text.width())));
     painter->restore();
 }
 

@@ -4,6 +4,7 @@
 #include "KvDeskGalleryFolder.h"
 #include "KvDeskThumbnail.h"
 #include "KvDeskThumbnailLoader.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QFileInfo>
 #include <QLocale>
@@ -104,12 +105,12 @@ QString KvDeskGalleryModel::toolTip(int row) const
 {
     const KvDeskGalleryEntry &entry = m_entries.at(row);
     const KvDeskThumbnail *const thumbnail = m_thumbnails->known(m_folder->path(), entry);
-    QStringList lines{entry.name};
+    QStringList lines{ZtLeftToRight::isolated(entry.name)};
     if (thumbnail && !thumbnail->fault.isEmpty())
         lines.append(thumbnail->fault);
     else if (thumbnail)
-        lines.append(
-            tr("%1 × %2 px", "width, height").arg(thumbnail->size.width()).arg(thumbnail->size.height()));
+        lines.append(ZtLeftToRight::isolated(
+            tr("%1 × %2 px", "width, height").arg(thumbnail->size.width()).arg(thumbnail->size.height())));
     lines.append(QLocale().toString(entry.changed, QLocale::ShortFormat));
     return asPlainToolTip(lines);
 }

@@ -478,8 +478,12 @@ void KvDeskImageView::keyPressEvent(QKeyEvent *event)
         refresh();
         return;
     }
+    const bool isMenuKey = event->key() == Qt::Key_F10 && event->modifiers() == Qt::ShiftModifier;
     if (event->key() == Qt::Key_Escape) {
         emit signalToolLeft();
+    } else if (isMenuKey) {
+        if (hasMenu())
+            emit signalMenuRequested(menuPlace());
     } else if (event->key() == Qt::Key_Space) {
         if (!event->isAutoRepeat())
             setSpaceDown(true);
@@ -504,6 +508,43 @@ void KvDeskImageView::focusOutEvent(QFocusEvent *event)
     // The release of the key goes to somebody else.
     setSpaceDown(false);
     QGraphicsView::focusOutEvent(event);
+}
+
+bool KvDeskImageView::hasMenu() const
+{
+    const bool isSelecting = m_tool == m_selectTool.get() && !m_tool->isBusy() && !m_isPanning;
+    return isSelecting && m_emptyState->isHidden();
+}
+
+void KvDeskImageView::contextMenuEvent(QContextMenuEvent *event)
+{
+    event->accept();
+    if (!hasMenu())
+        return;
+    const bool isByMouse = event->reason() == QContextMenuEvent::Mouse;
+    if (isByMouse)
+        selectForMenu(event->pos());
+    emit signalMenuRequested(isByMouse ? event->globalPos() : menuPlace());
+}
+
+// Beside all objects it is the menu of those that are selected: lines are easily missed.
+void KvDeskImageView::selectForMenu(const QPoint &position)
+{
+    const KvDeskObjectId object = objectAt(position);
+    if (!object.isNull() && !m_selection->contains(object))
+        m_selection->select(object);
+}
+
+QPoint KvDeskImageView::menuPlace() const
+{
+    const QRect visible = viewport()->rect();
+    QPoint place = visible.center();
+    if (places().index().contains(m_selection->current())) {
+        const QPoint object = mapFromScene(places().index().rect(m_selection->current()).center());
+        place = QPoint(qBound(visible.left(), object.x(), visible.right()),
+                       qBound(visible.top(), object.y(), visible.bottom()));
+    }
+    return viewport()->mapToGlobal(place);
 }
 
 bool KvDeskImageView::viewportEvent(QEvent *event)

@@ -117,6 +117,8 @@ signals:
     void signalPointerMoved(QPointF aPosition);
     void signalPointerLeft(); ///< the pointer is not over the image
     void signalToolLeft();    ///< the user is done with the tool, by Escape
+    /** The user wants the menu of what is selected, at this place of the screen. Drawing has none. */
+    void signalMenuRequested(QPoint aPosition);
 
 protected:
     void drawBackground(QPainter *painter, const QRectF &rect) override;
@@ -130,6 +132,7 @@ protected:
     void keyPressEvent(QKeyEvent *event) override;
     void keyReleaseEvent(QKeyEvent *event) override;
     void focusOutEvent(QFocusEvent *event) override;
+    void contextMenuEvent(QContextMenuEvent *event) override;
     bool viewportEvent(QEvent *event) override;
     bool event(QEvent *event) override;
     void scrollContentsBy(int dx, int dy) override;
@@ -152,6 +155,9 @@ private:
     void placeRulers();
     void setRulerPointer(const QPointF *position);
     void drawScaleBar(QPainter *painter) const;
+    bool hasMenu() const;
+    void selectForMenu(const QPoint &position);
+    QPoint menuPlace() const; ///< on the screen, where the pointer has no part in it
     KvDeskPointer pointerOf(const QMouseEvent &event) const;
     bool isPanPress(const QMouseEvent &event) const;
     /** Moves the image so that a point of the scene lies at \a position in the viewport. */

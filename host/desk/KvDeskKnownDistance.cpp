@@ -6,6 +6,7 @@
 #include "KvDeskObjectEditor.h"
 #include "KvDeskObjectState.h"
 #include "KvDeskSelection.h"
+#include "kernel/ZtLeftToRight.h"
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtGeometry.h"
@@ -120,9 +121,9 @@ void KvDeskKnownDistance::refresh()
     if (m_reference.isNull())
         m_text->setText(tr("No line yet"));
     else
-        m_text->setText(
-            tr("%1: %2", "name and length of a line")
-                .arg(KvDeskObjectEditor::describe({m_reference}), ZtMeasureFormat::pixelText(pixels, 1)));
+        m_text->setText(tr("%1: %2", "name and length of a line")
+                            .arg(KvDeskObjectEditor::describe({m_reference}),
+                                 ZtLeftToRight::isolated(ZtMeasureFormat::pixelText(pixels, 1))));
 }
 
 void KvDeskKnownDistance::slotUseSelected()

@@ -6,6 +6,7 @@
 #include "KvDeskExposureControl.h"
 #include "gui/QtAdvancedStylesheet.h"
 #include "gui/acss.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFrameSource.h"
 #include "measuring/ZtKernelImage.h"
 #include "measuring/ZtMeasuringDocument.h"
@@ -111,7 +112,7 @@ void KvDeskLiveBar::slotSourceChanged()
 
 QString KvDeskLiveBar::statusText(const ZtFrameSource &source) const
 {
-    const QString name = source.displayName();
+    const QString name = ZtLeftToRight::isolated(source.displayName());
     const bool hasFrame = !source.frame().isNull();
     switch (source.state()) {
     case ZtFrameSource::Lost:

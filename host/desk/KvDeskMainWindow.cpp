@@ -9,8 +9,10 @@
 #include "KvDeskEmptyState.h"
 #include "KvDeskExamples.h"
 #include "KvDeskExportCommand.h"
+#include "KvDeskFieldKeys.h"
 #include "KvDeskFileCommands.h"
 #include "KvDeskGallery.h"
+#include "KvDeskImageMenu.h"
 #include "KvDeskImageView.h"
 #include "KvDeskInlineEditor.h"
 #include "KvDeskLiveBar.h"
@@ -36,6 +38,7 @@
 #include "gui/KvToolBase.h"
 #include "gui/acss.h"
 #include "kernel/ZtAppSettings.h"
+#include "kernel/ZtLeftToRight.h"
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtFrameSourceCatalogue.h"
 #include "measuring/ZtMeasuringDocument.h"
@@ -138,6 +141,8 @@ void KvDeskMainWindow::createPanels()
     m_toolStrip = new KvDeskToolStrip(m_toolBox, this);
     new KvDeskCounterBar(m_toolBox, m_imageView);
     m_editCommands = new KvDeskEditCommands(m_actions, m_imageView, m_objectEditor, this);
+    new KvDeskImageMenu(m_actions, m_imageView);
+    new KvDeskFieldKeys(m_actions, this);
     m_calibrationCommands =
         new KvDeskCalibrationCommands(m_actions, m_imageView, m_session, m_objectEditor, this);
     m_valueTable = new KvDeskValueTable(this);
@@ -556,10 +561,10 @@ void KvDeskMainWindow::slotFillRecentMenu()
     m_recentMenu->clear();
     for (const QString &path : KvDeskRecentFiles::paths()) {
         // An ampersand would underline the letter after it.
-        QAction *const action = m_recentMenu->addAction(
-            QFileInfo(path).fileName().replace(QLatin1Char('&'), QLatin1String("&&")));
+        QAction *const action = m_recentMenu->addAction(ZtLeftToRight::isolated(QFileInfo(path).fileName())
+                                                            .replace(QLatin1Char('&'), QLatin1String("&&")));
         action->setData(path);
-        action->setToolTip(QDir::toNativeSeparators(path));
+        action->setToolTip(ZtLeftToRight::isolated(QDir::toNativeSeparators(path)));
     }
     if (m_recentMenu->isEmpty())
         m_recentMenu->addAction(tr("None yet"))->setEnabled(false);

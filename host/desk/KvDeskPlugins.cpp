@@ -4,6 +4,7 @@
 #include "KvDeskStatus.h"
 #include "common/ZtAppStatus.h"
 #include "gui/ZtPluginInterface.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QDir>
 #include <QLibrary>
@@ -23,7 +24,7 @@ QString source()
 
 QString shownPath(const QString &file)
 {
-    return QDir::toNativeSeparators(file);
+    return ZtLeftToRight::isolated(QDir::toNativeSeparators(file));
 }
 
 } // namespace
@@ -139,8 +140,10 @@ bool KvDeskPlugins::start(const Plugin &plugin)
             isStarted = true;
     }
     if (isStarted)
-        KvDeskStatus::log(ZtAppStatus::Information, tr("Plug-in loaded: %1").arg(shownPath(plugin.file)),
-                          source());
+        KvDeskStatus::log(
+            ZtAppStatus::Information,
+            tr("Plug-in loaded: %1").arg(ZtLeftToRight::isolated(QFileInfo(plugin.file).fileName())),
+            source());
     return isStarted;
 }
 

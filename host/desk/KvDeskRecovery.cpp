@@ -3,6 +3,7 @@
 
 #include "KvDeskFileCommands.h"
 #include "KvDeskSession.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QDir>
 #include <QFile>
@@ -84,10 +85,11 @@ const KvDeskRecoveryFile &KvDeskRecovery::at(int index) const
 QString KvDeskRecovery::describe(int index) const
 {
     const KvDeskRecoveryFile &header = at(index);
-    const QString name =
-        header.sessionPath.isEmpty() ? tr("Untitled session") : QFileInfo(header.sessionPath).fileName();
+    const QString name = header.sessionPath.isEmpty()
+                             ? tr("Untitled session")
+                             : ZtLeftToRight::isolated(QFileInfo(header.sessionPath).fileName());
     //: %1 is the name of a session
-    return tr("%1 (objects: %2)").arg(name).arg(header.objectCount);
+    return tr("%1 (%n object(s))", "", header.objectCount).arg(name);
 }
 
 bool KvDeskRecovery::restore(int index)

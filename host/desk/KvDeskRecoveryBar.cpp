@@ -3,6 +3,7 @@
 
 #include "KvDeskElidedLabel.h"
 #include "KvDeskRecovery.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QAction>
 #include <QHBoxLayout>
@@ -95,7 +96,7 @@ void KvDeskRecoveryBar::showCurrent()
         return;
     m_text->setText(tr("Measurements from %1 were not saved.").arg(timeText(m_current)));
     m_session->setText(m_recovery->describe(m_current));
-    m_session->setToolTip(m_recovery->at(m_current).sessionPath);
+    m_session->setToolTip(ZtLeftToRight::isolated(m_recovery->at(m_current).sessionPath));
 }
 
 void KvDeskRecoveryBar::slotChosen(QAction *aAction)

@@ -2,6 +2,7 @@
 #include "KvDeskRecoveryFile.h"
 
 #include "measuring/ZtFault.h"
+#include "measuring/ZtFileFault.h"
 #include "measuring/ZtLoadedSession.h"
 #include "measuring/ZtSafeFile.h"
 #include "measuring/ZtSession.h"
@@ -85,7 +86,7 @@ bool KvDeskRecoveryFile::read(const QString &file, ZtLoadedSession *loaded, ZtFa
     *fault = ZtFault();
     fault->file = file;
     if (!source.open(QIODevice::ReadOnly)) {
-        fault->message = source.errorString();
+        fault->message = ZtFileFault::text(source);
         return false;
     }
     source.readLine(longestHeader);

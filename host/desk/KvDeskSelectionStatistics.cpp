@@ -2,6 +2,7 @@
 #include "KvDeskSelectionStatistics.h"
 
 #include "kernel/ZtGsManipulator.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtMeasureFormat.h"
 #include "measuring/ZtUnit.h"
 #include "measuring/ZtUnitSettings.h"
@@ -117,10 +118,11 @@ QString KvDeskSelectionStatistics::details() const
     QStringList lines{tr("Selected values: %1").arg(count())};
     if (isMixed())
         lines.append(tr("\"%1\" among them: %2").arg(m_groups.first().valueName).arg(all.count()));
-    lines.append(tr("Mean: %1").arg(precise(all.mean())));
+    lines.append(tr("Mean: %1").arg(ZtLeftToRight::isolated(precise(all.mean()))));
     if (all.count() > 1)
-        lines.append(tr("Standard deviation: %1").arg(precise(all.standardDeviation())));
-    lines.append(tr("Smallest: %1").arg(precise(all.minimum())));
-    lines.append(tr("Largest: %1").arg(precise(all.maximum())));
+        lines.append(
+            tr("Standard deviation: %1").arg(ZtLeftToRight::isolated(precise(all.standardDeviation()))));
+    lines.append(tr("Smallest: %1").arg(ZtLeftToRight::isolated(precise(all.minimum()))));
+    lines.append(tr("Largest: %1").arg(ZtLeftToRight::isolated(precise(all.maximum()))));
     return lines.join(QLatin1Char('\n'));
 }

@@ -2,6 +2,7 @@
 #include "KvDeskSession.h"
 
 #include "kernel/ZtKernelData.h"
+#include "kernel/ZtLeftToRight.h"
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtFrameSource.h"
 #include "measuring/ZtImportedTable.h"
@@ -33,7 +34,7 @@ void KvDeskSession::connectSignals()
 
 QString KvDeskSession::displayName() const
 {
-    return m_path.isEmpty() ? tr("Untitled session") : QFileInfo(m_path).fileName();
+    return m_path.isEmpty() ? tr("Untitled session") : ZtLeftToRight::isolated(QFileInfo(m_path).fileName());
 }
 
 int KvDeskSession::objectCount() const

@@ -3,6 +3,7 @@
 
 #include "measuring/ZtCalibration.h"
 #include "measuring/ZtFault.h"
+#include "measuring/ZtFileFault.h"
 
 #include <QCoreApplication>
 #include <QDateTime>
@@ -63,8 +64,10 @@ bool KvDeskSnapshotFile::save(const QImage &image, const QString &path, ZtFault 
         return fail(Text::tr("The folder cannot be created"), fault);
     QSaveFile file(path);
     if (!file.open(QIODevice::WriteOnly))
-        return fail(file.errorString(), fault);
-    if (!image.save(&file, "PNG"))
-        return fail(Text::tr("The picture cannot be encoded"), fault);
-    return file.commit() || fail(file.errorString(), fault);
+        return fail(ZtFileFault::text(file), fault);
+    if (!image.save(&file, "PNG")) {
+        const bool isRefused = file.error() != QFileDevice::NoError;
+        return fail(isRefused ? ZtFileFault::text(file) : Text::tr("The picture cannot be encoded"), fault);
+    }
+    return file.commit() || fail(ZtFileFault::text(file), fault);
 }

@@ -8,6 +8,7 @@
 #include "common/ZtAppStatus.h"
 #include "image/ZtImage.h"
 #include "kernel/ZtImageTools.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtKernelImage.h"
 #include "measuring/ZtMeasuringDocument.h"
@@ -115,7 +116,8 @@ void KvDeskSnapshots::slotFinished()
     const QString path = m_path;
     m_path.clear();
     if (m_result->isNull()) {
-        KvDeskStatus::log(ZtAppStatus::Information, tr("Snapshot saved: %1").arg(QFileInfo(path).fileName()),
+        KvDeskStatus::log(ZtAppStatus::Information,
+                          tr("Snapshot saved: %1").arg(ZtLeftToRight::isolated(QFileInfo(path).fileName())),
                           QStringLiteral("KvDeskSnapshots::slotFinished"));
         emit signalSaved(path);
     } else {

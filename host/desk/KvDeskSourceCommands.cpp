@@ -5,6 +5,7 @@
 #include "KvDeskSession.h"
 #include "KvDeskStatus.h"
 #include "common/ZtAppStatus.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtFrameSource.h"
 #include "measuring/ZtFrameSourceCatalogue.h"
@@ -28,13 +29,16 @@ bool KvDeskSourceCommands::open(const ZtFrameSourceInfo &info)
     ZtFault fault;
     std::unique_ptr<ZtFrameSource> opened = ZtFrameSourceCatalogue::open(info, &fault);
     if (!opened) {
-        m_files->tellFault(tr("The image source \"%1\" was not opened.").arg(info.title), fault, source);
+        m_files->tellFault(
+            tr("The image source \"%1\" was not opened.").arg(ZtLeftToRight::isolated(info.title)), fault,
+            source);
         return false;
     }
     m_info = info;
     m_source = opened.get();
     m_session->showSource(std::move(opened));
-    KvDeskStatus::log(ZtAppStatus::Information, tr("Image source: %1").arg(info.title), source);
+    KvDeskStatus::log(ZtAppStatus::Information,
+                      tr("Image source: %1").arg(ZtLeftToRight::isolated(info.title)), source);
     // Now the status log hears of what goes wrong.
     m_session->document()->frameSource()->start();
     return true;

@@ -3,6 +3,7 @@
 
 #include "KvDeskSourceCommands.h"
 #include "gui/acss.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFrameSourceCatalogue.h"
 #include "measuring/ZtFrameSourceScan.h"
 
@@ -71,7 +72,8 @@ void KvDeskSourceMenu::slotListCameras()
     for (const ZtFrameSourceInfo &camera : m_scan->sources()) {
         // An ampersand would underline the letter after it.
         QAction *const action =
-            addAction(iconOf("camera"), QString(camera.title).replace(QLatin1Char('&'), QLatin1String("&&")));
+            addAction(iconOf("camera"),
+                      ZtLeftToRight::isolated(camera.title).replace(QLatin1Char('&'), QLatin1String("&&")));
         action->setData(QVariant::fromValue(camera));
         action->setCheckable(true);
         action->setChecked(current == camera);

@@ -6,6 +6,7 @@
 #include "KvDeskRecentFiles.h"
 #include "KvDeskStepRow.h"
 #include "KvDeskThumbnailReader.h"
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtSession.h"
 
@@ -158,9 +159,10 @@ void KvDeskStartPage::addExample(const QString &path)
 
 void KvDeskStartPage::addRecent(const QString &path)
 {
-    auto *const button = new QPushButton(buttonText(QFileInfo(path).fileName()), m_recentGroup);
+    auto *const button =
+        new QPushButton(buttonText(ZtLeftToRight::isolated(QFileInfo(path).fileName())), m_recentGroup);
     button->setProperty("link", true);
-    button->setToolTip(QDir::toNativeSeparators(path));
+    button->setToolTip(ZtLeftToRight::isolated(QDir::toNativeSeparators(path)));
     button->setAccessibleName(QFileInfo(path).fileName());
     button->setProperty("path", path);
     connect(button, SIGNAL(clicked()), this, SLOT(slotRecentClicked()));

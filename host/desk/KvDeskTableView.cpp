@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskTableView.h"
 
+#include "kernel/ZtLeftToRight.h"
+
 #include <QAction>
 #include <QClipboard>
 #include <QGuiApplication>
@@ -113,7 +115,7 @@ QStringList KvDeskTableView::rowTexts(int row) const
 {
     QStringList fields;
     for (int column = 0; column < model()->columnCount(); ++column)
-        fields.append(model()->index(row, column).data().toString());
+        fields.append(ZtLeftToRight::plain(model()->index(row, column).data().toString()));
     return fields;
 }
 

@@ -3,6 +3,7 @@
 
 #include "common/ZtAppStatus.h"
 #include "gui/ThemedIconEngine.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -33,7 +34,8 @@ void reportMissing(const QString &path)
     if (reported.contains(path))
         return;
     reported.insert(path);
-    const QString message = QCoreApplication::translate("acss", "The icon %1 is missing.").arg(path);
+    const QString message =
+        QCoreApplication::translate("acss", "The icon %1 is missing.").arg(ZtLeftToRight::isolated(path));
     ZtAppStatus().setAndLogStatus(ZtAppStatus::Warning, missingIconStatusCode, message,
                                   QStringLiteral("acss::createIcon"));
 }

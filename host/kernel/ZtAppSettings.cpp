@@ -2,6 +2,7 @@
 #include "kernel/ZtAppSettings.h"
 
 #include "common/ZtAppStatus.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -24,6 +25,11 @@ const QLatin1String currentProfileKey("Settings/CurrentProfile");
 
 constexpr int storageStatusCode = 1;
 constexpr int syncDelay = 1000; ///< milliseconds
+
+QString shownPath(const QString &path)
+{
+    return ZtLeftToRight::isolated(QDir::toNativeSeparators(path));
+}
 
 QString defaultStoragePath()
 {
@@ -299,7 +305,7 @@ bool ZtAppSettings::sync()
     m_hasSyncFailed = file.status() != QSettings::NoError;
     if (m_hasSyncFailed) {
         logStorageError(tr("The settings could not be saved to %1. Check that the folder is writable.")
-                            .arg(QDir::toNativeSeparators(m_path)));
+                            .arg(shownPath(m_path)));
         return false;
     }
     m_unsaved.clear();
@@ -361,7 +367,7 @@ void ZtAppSettings::load()
     if (!QFile(m_path).open(QIODevice::ReadOnly)) {
         m_writable = false;
         logStorageError(tr("The settings file %1 cannot be read. Changes to the settings will not be kept.")
-                            .arg(QDir::toNativeSeparators(m_path)));
+                            .arg(shownPath(m_path)));
         return;
     }
     QSettings file(m_path, QSettings::IniFormat);
@@ -388,7 +394,7 @@ void ZtAppSettings::setAside(const QString &path)
                         "back at their defaults.")
                    : tr("The settings file %1 is damaged and could not be renamed to %2. Changes to "
                         "the settings will not be kept.");
-    logStorageError(text.arg(QDir::toNativeSeparators(path), QDir::toNativeSeparators(aside)));
+    logStorageError(text.arg(shownPath(path), shownPath(aside)));
 }
 
 void ZtAppSettings::selectProfile(const QString &profile)

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtAravisCapture.h"
 
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtAravisControl.h"
 #include "measuring/ZtAravisSource.h"
 #include "measuring/ZtFrameMailbox.h"
@@ -124,9 +125,11 @@ public:
         while (!m_mailbox->isClosed()) {
             grantWishes();
             if (m_isLost)
-                return ZtAravisSource::tr("%1 is disconnected; its last picture stays").arg(title);
+                return ZtAravisSource::tr("%1 is disconnected; its last picture stays")
+                    .arg(ZtLeftToRight::isolated(title));
             if (!passFrameOn())
-                return ZtAravisSource::tr("%1 delivers pictures of a kind that cannot be shown").arg(title);
+                return ZtAravisSource::tr("%1 delivers pictures of a kind that cannot be shown")
+                    .arg(ZtLeftToRight::isolated(title));
         }
         return QString();
     }
@@ -271,7 +274,7 @@ void ZtAravisCapture::run()
     Session session(m_control.get(), m_mailbox.get());
     QString fault = session.open(m_deviceId);
     if (!fault.isEmpty())
-        fault = ZtAravisSource::tr("%1 cannot be opened (%2)").arg(m_title, fault);
+        fault = ZtAravisSource::tr("%1 cannot be opened (%2)").arg(ZtLeftToRight::isolated(m_title), fault);
     else
         fault = session.stream(m_title);
     if (!fault.isEmpty())

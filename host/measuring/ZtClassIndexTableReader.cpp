@@ -44,8 +44,10 @@ bool ZtClassIndexTableReader::readTable()
     }
     if (hasFault() || rows == m_rowCount)
         return !hasFault();
-    return fail(m_firstLine, 1,
-                tr("The first line announces %1 rows, but there are %2").arg(m_rowCount).arg(rows));
+    return fail(
+        m_firstLine, 1,
+        tr("The first line announces %n row(s), but the table has this number of them: %1", "", m_rowCount)
+            .arg(rows));
 }
 
 bool ZtClassIndexTableReader::readFirstRow()
@@ -99,10 +101,11 @@ bool ZtClassIndexTableReader::readRow(const ZtCsvRow &row)
 {
     const std::size_t fieldCount = static_cast<std::size_t>(m_valueCount) + 1;
     if (row.fields.size() != fieldCount)
-        return fail(row.line, static_cast<int>(qMin(row.fields.size(), fieldCount)) + 1,
-                    tr("The row has %1 fields, but the first line announces %2 values and a class")
-                        .arg(row.fields.size())
-                        .arg(m_valueCount));
+        return fail(
+            row.line, static_cast<int>(qMin(row.fields.size(), fieldCount)) + 1,
+            tr("The row has %n field(s), but the first line announces a class and this number of values: %1",
+               "", static_cast<int>(row.fields.size()))
+                .arg(m_valueCount));
     int type = 0;
     if (!readClass(row, &type))
         return false;

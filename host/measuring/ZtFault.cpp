@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtFault.h"
 
+#include "kernel/ZtLeftToRight.h"
+
 QString ZtFault::text() const
 {
     if (isNull())
@@ -14,5 +16,5 @@ QString ZtFault::text() const
     const QString separator = QStringLiteral(": ");
     if (!place.isEmpty())
         where += (where.isEmpty() ? QString() : separator) + place;
-    return where.isEmpty() ? message : where + separator + message;
+    return where.isEmpty() ? message : ZtLeftToRight::isolated(where) + separator + message;
 }

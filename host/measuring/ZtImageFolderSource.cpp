@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtImageFolderSource.h"
 
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtFrameMailbox.h"
 #include "measuring/ZtPicture.h"
@@ -48,7 +49,8 @@ private:
             isAnyShown = show(m_path + QLatin1Char('/') + name) || isAnyShown;
         }
         if (!isAnyShown)
-            m_mailbox->fail(ZtImageFolderSource::tr("%1: no picture of the folder can be shown").arg(m_path));
+            m_mailbox->fail(ZtImageFolderSource::tr("%1: no picture of the folder can be shown")
+                                .arg(ZtLeftToRight::isolated(m_path)));
         return isAnyShown;
     }
 

@@ -2,6 +2,7 @@
 #include "measuring/ZtKernelImage.h"
 
 #include "common/ZtAppStatus.h"
+#include "kernel/ZtLeftToRight.h"
 
 ZtKernelImage::ZtKernelImage(QObject *parent)
     : iZTKernelImage(parent)
@@ -74,9 +75,10 @@ void ZtKernelImage::slotStateChanged()
 void ZtKernelImage::logReturn()
 {
     m_wasLost = false;
-    ZtAppStatus().setAndLogStatus(ZtAppStatus::Information, 0,
-                                  tr("%1 delivers pictures again").arg(m_source->displayName()),
-                                  QStringLiteral("ZtKernelImage::slotFrameReady"));
+    ZtAppStatus().setAndLogStatus(
+        ZtAppStatus::Information, 0,
+        tr("%1 delivers pictures again").arg(ZtLeftToRight::isolated(m_source->displayName())),
+        QStringLiteral("ZtKernelImage::slotFrameReady"));
 }
 
 void ZtKernelImage::slotFault(const QString &aText)

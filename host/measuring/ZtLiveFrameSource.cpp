@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtLiveFrameSource.h"
 
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFrameMailbox.h"
 
 namespace {
@@ -122,5 +123,6 @@ void ZtLiveFrameSource::slotWatch()
     if (m_state != Running || m_idleTicks < patience)
         return;
     setState(Lost);
-    emit signalFault(tr("%1 has stopped delivering pictures; the last one stays").arg(displayName()));
+    emit signalFault(tr("%1 has stopped delivering pictures; the last one stays")
+                         .arg(ZtLeftToRight::isolated(displayName())));
 }

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtPartFile.h"
 
+#include "measuring/ZtFileFault.h"
+
 #include <QCoreApplication>
 #include <QDateTime>
 #include <QDir>
@@ -93,7 +95,7 @@ bool ZtPartFile::open()
 {
     const QFileInfo target(m_target);
     if (target.isDir()) {
-        m_error = QCoreApplication::translate("QSaveFile", "Filename refers to a directory");
+        m_error = ZtFileFault::text(EISDIR);
         return false;
     }
     for (int i = 0; i < mostTries; ++i) {
@@ -106,12 +108,17 @@ bool ZtPartFile::open()
                 m_file.setPermissions(target.permissions());
             return true;
         }
-        m_error = m_file.errorString();
+        m_error = ZtFileFault::text(m_file);
         m_file.setFileName(QString());
         if (!part.exists())
             return false;
     }
     return false;
+}
+
+QString ZtPartFile::errorString() const
+{
+    return m_error.isEmpty() ? ZtFileFault::text(m_file) : m_error;
 }
 
 bool ZtPartFile::commit()
@@ -122,7 +129,7 @@ bool ZtPartFile::commit()
     std::error_code error;
     std::filesystem::rename(toNative(m_file.fileName()), toNative(m_target), error);
     if (error) {
-        m_error = QString::fromLocal8Bit(error.message().c_str());
+        m_error = ZtFileFault::text(error.default_error_condition().value());
         return false;
     }
     m_file.setFileName(QString());

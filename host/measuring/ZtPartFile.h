@@ -32,7 +32,7 @@ public:
     /** Takes the file's place. */
     bool commit();
     /** Why open(), writing or commit() did not work. */
-    QString errorString() const { return m_error.isEmpty() ? m_file.errorString() : m_error; }
+    QString errorString() const;
 
     /** Removes the parts of the file \a path that were left behind. */
     static void removeStale(const QString &path);

@@ -3,6 +3,7 @@
 
 #include "measuring/ZtBoundedRead.h"
 #include "measuring/ZtFault.h"
+#include "measuring/ZtFileFault.h"
 #include "measuring/ZtJsonReader.h"
 #include "measuring/ZtProgress.h"
 #include "measuring/ZtSafeFile.h"
@@ -65,7 +66,7 @@ bool readBytes(const QString &path, QByteArray *bytes, ZtFault *fault, ZtProgres
     if (QFileInfo(path).isDir())
         return fail(Text::tr("This is a folder, not a file"), fault);
     if (!file.open(QIODevice::ReadOnly))
-        return fail(Text::tr("The file cannot be read (%1)").arg(file.errorString()), fault);
+        return fail(Text::tr("The file cannot be read (%1)").arg(ZtFileFault::text(file)), fault);
     if (file.size() > ZtSession::maximumBytes)
         return fail(Text::tr("The file is too large for a session"), fault);
     *bytes = ztReadAtMost(&file, ZtSession::maximumBytes + 1, progress);
@@ -74,7 +75,7 @@ bool readBytes(const QString &path, QByteArray *bytes, ZtFault *fault, ZtProgres
     if (bytes->size() > ZtSession::maximumBytes)
         return fail(Text::tr("The file is too large for a session"), fault);
     if (file.error() != QFileDevice::NoError)
-        return fail(Text::tr("The file cannot be read (%1)").arg(file.errorString()), fault);
+        return fail(Text::tr("The file cannot be read (%1)").arg(ZtFileFault::text(file)), fault);
     return true;
 }
 

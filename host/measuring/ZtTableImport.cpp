@@ -7,6 +7,7 @@
 #include "measuring/ZtBoundedRead.h"
 #include "measuring/ZtClassIndexTableReader.h"
 #include "measuring/ZtCsvReader.h"
+#include "measuring/ZtFileFault.h"
 #include "measuring/ZtImportedManipulator.h"
 #include "measuring/ZtImportedTable.h"
 #include "measuring/ZtProgress.h"
@@ -106,7 +107,7 @@ bool ZtTableImport::readFile(const QString &path, const ZtTableImportOptions &op
     if (QFileInfo(path).isDir())
         return fail(Text::tr("This is a folder, not a file"), fault);
     if (!file.open(QIODevice::ReadOnly))
-        return fail(Text::tr("The file cannot be read (%1)").arg(file.errorString()), fault);
+        return fail(Text::tr("The file cannot be read (%1)").arg(ZtFileFault::text(file)), fault);
     return readDevice(&file, path, options, table, fault, progress);
 }
 
@@ -128,7 +129,7 @@ bool ZtTableImport::readDevice(QIODevice *device, const QString &fileName,
         return fail(Text::tr("Reading was cancelled"), fault);
     const auto *file = qobject_cast<QFileDevice *>(device);
     if (file && file->error() != QFileDevice::NoError)
-        return fail(Text::tr("The file cannot be read (%1)").arg(file->errorString()), fault);
+        return fail(Text::tr("The file cannot be read (%1)").arg(ZtFileFault::text(*file)), fault);
     if (bytes.size() > limit)
         return failTooLarge(limit, fault);
     return parse(bytes, fileName, options, table, fault, progress);

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtUvcCameraSource.h"
 
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtVideoSurface.h"
 
 #include <QCamera>
@@ -44,7 +45,7 @@ void ZtUvcCameraSource::beginCapture(const std::shared_ptr<ZtFrameMailbox> &mail
 {
     // Without this, the multimedia system would take another camera.
     if (!isConnected()) {
-        lose(tr("%1 is not connected").arg(m_info.title));
+        lose(tr("%1 is not connected").arg(ZtLeftToRight::isolated(m_info.title)));
         return;
     }
     m_surface->setMailbox(mailbox);
@@ -77,7 +78,8 @@ void ZtUvcCameraSource::endCapture()
 void ZtUvcCameraSource::slotError()
 {
     if (m_camera && m_camera->error() != QCamera::NoError)
-        lose(tr("%1 is disconnected or in use (%2)").arg(m_info.title, m_camera->errorString()));
+        lose(tr("%1 is disconnected or in use (%2)")
+                 .arg(ZtLeftToRight::isolated(m_info.title), m_camera->errorString()));
 }
 
 void ZtUvcCameraSource::slotStatusChanged()

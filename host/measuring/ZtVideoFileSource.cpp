@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtVideoFileSource.h"
 
+#include "kernel/ZtLeftToRight.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtVideoSurface.h"
 
@@ -119,5 +120,6 @@ void ZtVideoFileSource::slotError()
 void ZtVideoFileSource::loseVideo(const QString &reason)
 {
     lose(tr("The video %1 cannot be played (%2)")
-             .arg(displayName(), reason.isEmpty() ? tr("the file is damaged") : reason));
+             .arg(ZtLeftToRight::isolated(displayName()),
+                  reason.isEmpty() ? tr("the file is damaged") : reason));
 }

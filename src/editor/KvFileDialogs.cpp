@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "editor/KvFileDialogs.h"
 
+#include "kernel/ZtLeftToRight.h"
+
 #include <QCoreApplication>
 #include <QDir>
 #include <QFileDialog>
@@ -57,7 +59,7 @@ bool mayOverwrite(QFileDialog &dialog, const QString &path)
     QMessageBox box(
         QMessageBox::Warning, dialog.windowTitle(),
         QCoreApplication::translate("KvFileDialogs", "%1 already exists.\nDo you want to replace it?")
-            .arg(QDir::toNativeSeparators(path)),
+            .arg(ZtLeftToRight::isolated(QDir::toNativeSeparators(path))),
         QMessageBox::Yes | QMessageBox::No, &dialog);
     // File names may look like markup.
     box.setTextFormat(Qt::PlainText);

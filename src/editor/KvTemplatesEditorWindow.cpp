@@ -7,6 +7,7 @@
 #include "editor/KvPrintProgressDialog.h"
 #include "gui/acss.h"
 #include "kernel/ZtAppSettings.h"
+#include "kernel/ZtLeftToRight.h"
 #include "report/KvBaseDisplayWidget.h"
 #include "report/KvReportPagedView.h"
 #include "report/KvReportProxyWidgetItem.h"
@@ -360,8 +361,9 @@ void KvTemplatesEditorWindow::printTo(const QString &fileName)
 
 void KvTemplatesEditorWindow::tellPrintFailed(const QString &fileName)
 {
-    QMessageBox box(QMessageBox::Critical, tr("Save failed"), tr("Cannot write to file %1").arg(fileName),
-                    QMessageBox::Ok, this);
+    QMessageBox box(QMessageBox::Critical, tr("Save failed"),
+                    tr("Cannot write to file %1").arg(ZtLeftToRight::isolated(fileName)), QMessageBox::Ok,
+                    this);
     // File names may look like markup.
     box.setTextFormat(Qt::PlainText);
     box.exec();
@@ -371,7 +373,7 @@ void KvTemplatesEditorWindow::slotTemplateStatusChanged(const QString &aPath, bo
 {
     const QString title = m_baseTitle + QStringLiteral(" - ") +
                           (aModified ? QStringLiteral("*") : QString()) +
-                          (aPath.isEmpty() ? tr("[new]") : aPath);
+                          (aPath.isEmpty() ? tr("[new]") : ZtLeftToRight::isolated(aPath));
     setWindowTitle(title);
     m_ui->titleBar->setTitle(title);
 }

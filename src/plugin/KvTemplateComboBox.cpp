@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "plugin/KvTemplateComboBox.h"
 
+#include "kernel/ZtLeftToRight.h"
+
 #include <QAbstractItemView>
 #include <QStyleOptionComboBox>
 #include <QStylePainter>
@@ -19,8 +21,8 @@ void KvTemplateComboBox::paintEvent(QPaintEvent *event)
     const QRect field =
         style()->subControlRect(QStyle::CC_ComboBox, &option, QStyle::SC_ComboBoxEditField, this);
     constexpr int inset = 1; // styles leave a pixel at either side of the text
-    option.currentText =
-        fontMetrics().elidedText(option.currentText, Qt::ElideMiddle, field.width() - 2 * inset);
+    option.currentText = ZtLeftToRight::isolated(
+        fontMetrics().elidedText(option.currentText, Qt::ElideMiddle, field.width() - 2 * inset));
     QStylePainter painter(this);
     painter.drawComplexControl(QStyle::CC_ComboBox, option);
     painter.drawControl(QStyle::CE_ComboBoxLabel, option);

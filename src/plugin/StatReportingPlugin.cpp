@@ -10,6 +10,7 @@
 #include "gui/QtAdvancedStylesheet.h"
 #include "gui/acss.h"
 #include "kernel/ZtAppSettings.h"
+#include "kernel/ZtLeftToRight.h"
 #include "kernel/ZtSignalCenter.h"
 #include "resources/KvReportResources.h"
 #include "statistics/KvStatisticsWindow.h"
@@ -196,7 +197,8 @@ void StatReportingPlugin::addTemplate(int index, const QString &path)
 {
     const QFileInfo file(path);
     m_ui->theTemplatePath->insertItem(index, file.fileName(), file.absoluteFilePath());
-    m_ui->theTemplatePath->setItemData(index, file.absoluteFilePath(), Qt::ToolTipRole);
+    m_ui->theTemplatePath->setItemData(index, ZtLeftToRight::isolated(file.absoluteFilePath()),
+                                       Qt::ToolTipRole);
 }
 
 QString StatReportingPlugin::browseFolder() const

@@ -2,6 +2,7 @@
 #include "templates/KvTemplateModel.h"
 
 #include "data/KvReportKernelData.h"
+#include "kernel/ZtLeftToRight.h"
 #include "report/KvFooterWidget.h"
 #include "report/KvHeaderWidget.h"
 #include "report/KvPageCountWidget.h"
@@ -91,14 +92,14 @@ bool KvTemplateModel::readObject(const QString &path, QJsonObject &root) const
 {
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly)) {
-        warn(tr("Cannot read"), tr("Cannot open file %1").arg(path));
+        warn(tr("Cannot read"), tr("Cannot open file %1").arg(ZtLeftToRight::isolated(path)));
         return false;
     }
     const QByteArray bytes = file.read(kLargestFile + 1);
     QJsonParseError error;
     const QJsonDocument document = QJsonDocument::fromJson(bytes, &error);
     if (error.error != QJsonParseError::NoError || bytes.size() > kLargestFile) {
-        warn(tr("Error reading file"), tr("Cannot read file %1").arg(path));
+        warn(tr("Error reading file"), tr("Cannot read file %1").arg(ZtLeftToRight::isolated(path)));
         return false;
     }
     root = document.object();
@@ -166,7 +167,7 @@ bool KvTemplateModel::save(const QString &path)
     emit signalCloseAllEditors();
     QFile file(path);
     if (!file.open(QIODevice::WriteOnly | QIODevice::Truncate)) {
-        warn(tr("Cannot save"), tr("Cannot create file %1").arg(path));
+        warn(tr("Cannot save"), tr("Cannot create file %1").arg(ZtLeftToRight::isolated(path)));
         return false;
     }
     QJsonObject root;

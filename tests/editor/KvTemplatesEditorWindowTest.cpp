@@ -11,6 +11,7 @@
 #include "support/FileDialogAnswerer.h"
 #include "support/MessageBoxAnswerer.h"
 #include "support/MetaMethods.h"
+#include "support/RightToLeft.h"
 #include "support/StatReportTest.h"
 #include "widgets/KvWindowTitleBar.h"
 
@@ -300,6 +301,11 @@ void KvTemplatesEditorWindowTest::titleTellsTheTemplate()
     editor.slotTemplateStatusChanged(path, modified);
     QCOMPARE(editor.windowTitle(), title);
     QCOMPARE(editor.findChild<KvWindowTitleBar *>()->title(), title);
+    if (path.isEmpty())
+        return;
+    const RightToLeft arabic;
+    editor.slotTemplateStatusChanged(path, modified);
+    QCOMPARE(editor.windowTitle(), QString(title).replace(path, RightToLeft::isolated(path)));
 }
 
 void KvTemplatesEditorWindowTest::titleFollowsTheModel()

@@ -37,6 +37,7 @@ private slots:
     void leavesTheOutputAlone();
     void speaksTheLanguage_data();
     void speaksTheLanguage();
+    void writesNoMarksOfDirection();
     void programsReadEnglish();
     void showsHelp_data();
     void showsHelp();
@@ -279,6 +280,16 @@ void StatReportProgramTest::speaksTheLanguage()
         StatReportProgram::runWith(variables, line.split(QLatin1Char(' ')), m_folder->path());
     QCOMPARE(result.errors, errors);
     QVERIFY(result.exitCode > 0);
+}
+
+/// Messages go to files and to terminals, which order texts as they can.
+void StatReportProgramTest::writesNoMarksOfDirection()
+{
+    const QString table = QFileInfo(path("none.csv")).absoluteFilePath();
+    const ProgramResult arabic = StatReportProgram::runWith(
+        {text("LC_ALL=ar_EG.UTF-8")}, {text("stats"), text("--table"), table}, m_folder->path());
+    QVERIFY2(arabic.errors.startsWith(text("statreport: ") + table + text(": ")), qPrintable(arabic.errors));
+    QVERIFY(arabic.errors.contains(QChar(0x0627))); // it is Arabic
 }
 
 /// What programs read is the same in every language, what people read is not.

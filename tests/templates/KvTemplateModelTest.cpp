@@ -5,6 +5,7 @@
 #include "report/KvPageCountWidget.h"
 #include "support/FakeReport.h"
 #include "support/MessageBoxAnswerer.h"
+#include "support/RightToLeft.h"
 #include "support/StatReportTest.h"
 #include "support/TemplateSignalLog.h"
 #include "templates/KvUserMessages.h"
@@ -1065,9 +1066,16 @@ void KvTemplateModelTest::messagesGoToTheInstalledObject()
     QCOMPARE(messages.noted(), expected);
     QCOMPARE(answerer.boxes().size(), 0);
 
+    {
+        const RightToLeft arabic;
+        QVERIFY(!report.model()->load(missing));
+        QCOMPARE(messages.noted().last().second,
+                 QStringLiteral("Cannot open file ") + RightToLeft::isolated(missing));
+    }
+
     report.model()->setUserMessages(nullptr);
     QVERIFY(!report.model()->load(missing));
-    QCOMPARE(messages.noted().size(), 3);
+    QCOMPARE(messages.noted().size(), 4);
     QCOMPARE(answerer.boxes().size(), 1);
 }
 

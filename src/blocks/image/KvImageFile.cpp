@@ -2,6 +2,7 @@
 #include "blocks/image/KvImageFile.h"
 
 #include "common/ZtAppStatus.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -11,7 +12,8 @@ namespace {
 
 void report(const QString &message, const QString &path, const char *source)
 {
-    ZtAppStatus().setAndLogStatus(ZtAppStatus::Warning, 0, message.arg(QDir::toNativeSeparators(path)),
+    ZtAppStatus().setAndLogStatus(ZtAppStatus::Warning, 0,
+                                  message.arg(ZtLeftToRight::isolated(QDir::toNativeSeparators(path))),
                                   QLatin1String(source));
 }
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskCalibrationText.h"
 
+#include "support/RightToLeft.h"
 #include "support/StatReportTest.h"
 
 #include <QLocale>
@@ -33,6 +34,11 @@ void KvDeskCalibrationTextTest::pixelSizes()
 {
     QFETCH(ZtCalibration, calibration);
     QTEST(KvDeskCalibrationText::pixelSize(calibration), "text");
+    // Number and unit keep their order.
+    const RightToLeft arabic;
+    QFETCH(QString, text);
+    QCOMPARE(KvDeskCalibrationText::pixelSize(calibration),
+             text.isEmpty() ? text : RightToLeft::isolated(text));
 }
 
 void KvDeskCalibrationTextTest::origins()

@@ -2,6 +2,7 @@
 #include "KvDeskCalibrator.h"
 
 #include "CalibratedDesk.h"
+#include "DeskLog.h"
 #include "kernel/ZtAppSettings.h"
 
 namespace {
@@ -36,12 +37,14 @@ private slots:
     void offerIsWithdrawn();
     void openedSessionsAreNotQuestioned();
     void firstImageCalibratesAnEmptySession();
+    void theLogTellsOfIt();
 };
 
 void KvDeskCalibratorTest::init()
 {
     StatReportTest::init();
     ZtAppSettings::getInstance()->setStoragePath(QString());
+    ZtStatusLog::getInstance()->clear();
 }
 
 void KvDeskCalibratorTest::calibratesAndRemembers()
@@ -226,6 +229,28 @@ void KvDeskCalibratorTest::firstImageCalibratesAnEmptySession()
     QVERIFY(desk.document.calibration().hasSamePixelSize(ZtCalibration(10.0, 20.0)));
     QVERIFY(desk.document.calibration().date().isValid());
     QCOMPARE(desk.calibrator.store()->objectives(), QStringList());
+}
+
+void KvDeskCalibratorTest::theLogTellsOfIt()
+{
+    CalibratedDesk desk;
+    QVERIFY(desk.open(CalibratedDesk::picture(QStringLiteral("f.png"), 10.0, 20.0)));
+    desk.calibrator.calibrate(typed("10x", 0.5));
+    desk.calibrator.calibrate(typed("", 0.25));
+    desk.calibrator.calibrate(typed("nothing", 0.0));
+    desk.calibrator.useAgain(desk.calibrator.store()->current(QStringLiteral("10x")), QString());
+    desk.calibrator.slotUseOffered();
+    const QStringList expected{
+        QStringLiteral("Calibrated: f.png, 10 × 20 μm per pixel"),
+        QStringLiteral("Calibrated: 10x, 0.5 μm per pixel"),
+        QStringLiteral("Calibrated: Typed, 0.25 μm per pixel"),
+        QStringLiteral("Calibrated: 10x, 0.5 μm per pixel"),
+        QStringLiteral("Calibrated: 10x, 10 × 20 μm per pixel"),
+    };
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Information), expected);
+    // An image that says the same changes nothing.
+    QVERIFY(desk.open(CalibratedDesk::picture(QStringLiteral("g.png"), 10.0, 20.0)));
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Information).size(), expected.size());
 }
 
 STATREPORT_TEST_MAIN(KvDeskCalibratorTest)

@@ -62,7 +62,7 @@ void KvDeskExportDialogTest::texts()
     QCOMPARE(dialog.numbersBox()->itemText(0), QStringLiteral("1.5, commas between the fields"));
     QCOMPARE(dialog.numbersBox()->itemText(1),
              QStringLiteral("1,5, semicolons between the fields (spreadsheets, Deutsch)"));
-    QCOMPARE(dialog.selectionBox()->text(), QStringLiteral("Only the selected objects (2)"));
+    QCOMPARE(dialog.selectionBox()->text(), QStringLiteral("Only the selected object(s) (2)"));
     QVERIFY(!dialog.guardBox()->toolTip().isEmpty());
 }
 

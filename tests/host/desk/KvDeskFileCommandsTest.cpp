@@ -165,11 +165,11 @@ void KvDeskFileCommandsTest::opensEveryKind_data()
     QTest::addColumn<int>("objects");
     QTest::addColumn<QString>("message");
     QTest::newRow("session") << DeskFiles::demoSession() << 33
-                             << QStringLiteral("Session opened: demo.json (objects: 33)");
+                             << QStringLiteral("Session opened: demo.json (33 object(s))");
     QTest::newRow("image") << DeskFiles::image(QStringLiteral("kind.png")) << 0
                            << QStringLiteral("Image opened: kind.png");
     QTest::newRow("table") << DeskFiles::table(QStringLiteral("kind.csv")) << 2
-                           << QStringLiteral("Table imported: kind.csv (objects: 2)");
+                           << QStringLiteral("Table imported: kind.csv (2 object(s))");
 }
 
 void KvDeskFileCommandsTest::opensEveryKind()
@@ -306,13 +306,13 @@ void KvDeskFileCommandsTest::choosesFiles_data()
     QTest::addColumn<QString>("message");
     QTest::newRow("session") << QByteArray("slotOpenSession") << DeskFiles::demoSession()
                              << QStringLiteral("Open session") << QStringLiteral("Sessions (*.json)")
-                             << QStringLiteral("Session opened: demo.json (objects: 33)");
+                             << QStringLiteral("Session opened: demo.json (33 object(s))");
     QTest::newRow("image") << QByteArray("slotOpenImage") << DeskFiles::image(QStringLiteral("chosen.png"))
                            << QStringLiteral("Open image") << QStringLiteral("Images (")
                            << QStringLiteral("Image opened: chosen.png");
     QTest::newRow("table") << QByteArray("slotImportTable") << DeskFiles::table(QStringLiteral("chosen.csv"))
                            << QStringLiteral("Import table") << QStringLiteral("Tables (*.csv")
-                           << QStringLiteral("Table imported: chosen.csv (objects: 2)");
+                           << QStringLiteral("Table imported: chosen.csv (2 object(s))");
 }
 
 void KvDeskFileCommandsTest::choosesFiles()
@@ -370,9 +370,9 @@ void KvDeskFileCommandsTest::dropsAreOpenedByKind()
     m_commands->openFiles({DeskFiles::table(QStringLiteral("d.csv")),
                            DeskFiles::image(QStringLiteral("d.png")), DeskFiles::demoSession()});
     QCOMPARE(DeskLog::messages(ZtAppStatus::Information),
-             QStringList({QStringLiteral("Session opened: demo.json (objects: 33)"),
+             QStringList({QStringLiteral("Session opened: demo.json (33 object(s))"),
                           QStringLiteral("Image opened: d.png"),
-                          QStringLiteral("Table imported: d.csv (objects: 2)")}));
+                          QStringLiteral("Table imported: d.csv (2 object(s))")}));
     QCOMPARE(m_session->objectCount(), 35);
 }
 

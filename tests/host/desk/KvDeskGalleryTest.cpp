@@ -339,7 +339,7 @@ void KvDeskGalleryTest::removesSeveral()
     m_gallery->view()->selectAll();
     const MessageBoxAnswerer answerer(QMessageBox::Yes);
     menuAction(QStringLiteral("&Move to trash..."))->trigger();
-    QCOMPARE(answerer.boxes().first().text, QStringLiteral("Move the selected images (3) to the trash?"));
+    QCOMPARE(answerer.boxes().first().text, QStringLiteral("Move 3 selected image(s) to the trash?"));
     QCOMPARE(m_folder->names(), QStringList());
     QTRY_VERIFY(m_gallery->emptyState()->isVisible());
     QCOMPARE(DeskLog::messages(ZtAppStatus::Information),

@@ -39,6 +39,7 @@
 #include "measuring/ZtFrameSourceCatalogue.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "support/MessageBoxAnswerer.h"
+#include "support/RightToLeft.h"
 
 #include <QLineEdit>
 
@@ -145,6 +146,7 @@ private slots:
     void warningForThePanelOpensIt();
     void messageForABoxIsShown();
     void recentSessions();
+    void namesOfFilesKeepTheirDirection();
     void missingRecentSessionIsForgotten();
     void toggledTheme();
     void everyButtonIsExplained();
@@ -608,7 +610,8 @@ void KvDeskMainWindowTest::statusBarFollowsTheImage()
     QCOMPARE(m_window->deskStatusBar()->imageText(), QStringLiteral("960 × 720 px, 12.5 μm/px"));
     action(KvDeskActions::ZoomActual)->trigger();
     QCOMPARE(m_window->deskStatusBar()->zoomText(), QStringLiteral("100 %"));
-    QCOMPARE(m_window->deskStatusBar()->message(), QStringLiteral("Session opened: demo.json (objects: 33)"));
+    QCOMPARE(m_window->deskStatusBar()->message(),
+             QStringLiteral("Session opened: demo.json (33 object(s))"));
     m_document->clear();
     QCOMPARE(m_window->deskStatusBar()->imageText(), QString());
 }
@@ -647,6 +650,24 @@ void KvDeskMainWindowTest::recentSessions()
     emit m_window->recentMenu()->aboutToShow();
     QCOMPARE(m_window->recentMenu()->actions().at(0)->text(), QStringLiteral("this && that.json"));
     m_window->recentMenu()->actions().at(1)->trigger();
+    QCOMPARE(m_window->session()->path(), DeskFiles::demoSession());
+}
+
+void KvDeskMainWindowTest::namesOfFilesKeepTheirDirection()
+{
+    const RightToLeft arabic;
+    const QString name = RightToLeft::isolated(QStringLiteral("demo.json"));
+    open();
+    QCOMPARE(m_window->windowTitle(), name + QStringLiteral("[*] - Measuring Desk"));
+    QVERIFY2(m_window->deskStatusBar()->message().contains(name),
+             qPrintable(m_window->deskStatusBar()->message()));
+    emit m_window->recentMenu()->aboutToShow();
+    const QAction *const recent = m_window->recentMenu()->actions().first();
+    QCOMPARE(recent->text(), name);
+    QCOMPARE(recent->toolTip(), RightToLeft::isolated(DeskFiles::demoSession()));
+    // What is opened and remembered is the file itself.
+    QCOMPARE(recent->data().toString(), DeskFiles::demoSession());
+    QCOMPARE(KvDeskRecentFiles::paths(), QStringList(DeskFiles::demoSession()));
     QCOMPARE(m_window->session()->path(), DeskFiles::demoSession());
 }
 

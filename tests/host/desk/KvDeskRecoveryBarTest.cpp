@@ -115,7 +115,7 @@ void KvDeskRecoveryBarTest::anotherOneIsChosen()
     RecoveryCopies::add(m_folder, QStringLiteral("b"), 2, 0);
     m_recovery->find(m_folder);
     const QList<QAction *> actions = m_bar->othersButton()->menu()->actions();
-    QVERIFY(actions.at(1)->text().endsWith(QStringLiteral(": this && that.json (objects: 1)")));
+    QVERIFY(actions.at(1)->text().endsWith(QStringLiteral(": this && that.json (1 object(s))")));
     actions.at(1)->trigger();
     QCOMPARE(m_bar->text(), sentence(1));
     m_bar->restoreButton()->click();

@@ -95,9 +95,9 @@ void KvDeskRecoveryTest::findsTheNewestFirst()
     RecoveryCopies::add(m_folder, QStringLiteral("c"), 3, 5);
     find();
     QCOMPARE(m_recovery->count(), 3);
-    QCOMPARE(m_recovery->describe(0), QStringLiteral("coins.json (objects: 2)"));
-    QCOMPARE(m_recovery->describe(1), QStringLiteral("Untitled session (objects: 3)"));
-    QCOMPARE(m_recovery->describe(2), QStringLiteral("Untitled session (objects: 1)"));
+    QCOMPARE(m_recovery->describe(0), QStringLiteral("coins.json (2 object(s))"));
+    QCOMPARE(m_recovery->describe(1), QStringLiteral("Untitled session (3 object(s))"));
+    QCOMPARE(m_recovery->describe(2), QStringLiteral("Untitled session (1 object(s))"));
 }
 
 void KvDeskRecoveryTest::copiesOfRunningProgramsAreTheirs()
@@ -180,7 +180,7 @@ void KvDeskRecoveryTest::restores()
     QVERIFY(QFileInfo::exists(file));
     QCOMPARE(DeskFiles::bytes(session), QByteArray("{}"));
     QCOMPARE(DeskLog::messages(ZtAppStatus::Information),
-             QStringList(QStringLiteral("Measurements restored: restored.json (objects: 2)")));
+             QStringList(QStringLiteral("Measurements restored: restored.json (2 object(s))")));
 }
 
 void KvDeskRecoveryTest::restoredCopyGoes_data()

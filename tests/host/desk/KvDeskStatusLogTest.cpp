@@ -8,6 +8,7 @@
 #include "KvDeskStatusLogModel.h"
 #include "KvDeskTableView.h"
 #include "common/ZtAppStatus.h"
+#include "support/RightToLeft.h"
 #include "support/StatReportTest.h"
 
 class KvDeskStatusLogTest : public StatReportTest
@@ -21,6 +22,7 @@ private slots:
     void clearing();
     void followsTheEnd();
     void closing();
+    void copiesNoMarks();
 
 private:
     static void log(int count)
@@ -46,6 +48,18 @@ void KvDeskStatusLogTest::emptyState()
     log(1);
     QVERIFY(state->isHidden());
     QVERIFY(panel.clearButton()->isEnabled());
+}
+
+void KvDeskStatusLogTest::copiesNoMarks()
+{
+    const RightToLeft arabic;
+    const KvDeskStatusLog panel;
+    const QString path = QStringLiteral("/x/a.json");
+    KvDeskStatus::log(ZtAppStatus::Information, RightToLeft::isolated(path), QString());
+    auto *const view = panel.findChild<KvDeskTableView *>();
+    view->selectAll();
+    QVERIFY2(view->selectedText().endsWith(QLatin1Char('\t') + path + QLatin1Char('\n')),
+             qPrintable(view->selectedText()));
 }
 
 void KvDeskStatusLogTest::clearing()

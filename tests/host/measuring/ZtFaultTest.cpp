@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+#include "support/RightToLeft.h"
 #include "support/StatReportTest.h"
 
 #include "measuring/ZtFault.h"
@@ -9,6 +10,7 @@ class ZtFaultTest : public StatReportTest
 private slots:
     void namesThePartsThatAreKnown_data();
     void namesThePartsThatAreKnown();
+    void placesKeepTheirDirection();
 };
 
 void ZtFaultTest::namesThePartsThatAreKnown_data()
@@ -46,6 +48,14 @@ void ZtFaultTest::namesThePartsThatAreKnown()
     fault.message = QStringLiteral("It is wrong");
     QVERIFY(!fault.isNull());
     QTEST(fault.text(), "text");
+}
+
+void ZtFaultTest::placesKeepTheirDirection()
+{
+    const RightToLeft arabic;
+    const ZtFault fault{QStringLiteral("/a/t.csv"), 3, 2, QString(), QStringLiteral("It is wrong")};
+    QCOMPARE(fault.text(),
+             RightToLeft::isolated(QStringLiteral("/a/t.csv:3:2")) + QStringLiteral(": It is wrong"));
 }
 
 STATREPORT_TEST_MAIN(ZtFaultTest)

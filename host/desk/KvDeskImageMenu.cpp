@@ -1,0 +1,35 @@
+// SPDX-License-Identifier: MIT
+#include "KvDeskImageMenu.h"
+
+#include "KvDeskActions.h"
+#include "KvDeskImageView.h"
+
+#include <QGuiApplication>
+
+KvDeskImageMenu::KvDeskImageMenu(KvDeskActions *actions, KvDeskImageView *view)
+    : QMenu(view)
+{
+    using A = KvDeskActions;
+    const auto add = [this, actions](std::initializer_list<A::Id> ids) {
+        for (const A::Id id : ids)
+            addAction(actions->action(id));
+    };
+    // The view lies from left to right for the image's sake.
+    setLayoutDirection(QGuiApplication::layoutDirection());
+    setToolTipsVisible(true);
+    add({A::Rename});
+    addSeparator();
+    add({A::Cut, A::Copy, A::Paste, A::Delete});
+    addSeparator();
+    add({A::SelectAll});
+    addSeparator();
+    add({A::ZoomFit, A::ZoomActual});
+    connect(view, SIGNAL(signalMenuRequested(QPoint)), this, SLOT(slotShow(QPoint)));
+}
+
+void KvDeskImageMenu::slotShow(const QPoint &aPosition)
+{
+    // Some systems report the same key twice, as a key and as a wish for the menu.
+    if (!isVisible())
+        popup(aPosition);
+}
