@@ -11,6 +11,7 @@
 #include <QFileInfo>
 #include <QScrollBar>
 #include <QTextBlock>
+#include <QTextList>
 #include <QTextTable>
 #include <QWheelEvent>
 
@@ -23,6 +24,7 @@ constexpr int cellPadding = 4;
 constexpr int tableMargin = 8;
 constexpr int headingTopMargin = 16;
 constexpr int blockMargin = 8;
+constexpr int itemMargin = 4;
 constexpr int zoomStep = 10;
 constexpr int smallestZoom = 50;
 constexpr int largestZoom = 300;
@@ -80,16 +82,39 @@ QTextCharFormat codeFormat(const QTextCharFormat &old)
             format.setProperty(kept, old.property(kept));
     }
     format.setFontFamily(QStringLiteral("monospace"));
+    format.setFontFamilies({QStringLiteral("DejaVu Sans Mono"), QStringLiteral("Noto Sans Mono"),
+                            QStringLiteral("Liberation Mono"), QStringLiteral("monospace")});
     format.setFontStyleHint(QFont::Monospace);
     format.setFontFixedPitch(true);
     format.setBackground(themeColor("raised-hover"));
     return format;
 }
 
+// The accent alone is too dark to read on a dark page.
 QTextCharFormat linkFormat(QTextCharFormat format)
 {
-    format.setForeground(themeColor("accent-hover"));
+    format.setForeground(themeColor("text"));
+    format.setFontUnderline(true);
+    format.setUnderlineColor(themeColor("accent-hover"));
     return format;
+}
+
+QTextBlockFormat spaced(int top, int bottom)
+{
+    QTextBlockFormat format;
+    format.setTopMargin(top);
+    format.setBottomMargin(bottom);
+    return format;
+}
+
+// Neighbours share the larger of their margins.
+QTextBlockFormat spaceOf(const QTextBlock &block)
+{
+    if (block.blockFormat().headingLevel() > 0)
+        return spaced(block.position() == 0 ? 0 : headingTopMargin, blockMargin);
+    if (block.blockFormat().hasProperty(QTextFormat::BlockCodeFence))
+        return spaced(0, 0);
+    return block.textList() ? spaced(itemMargin, itemMargin) : spaced(blockMargin, blockMargin);
 }
 
 } // namespace
@@ -117,6 +142,7 @@ void KvDeskGuideText::load(const QString &path)
 {
     setMarkdown(read(path));
     nameHeadings();
+    spaceBlocks();
     slotColourText();
     // The place that the first step back goes to.
     if (!m_headings.isEmpty())
@@ -156,10 +182,15 @@ void KvDeskGuideText::nameHeadings()
         name.setAnchor(true);
         name.setAnchorNames({heading.anchor});
         cursor.mergeCharFormat(name);
-        QTextBlockFormat space;
-        space.setTopMargin(heading.position == 0 ? 0 : headingTopMargin);
-        space.setBottomMargin(blockMargin);
-        cursor.mergeBlockFormat(space);
+    }
+}
+
+void KvDeskGuideText::spaceBlocks()
+{
+    for (QTextBlock block = document()->begin(); block.isValid(); block = block.next()) {
+        QTextCursor cursor(block);
+        if (!cursor.currentTable())
+            cursor.mergeBlockFormat(spaceOf(block));
     }
 }
 

@@ -63,6 +63,7 @@ private slots:
 private:
     void load(const QString &path);
     void nameHeadings();
+    void spaceBlocks();
     void colourTables();
     bool select(const QString &text, const QTextCursor &from, QTextDocument::FindFlags flags);
 

@@ -21,7 +21,9 @@ namespace {
 
 constexpr QSize firstSize(1024, 768);
 constexpr QSize smallestSize(480, 320);
-constexpr int contentsWidth = 240;
+constexpr int contentsWidth = 272;
+constexpr int itemHeight = 24;
+constexpr int itemSpacing = 2;
 constexpr int findWidth = 240;
 constexpr int resultWidth = 96;
 constexpr int deepestContents = 2; ///< level of headings
@@ -77,6 +79,7 @@ void KvDeskGuideWindow::createContents()
 {
     m_contents->setAccessibleName(tr("Contents"));
     m_contents->setFrameShape(QFrame::NoFrame);
+    m_contents->setSpacing(itemSpacing);
     m_contents->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     // The headings are in the language of the guide.
     m_contents->setLayoutDirection(Qt::LeftToRight);
@@ -86,6 +89,7 @@ void KvDeskGuideWindow::createContents()
             continue;
         auto *const item = new QListWidgetItem(headings.at(i).title, m_contents);
         item->setData(Qt::UserRole, i);
+        item->setSizeHint(QSize(0, itemHeight));
     }
     m_contents->setCurrentRow(0);
 }

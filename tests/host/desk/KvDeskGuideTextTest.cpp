@@ -292,7 +292,8 @@ void KvDeskGuideTextTest::followsTheTheme()
     for (const QString &theme : {QStringLiteral("Light"), QStringLiteral("Dark")}) {
         KvDeskTheme::apply(theme);
         QCOMPARE(formatOf(QStringLiteral("second")).foreground().color(),
-                 style->color(QStringLiteral("accent-hover")));
+                 style->color(QStringLiteral("text")));
+        QVERIFY(formatOf(QStringLiteral("second")).fontUnderline());
         QCOMPARE(formatOf(QStringLiteral("Ctrl+S")).background().color(),
                  style->color(QStringLiteral("raised-hover")));
         const auto *const table =
