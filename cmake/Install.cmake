@@ -41,26 +41,46 @@ function(statreport_install_link component link target)
   install(FILES ${made} DESTINATION ${folder} COMPONENT ${component})
 endfunction()
 
+# Installs a file as Debian wants changelogs and manuals: compressed, and alike in every build.
+function(statreport_install_compressed component source folder name)
+  set(packed ${PROJECT_BINARY_DIR}/compressed/${component}/${name}.gz)
+  get_filename_component(packed_folder ${packed} DIRECTORY)
+  file(MAKE_DIRECTORY ${packed_folder})
+  set_property(DIRECTORY ${PROJECT_SOURCE_DIR} APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${source})
+  execute_process(COMMAND gzip -9nc ${PROJECT_SOURCE_DIR}/${source} OUTPUT_FILE ${packed} COMMAND_ERROR_IS_FATAL ANY)
+  install(FILES ${packed} DESTINATION ${folder} COMPONENT ${component})
+endfunction()
+
 # --- Component host
 install(TARGETS ${STATREPORT_HOST_LIBRARIES} EXPORT StatReportHostTargets
   LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT host NAMELINK_COMPONENT sdk
   INCLUDES DESTINATION ${STATREPORT_SDK_INCLUDE_DIR})
 
-# Where Debian's packages have their licence.
+# Where Debian's packages have their licence, their history, and what its checker need not report.
 foreach(package libstatreporthost${PROJECT_VERSION_MAJOR}:host measuringdesk:desk statreport-plugin:plugin libstatreporthost-dev:sdk)
   string(REPLACE ":" ";" package ${package})
   list(GET package 0 package_name)
   list(GET package 1 component)
   install(FILES LICENSE RENAME copyright DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/${package_name} COMPONENT ${component})
+  statreport_install_compressed(${component} packaging/linux/changelog ${CMAKE_INSTALL_DATADIR}/doc/${package_name} changelog)
 endforeach()
+install(FILES packaging/linux/libstatreporthost.lintian-overrides RENAME libstatreporthost${PROJECT_VERSION_MAJOR}
+  DESTINATION ${CMAKE_INSTALL_DATADIR}/lintian/overrides COMPONENT host)
 
 # --- Component desk
 install(TARGETS ${STATREPORT_PROGRAMS} RUNTIME DESTINATION ${STATREPORT_PROGRAM_DIR} COMPONENT desk)
 foreach(program ${STATREPORT_PROGRAMS})
   statreport_install_link(desk ${CMAKE_INSTALL_BINDIR}/${program} ${programs_from_bin}/${program})
-  install(FILES docs/man/${program}.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 COMPONENT desk)
+  statreport_install_compressed(desk docs/man/${program}.1 ${CMAKE_INSTALL_MANDIR}/man1 ${program}.1)
 endforeach()
 install(DIRECTORY examples/sessions examples/tables examples/pictures DESTINATION ${STATREPORT_EXAMPLES_DIR} COMPONENT desk)
+# The guide that the Desk shows, what it links to, and the pictures that it names.
+set_property(DIRECTORY ${PROJECT_SOURCE_DIR} APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS docs/user-guide.md)
+set(guide_dir ${CMAKE_INSTALL_DATADIR}/doc/measuringdesk)
+install(FILES docs/user-guide.md docs/tables.md docs/rtp-format.md DESTINATION ${guide_dir} COMPONENT desk)
+file(STRINGS docs/user-guide.md guide_pictures REGEX "^!\\[")
+list(TRANSFORM guide_pictures REPLACE "^!\\[.*\\]\\((.*)\\)$" "docs/\\1")
+install(FILES ${guide_pictures} DESTINATION ${guide_dir}/pictures COMPONENT desk)
 set(app_id org.statreport.measuringdesk)
 install(FILES packaging/linux/${app_id}.desktop DESTINATION ${CMAKE_INSTALL_DATADIR}/applications COMPONENT desk)
 install(FILES packaging/linux/${app_id}.metainfo.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/metainfo COMPONENT desk)

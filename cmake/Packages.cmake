@@ -5,7 +5,8 @@ set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME statreport)
 set(CPACK_PACKAGE_VENDOR "StatReport")
 set(CPACK_PACKAGE_CONTACT "The StatReport developers <developers@statreport.invalid>")
-set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "measure objects on images and report the results")
+# Each package has a first line of its own; this one would stand above it.
+set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "")
 set(CPACK_RESOURCE_FILE_LICENSE ${PROJECT_SOURCE_DIR}/LICENSE)
 set(CPACK_STRIP_FILES ON)
 set(CPACK_INSTALL_DEFAULT_DIRECTORY_PERMISSIONS
@@ -24,6 +25,10 @@ set(exact "(= ${PROJECT_VERSION})")
 
 set(CPACK_DEBIAN_HOST_PACKAGE_NAME libstatreporthost${PROJECT_VERSION_MAJOR})
 set(CPACK_DEBIAN_HOST_PACKAGE_SECTION libs)
+# The system's trigger brings the linker's cache up to date. CPack would add scripts that do so, too, unless there are
+# others of their names; files that do not exist keep it from that and are left out.
+set(CPACK_DEBIAN_HOST_PACKAGE_CONTROL_EXTRA ${PROJECT_SOURCE_DIR}/packaging/linux/triggers
+  ${PROJECT_BINARY_DIR}/none/postinst ${PROJECT_BINARY_DIR}/none/postrm)
 set(CPACK_COMPONENT_HOST_DESCRIPTION "libraries that measuring applications and report plug-ins share
  The contract between an image-measurement application and its report plug-ins:
  object types and measured objects, frames, signals, settings, tools, themes.")
@@ -34,8 +39,9 @@ set(CPACK_DEBIAN_DESK_PACKAGE_DEPENDS "libstatreporthost${PROJECT_VERSION_MAJOR}
 set(CPACK_DEBIAN_DESK_PACKAGE_RECOMMENDS
   "statreport-plugin ${exact}, fonts-open-sans, fonts-noto-core, fonts-noto-cjk, qttranslations5-l10n")
 set(CPACK_COMPONENT_DESK_DESCRIPTION "measure objects on microscope and camera images
- Opens an image or a camera, is calibrated, and measures lengths, angles, areas,
- diameters and counts. With the report plug-in its values go into PDF reports.
+ Opens an image or a camera, is calibrated, and measures lengths, angles,
+ areas, diameters and counts. With the report plug-in its values go into PDF
+ reports.
  The command-line program statreport makes the same reports without a display.")
 
 set(CPACK_DEBIAN_PLUGIN_PACKAGE_NAME statreport-plugin)

@@ -9,7 +9,7 @@ qttools5-dev qttools5-dev-tools qttranslations5-l10n libtiff-dev fonts-open-sans
 # Videos and cameras of the Measuring Desk; a build without them has no such frame sources.
 CAMERA_PACKAGES="pkg-config qtmultimedia5-dev libqt5multimedia5-plugins gstreamer1.0-plugins-base \
 gstreamer1.0-plugins-good gstreamer1.0-plugins-bad libaravis-dev libusb-1.0-0-dev"
-TEST_PACKAGES="poppler-utils qpdf xvfb xauth xdotool desktop-file-utils appstream shared-mime-info mandoc"
+TEST_PACKAGES="poppler-utils qpdf xvfb xauth xdotool desktop-file-utils appstream shared-mime-info mandoc zsh fish"
 BENCH_PACKAGES="libbenchmark-dev"
 
 is_installed() {

@@ -119,6 +119,8 @@ constexpr Definition definitions[] = {
      QT_TRANSLATE_NOOP("KvDeskActions", "Change between the dark and the light theme"), "theme", "F8", false},
     {KvDeskActions::Settings, QT_TRANSLATE_NOOP("KvDeskActions", "Settin&gs..."),
      QT_TRANSLATE_NOOP("KvDeskActions", "Settings"), "settings", "Ctrl+,", false},
+    {KvDeskActions::Guide, QT_TRANSLATE_NOOP("KvDeskActions", "&User guide"),
+     QT_TRANSLATE_NOOP("KvDeskActions", "Read the user guide"), nullptr, "F1", false},
     {KvDeskActions::StartPage, QT_TRANSLATE_NOOP("KvDeskActions", "&Start page"),
      QT_TRANSLATE_NOOP("KvDeskActions", "Show the first steps, the examples and the recent sessions"),
      nullptr, nullptr, false},

@@ -57,6 +57,7 @@ public:
         ShowGallery,
         ToggleTheme,
         Settings,
+        Guide,
         StartPage,
         About,
         Count

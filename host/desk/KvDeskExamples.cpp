@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskExamples.h"
 
+#include "KvDeskDataFolder.h"
+
 #include <QDir>
 #include <QFileInfo>
 
@@ -8,8 +10,6 @@
 #include <iterator>
 
 namespace {
-
-constexpr const char *places[] = {"../../../share/statreport/examples", "../../../examples"};
 
 struct Example
 {
@@ -36,12 +36,8 @@ const Example *find(const QString &sessionPath)
 
 QString KvDeskExamples::folder(const QString &programFolder)
 {
-    for (const char *const place : places) {
-        const QDir folder(programFolder + QLatin1Char('/') + QLatin1String(place));
-        if (folder.exists(QStringLiteral("sessions")))
-            return QDir::cleanPath(folder.absolutePath());
-    }
-    return QString();
+    return KvDeskDataFolder::find(QStringLiteral("statreport/examples"), QStringLiteral("examples"),
+                                  QStringLiteral("sessions"), programFolder);
 }
 
 QStringList KvDeskExamples::sessions(const QString &examplesFolder)

@@ -12,6 +12,7 @@
 #include "KvDeskFieldKeys.h"
 #include "KvDeskFileCommands.h"
 #include "KvDeskGallery.h"
+#include "KvDeskGuideCommand.h"
 #include "KvDeskImageMenu.h"
 #include "KvDeskImageView.h"
 #include "KvDeskInlineEditor.h"
@@ -149,6 +150,7 @@ void KvDeskMainWindow::createPanels()
     m_valueTable->setEditor(m_objectEditor);
     new KvDeskExportCommand(m_actions->action(KvDeskActions::ExportTable), m_files, m_session, m_selection,
                             this);
+    new KvDeskGuideCommand(m_actions, KvDeskGuideCommand::guide(), this);
     m_gallery = new KvDeskGallery(m_actions, this);
     m_liveBar = new KvDeskLiveBar(m_actions, m_session->document(), this);
     m_statusLog = new KvDeskStatusLog(this);
@@ -245,7 +247,7 @@ void KvDeskMainWindow::createMenus()
     add(view, {A::ToggleTheme});
     QMenu *const help = menuBar()->addMenu(tr("&Help"));
     help->setToolTipsVisible(true);
-    add(help, {A::StartPage});
+    add(help, {A::Guide, A::StartPage});
     help->addSeparator();
     add(help, {A::About});
 }

@@ -20,6 +20,10 @@ private slots:
     void programsStart_data();
     void programsStart();
     void rendersAnExample();
+    void everythingThatTheGuideNamesIsThere();
+    void manualsAreReadable_data();
+    void manualsAreReadable();
+    void sessionHasItsType();
     void aHostIsBuiltWithTheSdk();
 
 private:
@@ -54,19 +58,27 @@ void InstallationTest::everythingIsThere_data()
     const QString libraries = QStringLiteral(STATREPORT_LIBDIR);
     for (const char *library : {"ztcommon", "ztimage", "ztkernel", "ztgui", "ztmeasuring"})
         QTest::newRow(library) << QStringLiteral("%1/lib%2.so.0").arg(libraries, QLatin1String(library));
-    for (const char *path :
-         {"bin/measuringdesk", "bin/statreport", "lib/statreport/bin/Templates/demo.rtp",
-          "lib/statreport/plugins/StatReportingPlugin.so", "share/statreport/examples/sessions/demo.json",
-          "share/statreport/examples/pictures/plate.png",
-          "share/applications/org.statreport.measuringdesk.desktop",
-          "share/metainfo/org.statreport.measuringdesk.metainfo.xml", "share/mime/packages/statreport.xml",
-          "share/icons/hicolor/scalable/apps/org.statreport.measuringdesk.svg",
-          "share/icons/hicolor/scalable/mimetypes/application-x-statreport-template.svg",
-          "share/man/man1/statreport.1", "share/man/man1/measuringdesk.1",
-          "share/bash-completion/completions/statreport", "share/zsh/site-functions/_statreport",
-          "share/fish/vendor_completions.d/statreport.fish",
-          "include/statreport-host/gui/ZtPluginInterface.h",
-          "share/statreport/examples/minimalhost/CMakeLists.txt"})
+    for (const char *path : {"bin/measuringdesk",
+                             "bin/statreport",
+                             "lib/statreport/bin/Templates/demo.rtp",
+                             "lib/statreport/plugins/StatReportingPlugin.so",
+                             "share/statreport/examples/sessions/demo.json",
+                             "share/statreport/examples/pictures/plate.png",
+                             "share/applications/org.statreport.measuringdesk.desktop",
+                             "share/metainfo/org.statreport.measuringdesk.metainfo.xml",
+                             "share/mime/packages/statreport.xml",
+                             "share/icons/hicolor/scalable/apps/org.statreport.measuringdesk.svg",
+                             "share/icons/hicolor/scalable/mimetypes/application-x-statreport-template.svg",
+                             "share/man/man1/statreport.1.gz",
+                             "share/man/man1/measuringdesk.1.gz",
+                             "share/doc/measuringdesk/changelog.gz",
+                             "share/doc/libstatreporthost0/changelog.gz",
+                             "share/doc/measuringdesk/user-guide.md",
+                             "share/bash-completion/completions/statreport",
+                             "share/zsh/site-functions/_statreport",
+                             "share/fish/vendor_completions.d/statreport.fish",
+                             "include/statreport-host/gui/ZtPluginInterface.h",
+                             "share/statreport/examples/minimalhost/CMakeLists.txt"})
         QTest::newRow(path) << QString::fromLatin1(path);
     QTest::newRow("package") << libraries +
                                     QStringLiteral("/cmake/StatReportHost/StatReportHostConfig.cmake");
@@ -126,6 +138,66 @@ void InstallationTest::rendersAnExample()
         environment());
     QVERIFY2(rendered.exitCode == 0, qPrintable(rendered.output));
     QCOMPARE(FinishedProcess::run(QStringLiteral("qpdf"), {QStringLiteral("--check"), pdf}).exitCode, 0);
+}
+
+void InstallationTest::everythingThatTheGuideNamesIsThere()
+{
+    const QString folder = installed(QStringLiteral("share/doc/measuringdesk/"));
+    QFile guide(folder + QStringLiteral("user-guide.md"));
+    QVERIFY(guide.open(QIODevice::ReadOnly));
+    QSet<QString> named;
+    QRegularExpressionMatchIterator links = QRegularExpression(QStringLiteral("\\]\\(([^)#:]+)\\)"))
+                                                .globalMatch(QString::fromUtf8(guide.readAll()));
+    while (links.hasNext())
+        named.insert(links.next().captured(1));
+    QVERIFY(named.contains(QStringLiteral("pictures/guide-desk.png")));
+    QVERIFY(named.contains(QStringLiteral("tables.md")));
+    for (const QString &file : qAsConst(named))
+        QVERIFY2(QFileInfo(folder + file).size() > 0, qPrintable(file));
+    // And no other pictures.
+    const int pictures = named.values().filter(QStringLiteral("pictures/")).size();
+    QCOMPARE(QDir(folder + QStringLiteral("pictures")).entryList(QDir::Files).size(), pictures);
+}
+
+void InstallationTest::manualsAreReadable_data()
+{
+    QTest::addColumn<QString>("program");
+    QTest::newRow("measuringdesk") << QStringLiteral("measuringdesk");
+    QTest::newRow("statreport") << QStringLiteral("statreport");
+}
+
+void InstallationTest::manualsAreReadable()
+{
+    QFETCH(QString, program);
+    const FinishedProcess shown =
+        FinishedProcess::run(QStringLiteral("mandoc"),
+                             {QStringLiteral("-T"), QStringLiteral("ascii"),
+                              installed(QStringLiteral("share/man/man1/%1.1.gz").arg(program))},
+                             environment());
+    QCOMPARE(shown.exitCode, 0);
+    QVERIFY2(shown.output.contains(QStringLiteral("SYNOPSIS")), qPrintable(shown.output));
+}
+
+// As file managers find it, without its name.
+void InstallationTest::sessionHasItsType()
+{
+    const QString data = temporaryPath(QStringLiteral("data"));
+    QVERIFY(QDir().mkpath(data + QStringLiteral("/mime/packages")));
+    QVERIFY(QFile::copy(installed(QStringLiteral("share/mime/packages/statreport.xml")),
+                        data + QStringLiteral("/mime/packages/statreport.xml")));
+    QCOMPARE(FinishedProcess::run(QStringLiteral("update-mime-database"), {data + QStringLiteral("/mime")})
+                 .exitCode,
+             0);
+    QProcessEnvironment found = environment();
+    found.insert(QStringLiteral("XDG_DATA_DIRS"), data + QStringLiteral(":/usr/share"));
+    found.insert(QStringLiteral("HOME"), temporaryPath(QStringLiteral("home")));
+    found.remove(QStringLiteral("XDG_DATA_HOME"));
+    const FinishedProcess type =
+        FinishedProcess::run(QStringLiteral(STATREPORT_MIME_TYPE_OF),
+                             {QStringLiteral("--mime-type-of"),
+                              installed(QStringLiteral("share/statreport/examples/sessions/demo.json"))},
+                             found);
+    QCOMPARE(type.output.trimmed(), QStringLiteral("application/x-measuringdesk-session"));
 }
 
 void InstallationTest::aHostIsBuiltWithTheSdk()

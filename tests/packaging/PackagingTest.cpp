@@ -3,7 +3,10 @@
 
 #include "FinishedProcess.h"
 
+#include <QDate>
 #include <QDir>
+#include <QImage>
+#include <QLocale>
 #include <QMimeDatabase>
 #include <QSet>
 #include <QXmlStreamReader>
@@ -61,19 +64,19 @@ QSet<QString> completions(const QStringList &words)
     return QSet<QString>(offered.begin(), offered.end());
 }
 
-/// The texts of an element by their languages; the one without a language under "".
-QMap<QString, QString> localized(const QString &path, const QString &element)
+/// How many elements of a name are in a language; those without one are in "". Empty ones do not count.
+int textCount(const QString &path, const char *element, const QString &language)
 {
-    QMap<QString, QString> texts;
+    int count = 0;
     QXmlStreamReader xml(read(path));
     while (!xml.atEnd()) {
-        if (xml.readNext() != QXmlStreamReader::StartElement || xml.name() != element)
+        if (xml.readNext() != QXmlStreamReader::StartElement || xml.name() != QLatin1String(element) ||
+            xml.attributes().value(QLatin1String("xml:lang")) != language)
             continue;
-        const QString language = xml.attributes().value(QLatin1String("xml:lang")).toString();
-        if (!texts.contains(language))
-            texts.insert(language, xml.readElementText());
+        if (!xml.readElementText().trimmed().isEmpty())
+            ++count;
     }
-    return texts;
+    return count;
 }
 
 /// What the MIME database with our types alone beside the system's makes of a file.
@@ -106,7 +109,13 @@ private slots:
     void completionKnowsEveryOption();
     void completionOffers_data();
     void completionOffers();
+    void completionOffersEveryOption_data();
+    void completionOffersEveryOption();
     void manualKnowsEveryOption();
+    void everyVersionIsThisOne_data();
+    void everyVersionIsThisOne();
+    void guideNamesThePictures();
+    void overridesHaveReasons();
 };
 
 void PackagingTest::toolsFindNothing_data()
@@ -128,9 +137,13 @@ void PackagingTest::toolsFindNothing_data()
                             QStringLiteral("warning"),
                             sourcePath(QStringLiteral("docs/man/%1.1").arg(QLatin1String(program)))});
     }
-    QTest::newRow("bash completion") << QStringLiteral("bash")
-                                     << QStringList({QStringLiteral("-n"),
-                                                     packagingFile("completion/statreport.bash")});
+    const QPair<const char *, const char *> shells[] = {
+        {"bash", "-n"}, {"zsh", "-n"}, {"fish", "--no-execute"}};
+    for (const auto &shell : shells)
+        QTest::newRow(qPrintable(QStringLiteral("%1 completion").arg(QLatin1String(shell.first))))
+            << QString::fromLatin1(shell.first)
+            << QStringList({QLatin1String(shell.second),
+                            packagingFile("completion/statreport.") + QLatin1String(shell.first)});
 }
 
 void PackagingTest::toolsFindNothing()
@@ -154,12 +167,14 @@ void PackagingTest::everyLanguageIsThere()
 {
     QFETCH(QString, code);
     const QString entry = read(packagingFile("linux/org.statreport.measuringdesk.desktop"));
-    for (const char *key : {"GenericName", "Comment"})
+    for (const char *key : {"GenericName", "Comment", "Keywords"})
         QVERIFY2(entry.contains(QStringLiteral("\n%1[%2]=").arg(QLatin1String(key), code)), key);
-    QVERIFY(
-        localized(packagingFile("linux/org.statreport.measuringdesk.metainfo.xml"), QStringLiteral("summary"))
-            .contains(code));
-    QVERIFY(localized(packagingFile("linux/statreport.xml"), QStringLiteral("comment")).contains(code));
+    const QString metainfo = packagingFile("linux/org.statreport.measuringdesk.metainfo.xml");
+    for (const char *element : {"summary", "p", "li"})
+        QCOMPARE(textCount(metainfo, element, code), textCount(metainfo, element, QString()));
+    QVERIFY(textCount(metainfo, "li", code) > 1);
+    const QString types = packagingFile("linux/statreport.xml");
+    QCOMPARE(textCount(types, "comment", code), 2);
 }
 
 void PackagingTest::mimeTypesAreRecognised_data()
@@ -252,6 +267,97 @@ void PackagingTest::completionOffers()
     QFETCH(QStringList, words);
     QFETCH(QStringList, offered);
     QCOMPARE(completions(words), QSet<QString>(offered.begin(), offered.end()));
+}
+
+void PackagingTest::completionOffersEveryOption_data()
+{
+    QTest::addColumn<QString>("shell");
+    QTest::addColumn<QStringList>("arguments");
+    // What the shell itself makes of the line; -i and --no-config keep the user's own settings out.
+    QTest::newRow("bash") << QStringLiteral("bash")
+                          << QStringList(
+                                 {QStringLiteral("--norc"), QStringLiteral("-c"),
+                                  QStringLiteral("compopt() { :; }; source '%1'; COMP_WORDS=(statreport --); "
+                                                 "COMP_CWORD=1; $(complete -p statreport | awk '{ print "
+                                                 "$(NF - 1) }'); printf '%s\\n' \"${COMPREPLY[@]}\"")
+                                      .arg(packagingFile("completion/statreport.bash"))});
+    QTest::newRow("fish") << QStringLiteral("fish")
+                          << QStringList({QStringLiteral("--no-config"), QStringLiteral("-c"),
+                                          QStringLiteral("source '%1'; complete -C 'statreport --'")
+                                              .arg(packagingFile("completion/statreport.fish"))});
+}
+
+void PackagingTest::completionOffersEveryOption()
+{
+    QFETCH(QString, shell);
+    QFETCH(QStringList, arguments);
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    environment.insert(QStringLiteral("HOME"), temporaryPath(QStringLiteral("home")));
+    const FinishedProcess finished = FinishedProcess::run(shell, arguments, environment);
+    QSet<QString> offered;
+    for (const QString &line : finished.output.split(QLatin1Char('\n'))) {
+        const QString word = line.section(QLatin1Char('\t'), 0, 0).section(QLatin1Char('='), 0, 0);
+        if (word.startsWith(QLatin1String("--")))
+            offered.insert(word);
+    }
+    QVERIFY2(offered == optionsOfHelp(QString()), qPrintable(finished.output));
+}
+
+void PackagingTest::everyVersionIsThisOne_data()
+{
+    QTest::addColumn<QString>("file");
+    QTest::addColumn<QString>("pattern");
+    QTest::newRow("changes") << sourcePath(QStringLiteral("CHANGELOG.md"))
+                             << QStringLiteral("^## ([^ ,]+), ([0-9-]+)$");
+    QTest::newRow("metainfo") << packagingFile("linux/org.statreport.measuringdesk.metainfo.xml")
+                              << QStringLiteral("<release version=\"([^\"]+)\" date=\"([^\"]+)\"");
+    QTest::newRow("changes of the packages")
+        << packagingFile("linux/changelog")
+        << QStringLiteral("^statreport \\(([^)]+)\\)[^>]*> +\\w+, (.+) \\d+:");
+}
+
+// The newest one, which comes first, in each; and all were made on the same day.
+void PackagingTest::everyVersionIsThisOne()
+{
+    QFETCH(QString, file);
+    QFETCH(QString, pattern);
+    const QRegularExpressionMatch found =
+        QRegularExpression(pattern, QRegularExpression::MultilineOption).match(read(file));
+    QVERIFY2(found.hasMatch(), qPrintable(file));
+    QCOMPARE(found.captured(1), QStringLiteral(STATREPORT_VERSION));
+    QDate date = QDate::fromString(found.captured(2), Qt::ISODate);
+    if (!date.isValid())
+        date = QLocale::c().toDate(found.captured(2), QStringLiteral("dd MMM yyyy"));
+    QVERIFY2(date.isValid(), qPrintable(found.captured(2)));
+    static const QDate first = date;
+    QCOMPARE(date, first);
+}
+
+void PackagingTest::guideNamesThePictures()
+{
+    const QString guide = read(sourcePath(QStringLiteral("docs/user-guide.md")));
+    const QDir pictures(sourcePath(QStringLiteral("docs/pictures")));
+    QSet<QString> named;
+    QRegularExpressionMatchIterator it =
+        QRegularExpression(QStringLiteral("!\\[[^]]+\\]\\(pictures/([^)]+)\\)")).globalMatch(guide);
+    while (it.hasNext())
+        named.insert(it.next().captured(1));
+    for (const QString &name : qAsConst(named))
+        QVERIFY2(!QImage(pictures.filePath(name)).isNull(), qPrintable(name));
+    const QStringList made = pictures.entryList({QStringLiteral("guide-*.png")});
+    QCOMPARE(named, QSet<QString>(made.begin(), made.end()));
+}
+
+// Only where a reason is given is a finding of the packages' checker left alone.
+void PackagingTest::overridesHaveReasons()
+{
+    const QStringList lines = read(packagingFile("linux/libstatreporthost.lintian-overrides"))
+                                  .split(QLatin1Char('\n'), Qt::SkipEmptyParts);
+    QVERIFY(lines.size() > 1);
+    for (int i = 1; i < lines.size(); ++i) {
+        if (!lines.at(i).startsWith(QLatin1Char('#')))
+            QVERIFY2(lines.at(i - 1).startsWith(QLatin1Char('#')), qPrintable(lines.at(i)));
+    }
 }
 
 void PackagingTest::manualKnowsEveryOption()

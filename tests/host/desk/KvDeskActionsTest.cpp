@@ -85,6 +85,7 @@ void KvDeskActionsTest::commands_data()
     row(A::ShowGallery, "&Gallery", "Show or hide the gallery (F5)", true, true);
     row(A::ToggleTheme, "&Dark or light theme", "Change between the dark and the light theme (F8)");
     row(A::Settings, "Settin&gs...", "Settings (Ctrl+,)");
+    row(A::Guide, "&User guide", "Read the user guide (F1)", false);
     row(A::StartPage, "&Start page", "Show the first steps, the examples and the recent sessions", false);
     row(A::About, "&About Measuring Desk", "About Measuring Desk");
 }
