@@ -18,11 +18,15 @@ bool isAlike(const KvDeskSelectionStatistics::Group &a, const KvDeskSelectionSta
     return a.kind == b.kind && (a.kind != ZtGsManipulator::NoKind || a.unit == b.unit);
 }
 
-// The unit in which a value is shown.
-ZtUnit unitOf(double value, const KvDeskSelectionStatistics::Group &group)
+// The unit in which all figures of a selection are shown, so that they can be compared: the one in which the
+// mean reads best, or the spread where numbers of both signs have next to no mean.
+ZtUnit unitOf(const KvDeskRunningStatistics &numbers, int kind)
 {
-    const ZtUnit chosen = ZtUnitSettings::getInstance()->chosenUnit(group.kind);
-    return chosen.isEmpty() ? ZtMeasureFormat::readableUnit(value, group.kind) : chosen;
+    const ZtUnit chosen = ZtUnitSettings::getInstance()->chosenUnit(kind);
+    if (!chosen.isEmpty())
+        return chosen;
+    const double spread = numbers.count() > 1 ? numbers.standardDeviation() : 0.0;
+    return ZtMeasureFormat::readableUnit(qMax(std::abs(numbers.mean()), spread), kind);
 }
 
 QString unitTextOf(const KvDeskSelectionStatistics::Group &group)
@@ -34,15 +38,14 @@ QString unitTextOf(const KvDeskSelectionStatistics::Group &group)
     return zero.mid(zero.indexOf(QLatin1Char(' ')) + 1);
 }
 
-QString inUnit(double value, const KvDeskSelectionStatistics::Group &group, int digits)
+QString inUnit(double value, const KvDeskSelectionStatistics::Group &group, const ZtUnit &unit, int digits)
 {
     const auto number = [digits](double shown) {
-        return digits > 0 ? ZtMeasureFormat::significant(shown, digits) : ZtMeasureFormat::readable(shown);
+        return digits > 0 ? ZtMeasureFormat::significant(shown, digits) : ZtMeasureFormat::shortened(shown);
     };
     // A mean of counts may lie between two of them, a count does not.
     if (group.kind == ZtGsManipulator::Count && value == std::floor(value))
         return ZtMeasureFormat::drawnText(value, group.kind);
-    const ZtUnit unit = unitOf(value, group);
     return unit.isEmpty() ? ZtMeasureFormat::withUnit(number(value), unitTextOf(group))
                           : ZtMeasureFormat::withUnit(number(unit.fromBase(value)), unit.text());
 }
@@ -69,54 +72,52 @@ bool KvDeskSelectionStatistics::isMixed() const
                        [this](const Group &group) { return !isAlike(group, m_groups.first()); });
 }
 
-bool KvDeskSelectionStatistics::isSummedUp(const Group &group) const
-{
-    const Group &first = m_groups.first();
-    return isAlike(group, first) && (!isMixed() || group.valueName == first.valueName);
-}
-
 KvDeskRunningStatistics KvDeskSelectionStatistics::numbers() const
 {
     KvDeskRunningStatistics numbers;
-    for (const Group &group : m_groups) {
-        if (isSummedUp(group))
-            numbers.add(group.numbers);
-    }
+    if (isMixed())
+        return numbers;
+    for (const Group &group : m_groups)
+        numbers.add(group.numbers);
     return numbers;
 }
 
-QString KvDeskSelectionStatistics::format(double value) const
+QString KvDeskSelectionStatistics::countText() const
 {
-    return inUnit(value, m_groups.first(), ZtUnitSettings::getInstance()->significantDigits());
-}
-
-QString KvDeskSelectionStatistics::precise(double value) const
-{
-    return inUnit(value, m_groups.first(), preciseDigits);
+    return tr("Selected values: %1").arg(count());
 }
 
 QString KvDeskSelectionStatistics::text() const
 {
+    if (isMixed())
+        return countText();
     const KvDeskRunningStatistics all = numbers();
-    if (m_groups.isEmpty() || all.count() == 0)
+    if (all.count() == 0)
         return QString();
-    const QString name = isMixed() ? m_groups.first().valueName + QStringLiteral(": ") : QString();
+    const ZtUnit unit = unitOf(all, m_groups.first().kind);
+    const auto format = [this, &unit](double value) {
+        return inUnit(value, m_groups.first(), unit, ZtUnitSettings::getInstance()->significantDigits());
+    };
     if (all.count() == 1)
-        return name + format(all.mean());
+        return format(all.mean());
     //: number of values, their mean, standard deviation, smallest and largest one
-    return name + tr("n = %1, mean %2, SD %3, min %4, max %5")
-                      .arg(QString::number(all.count()), format(all.mean()), format(all.standardDeviation()),
-                           format(all.minimum()), format(all.maximum()));
+    return tr("n = %1, mean %2, SD %3, min %4, max %5")
+        .arg(QString::number(all.count()), format(all.mean()), format(all.standardDeviation()),
+             format(all.minimum()), format(all.maximum()));
 }
 
 QString KvDeskSelectionStatistics::details() const
 {
-    const KvDeskRunningStatistics all = numbers();
-    if (m_groups.isEmpty() || all.count() == 0)
-        return QString();
-    QStringList lines{tr("Selected values: %1").arg(count())};
     if (isMixed())
-        lines.append(tr("\"%1\" among them: %2").arg(m_groups.first().valueName).arg(all.count()));
+        return countText();
+    const KvDeskRunningStatistics all = numbers();
+    if (all.count() == 0)
+        return QString();
+    const ZtUnit unit = unitOf(all, m_groups.first().kind);
+    const auto precise = [this, &unit](double value) {
+        return inUnit(value, m_groups.first(), unit, preciseDigits);
+    };
+    QStringList lines{countText()};
     lines.append(tr("Mean: %1").arg(precise(all.mean())));
     if (all.count() > 1)
         lines.append(tr("Standard deviation: %1").arg(precise(all.standardDeviation())));

@@ -10,8 +10,8 @@
 /**
  * What the selected values have in common, and how that reads in the status bar.
  *
- * Values that all measure the same are summed up together. Of a mixture, those are that have the name of the
- * first one; then the text says which.
+ * Values that all measure the same are summed up together, all figures in one unit. Of a mixture only the
+ * number of values is told.
  */
 class KvDeskSelectionStatistics
 {
@@ -31,7 +31,7 @@ public:
 
     int count() const; ///< of all values
     bool isMixed() const;
-    /** The values that are summed up. */
+    /** The values that are summed up: all of them, or none of a mixture. */
     KvDeskRunningStatistics numbers() const;
 
     /** One line; empty without values. */
@@ -40,9 +40,7 @@ public:
     QString details() const;
 
 private:
-    bool isSummedUp(const Group &group) const;
-    QString format(double value) const;
-    QString precise(double value) const;
+    QString countText() const;
 
     QVector<Group> m_groups;
 };
