@@ -3,10 +3,15 @@
 
 #include "KvDeskTableView.h"
 #include "KvDeskValueTableModel.h"
+#include "TableFiles.h"
 #include "kernel/ZtKernelData.h"
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtDrawnObjectData.h"
 #include "measuring/ZtDrawnType.h"
+#include "measuring/ZtFault.h"
+#include "measuring/ZtImportedTable.h"
+#include "measuring/ZtReadyObjects.h"
+#include "measuring/ZtTableImport.h"
 
 #include <QCoreApplication>
 #include <QLineEdit>
@@ -28,11 +33,20 @@ QPolygonF shape(int i)
 
 } // namespace
 
-ValueTableCases::ValueTableCases(int objects)
+ValueTableCases::ValueTableCases()
     : m_session(&m_document)
     , m_editor(&m_session, &m_selection)
-    , m_lines(objects / 2)
 {
+    m_table.setEditor(&m_editor);
+    m_table.resize(416, 900);
+    m_table.show();
+    show();
+}
+
+ValueTableCases::ValueTableCases(int objects)
+    : ValueTableCases()
+{
+    m_lines = objects / 2;
     {
         const ZtKernelData::SignalBlocker blocker;
         for (int i = 0; i < m_lines; ++i)
@@ -43,11 +57,41 @@ ValueTableCases::ValueTableCases(int objects)
                                 i + 1);
     }
     m_document.setCalibration(ZtCalibration(0.5));
-    m_table.setEditor(&m_editor);
-    m_table.resize(416, 900);
-    m_table.show();
     reset();
     show();
+}
+
+void ValueTableCases::import(int objects)
+{
+    ZtImportedTable table;
+    ZtFault fault;
+    if (!ZtTableImport::parse(TableFiles::wideTable(objects), QString(), ZtTableImportOptions(), &table,
+                              &fault))
+        qFatal("The table is wrong");
+    std::vector<ZtReadyObjects> ready = ZtReadyObjects::ofTable(table);
+    m_document.addTable(&ready);
+}
+
+void ValueTableCases::follow()
+{
+    m_table.model()->flush();
+}
+
+void ValueTableCases::clear()
+{
+    m_document.clear();
+    follow();
+    show();
+}
+
+void ValueTableCases::removeImported()
+{
+    kernel()->removeObject(ZtTableImport::firstTypeId, ++m_removed);
+}
+
+void ValueTableCases::takeSession()
+{
+    m_document.toSession();
 }
 
 void ValueTableCases::reset()

@@ -13,8 +13,20 @@ class ValueTableCases
 public:
     /** Half of the objects are lines with one value, the others circles with two. */
     explicit ValueTableCases(int objects);
+    /** Nothing yet. */
+    ValueTableCases();
 
     int rowCount() const;
+    /** Hands an imported table of so many objects, with three values each, to the document; the table of
+     * values does not show it yet. */
+    void import(int objects);
+    /** Shows what came or went; the time until then is what somebody waits for. */
+    void follow();
+    void clear();
+    /** Removes one imported object. */
+    void removeImported();
+    /** What autosaving takes of the document. */
+    void takeSession();
     /** Makes one line another one, and shows that. */
     void changeOne();
     void addOne();
@@ -31,6 +43,7 @@ public:
     void show();
 
 private:
+    void create();
     int nextLine();
 
     ZtMeasuringDocument m_document;
@@ -38,7 +51,8 @@ private:
     KvDeskSelection m_selection;
     KvDeskObjectEditor m_editor;
     KvDeskValueTable m_table;
-    int m_lines;
+    int m_lines = 0;
     int m_step = 0;
     int m_added = 0;
+    int m_removed = 0;
 };

@@ -20,6 +20,7 @@
 namespace {
 
 constexpr int manyObjects = 100000;
+constexpr int millionRows = 333334; ///< objects of an imported table, with three values each
 
 // A frame of a display that shows 60 of them in a second.
 constexpr double frameMs = 16.0;
@@ -112,6 +113,55 @@ void readEverything(benchmark::State &state)
     measure(state, [&cases] { cases.reset(); });
 }
 
+void showMillion(benchmark::State &state)
+{
+    ValueTableCases cases;
+    double worst = 0.0;
+    for (auto _ : state) {
+        cases.clear();
+        cases.import(millionRows);
+        const double time = ProcessorTime::seconds([&cases] { cases.follow(); });
+        state.SetIterationTime(time);
+        worst = std::max(worst, time);
+    }
+    state.counters["worst_ms"] = worst * 1e3;
+    state.counters["rows"] = cases.rowCount();
+}
+
+void sortMillion(benchmark::State &state)
+{
+    ValueTableCases cases;
+    cases.import(millionRows);
+    cases.follow();
+    const int column = static_cast<int>(state.range(0));
+    for (auto _ : state) {
+        cases.sort(-1);
+        state.SetIterationTime(ProcessorTime::seconds([&] { cases.sort(column); }));
+    }
+}
+
+void filterMillion(benchmark::State &state)
+{
+    ValueTableCases cases;
+    cases.import(millionRows);
+    cases.follow();
+    for (auto _ : state) {
+        cases.filter(QString());
+        state.SetIterationTime(ProcessorTime::seconds([&] { cases.filter(QStringLiteral("grain 77")); }));
+    }
+}
+
+void takeSessionAfterRemoval(benchmark::State &state)
+{
+    ValueTableCases cases;
+    cases.import(millionRows);
+    cases.takeSession();
+    for (auto _ : state) {
+        cases.removeImported();
+        state.SetIterationTime(ProcessorTime::seconds([&cases] { cases.takeSession(); }));
+    }
+}
+
 void exportTable(benchmark::State &state)
 {
     const ValueTableCases cases(manyObjects);
@@ -125,14 +175,16 @@ void exportTable(benchmark::State &state)
 }
 
 /// Runs the work and the least that reading the same file takes in turn; reports the best of each.
-template <class Work>
-void compareWithSplitting(benchmark::State &state, const QString &path, char separator, Work work)
+template <class Work, class TidyUp>
+void compareWithSplitting(benchmark::State &state, const QString &path, char separator, Work work,
+                          TidyUp tidyUp)
 {
     double best = 1e9;
     double splitBest = 1e9;
     double textsBest = 1e9;
     for (auto _ : state) {
         const double time = ProcessorTime::seconds(work);
+        tidyUp();
         state.SetIterationTime(time);
         best = std::min(best, time);
         splitBest = std::min(splitBest, ProcessorTime::seconds([&] {
@@ -148,6 +200,12 @@ void compareWithSplitting(benchmark::State &state, const QString &path, char sep
     state.counters["ratio"] = best / splitBest;
     state.counters["texts_ms"] = textsBest * 1e3;
     state.counters["texts_ratio"] = best / textsBest;
+}
+
+template <class Work>
+void compareWithSplitting(benchmark::State &state, const QString &path, char separator, Work work)
+{
+    compareWithSplitting(state, path, separator, work, [] {});
 }
 
 void readTable(benchmark::State &state, const QByteArray &bytes)
@@ -177,12 +235,14 @@ void importWide(benchmark::State &state)
     const QByteArray bytes = TableFiles::wideTable(static_cast<int>(state.range(0)));
     const QString path = TableFiles::write(QStringLiteral("table.csv"), bytes);
     ZtMeasuringDocument document;
-    compareWithSplitting(state, path, ',', [&] {
-        ZtFault fault;
-        if (!document.importTable(path, ZtTableImportOptions(), &fault))
-            qFatal("The table is wrong");
-        document.clear();
-    });
+    compareWithSplitting(
+        state, path, ',',
+        [&] {
+            ZtFault fault;
+            if (!document.importTable(path, ZtTableImportOptions(), &fault))
+                qFatal("The table is wrong");
+        },
+        [&document] { document.clear(); });
 }
 
 QString sessionFile(int rows)
@@ -237,6 +297,15 @@ BENCHMARK(scroll)->UseManualTime()->Unit(benchmark::kMillisecond);
 BENCHMARK(sort)->ArgName("column")->DenseRange(0, 3)->UseManualTime()->Unit(benchmark::kMillisecond);
 BENCHMARK(filter)->UseManualTime()->Unit(benchmark::kMillisecond);
 BENCHMARK(readEverything)->UseManualTime()->Unit(benchmark::kMillisecond);
+BENCHMARK(showMillion)->UseManualTime()->Iterations(5)->Unit(benchmark::kMillisecond);
+BENCHMARK(sortMillion)
+    ->ArgName("column")
+    ->DenseRange(0, 3)
+    ->UseManualTime()
+    ->Iterations(2)
+    ->Unit(benchmark::kMillisecond);
+BENCHMARK(filterMillion)->UseManualTime()->Iterations(3)->Unit(benchmark::kMillisecond);
+BENCHMARK(takeSessionAfterRemoval)->UseManualTime()->Iterations(5)->Unit(benchmark::kMillisecond);
 BENCHMARK(exportTable)->ArgName("layout")->DenseRange(0, 2)->UseManualTime()->Unit(benchmark::kMillisecond);
 BENCHMARK(readWide)
     ->RangeMultiplier(10)

@@ -283,7 +283,9 @@ void KvDeskCalibrationDialog::showHistory()
     m_historyView->horizontalHeader()->setVisible(!isEmpty);
     if (!isEmpty && !m_historyView->selectionModel()->hasSelection())
         m_historyView->selectRow(0);
-    m_historyView->resizeColumnsToContents();
+    // The last one takes what is left; all at once would take that from it.
+    for (int column = 0; column + 1 < m_history->columnCount(); ++column)
+        m_historyView->resizeColumnToContents(column);
     slotSelectionChanged();
 }
 

@@ -9,12 +9,14 @@
 #include "gui/acss.h"
 #include "kernel/ZtGsManipulator.h"
 #include "kernel/ZtKernelData.h"
+#include "measuring/ZtDrawnObjectPainter.h"
 #include "measuring/ZtMeasureFormat.h"
 
 #include <QComboBox>
 #include <QEvent>
 #include <QHBoxLayout>
 #include <QLabel>
+#include <QPainter>
 #include <QToolButton>
 #include <QVariant>
 
@@ -25,6 +27,20 @@ constexpr int classesWidth = 240;
 constexpr int leastClassesWidth = 96;
 constexpr QSize iconSize(24, 24);
 constexpr QSize buttonSize(32, 28);
+
+// As a marker is on the image: its colour on a dark ground.
+QIcon swatch(const QColor &color, qreal ratio)
+{
+    constexpr int side = 16;
+    constexpr int border = 2;
+    QPixmap pixmap(QSize(side, side) * ratio);
+    pixmap.setDevicePixelRatio(ratio);
+    QColor dark = ZtDrawnObjectPainter::haloColor();
+    dark.setAlpha(255);
+    pixmap.fill(dark);
+    QPainter(&pixmap).fillRect(border, border, side - 2 * border, side - 2 * border, color);
+    return QIcon(pixmap);
+}
 
 } // namespace
 
@@ -112,8 +128,21 @@ void KvDeskCounterBar::slotUpdate()
         m_classes->removeItem(m_classes->count() - 1);
     while (m_classes->count() < texts.size())
         m_classes->addItem(texts.at(m_classes->count()));
+    showColors();
     m_classes->setCurrentIndex(qMax(0, m_counters.indexOf(m_toolBox->counterTool()->counter())));
     place();
+}
+
+void KvDeskCounterBar::showColors()
+{
+    if (m_swatches.isEmpty()) {
+        for (const QColor &color : ZtDrawnObjectPainter::counterColors())
+            m_swatches.append(swatch(color, devicePixelRatioF()));
+    }
+    for (int i = 0; i < m_classes->count(); ++i) {
+        const int id = i < m_counters.size() ? m_counters.at(i).id : 1;
+        m_classes->setItemIcon(i, m_swatches.at(ZtDrawnObjectPainter::counterColorIndex(id)));
+    }
 }
 
 void KvDeskCounterBar::slotChosen(int aIndex)

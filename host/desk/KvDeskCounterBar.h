@@ -5,6 +5,7 @@
 #include "KvDeskObjectId.h"
 
 #include <QFrame>
+#include <QIcon>
 #include <QVector>
 
 class KvDeskImageView;
@@ -36,6 +37,7 @@ private slots:
 private:
     void createWidgets();
     void place();
+    void showColors();
     QString classText(const KvDeskObjectId &counter) const;
 
     KvDeskToolBox *m_toolBox;
@@ -43,5 +45,6 @@ private:
     KvDeskObjectChanges m_changes;
     QVector<KvDeskObjectId> m_counters; ///< in the order of the list
     QComboBox *m_classes = nullptr;
+    QVector<QIcon> m_swatches; ///< in the order of the counters' colours
     QToolButton *m_newClass = nullptr;
 };

@@ -52,9 +52,11 @@ const ZtDrawnObjectData *dataOf(const KvDeskObjectId &object)
 void KvDeskRoughObjects::restart(const QTransform &toView)
 {
     m_toView = toView;
-    m_level.resize(0);
-    m_steep.resize(0);
-    m_long.resize(0);
+    for (Lines &lines : m_lines) {
+        lines.level.resize(0);
+        lines.steep.resize(0);
+        lines.distant.resize(0);
+    }
 }
 
 // There is no turning.
@@ -73,9 +75,13 @@ void KvDeskRoughObjects::add(const KvDeskObjectId &object, const QRectF &rect)
 {
     const QRectF place = onView(rect);
     const double size = qMax(place.width(), place.height());
+    const bool isCounter = object.type == ZtDrawnType::Counter;
+    m_color = isCounter ? static_cast<std::size_t>(ZtDrawnObjectPainter::counterColorIndex(object.id)) : 0;
+    if (m_color >= m_lines.size())
+        m_lines.resize(m_color + 1);
     if (object.type == ZtDrawnType::TextNote)
         return; // its label is all there is to see
-    if (size < speckSize && object.type != ZtDrawnType::Counter)
+    if (size < speckSize && !isCounter)
         addSpeck(place.center());
     else if (object.type == ZtDrawnType::Rectangle)
         addRectangle(place);
@@ -99,12 +105,13 @@ void KvDeskRoughObjects::addLine(const QPointF &from, const QPointF &to)
 {
     const double furthest =
         qMax(qMax(std::abs(from.x()), std::abs(from.y())), qMax(std::abs(to.x()), std::abs(to.y())));
+    Lines &lines = m_lines[m_color];
     if (furthest > farAway)
-        m_long.append(QLineF(from, to));
+        lines.distant.append(QLineF(from, to));
     else if (std::abs(to.y() - from.y()) > std::abs(to.x() - from.x()))
-        m_steep.append(QLine(from.toPoint(), to.toPoint()));
+        lines.steep.append(QLine(from.toPoint(), to.toPoint()));
     else
-        m_level.append(QLine(from.toPoint(), to.toPoint()));
+        lines.level.append(QLine(from.toPoint(), to.toPoint()));
 }
 
 void KvDeskRoughObjects::addSpeck(const QPointF &place)
@@ -156,34 +163,60 @@ void KvDeskRoughObjects::draw(QPainter *painter) const
 {
     QColor dark = ZtDrawnObjectPainter::haloColor();
     dark.setAlpha(255); // mixing colours takes longer
-    draw(painter, ZtDrawnObjectPainter::lineColor(), dark);
+    painter->save();
+    drawHalos(painter, dark);
+    for (std::size_t i = 0; i < m_lines.size(); ++i) {
+        painter->setPen(QPen(ZtDrawnObjectPainter::counterColors().at(static_cast<int>(i)), 0.0));
+        drawLines(painter, m_lines[i]);
+    }
+    painter->restore();
 }
 
 void KvDeskRoughObjects::draw(QPainter *painter, const QColor &bright, const QColor &dark) const
 {
     painter->save();
+    drawHalos(painter, dark);
+    painter->setPen(QPen(bright, 0.0));
+    for (const Lines &lines : m_lines)
+        drawLines(painter, lines);
+    painter->restore();
+}
+
+void KvDeskRoughObjects::drawHalos(QPainter *painter, const QColor &dark) const
+{
     painter->setRenderHint(QPainter::Antialiasing, false);
     // Cosmetic pens of one pixel: no other lines are drawn without being turned into areas first.
     painter->setPen(QPen(dark, 0.0));
-    // Dark lines lie below level ones and at the right of steep ones, where the bright ones do not hide them.
-    painter->setWorldTransform(QTransform::fromTranslate(0.0, 1.0));
-    painter->drawLines(m_level);
-    painter->drawLines(m_long);
-    painter->setWorldTransform(QTransform::fromTranslate(1.0, 0.0));
-    painter->drawLines(m_steep);
-    painter->drawLines(m_long);
+    for (const Lines &lines : m_lines)
+        drawHalo(painter, lines);
     painter->setWorldTransform(QTransform());
-    painter->setPen(QPen(bright, 0.0));
-    painter->drawLines(m_level);
-    painter->drawLines(m_steep);
-    painter->drawLines(m_long);
-    painter->restore();
+}
+
+// Dark lines lie below level ones and at the right of steep ones, where the bright ones do not hide them.
+void KvDeskRoughObjects::drawHalo(QPainter *painter, const Lines &lines)
+{
+    painter->setWorldTransform(QTransform::fromTranslate(0.0, 1.0));
+    painter->drawLines(lines.level);
+    painter->drawLines(lines.distant);
+    painter->setWorldTransform(QTransform::fromTranslate(1.0, 0.0));
+    painter->drawLines(lines.steep);
+    painter->drawLines(lines.distant);
+}
+
+void KvDeskRoughObjects::drawLines(QPainter *painter, const Lines &lines)
+{
+    painter->drawLines(lines.level);
+    painter->drawLines(lines.steep);
+    painter->drawLines(lines.distant);
 }
 
 QVector<QLineF> KvDeskRoughObjects::lines() const
 {
-    QVector<QLineF> result = m_long;
-    for (const QLine &line : m_level + m_steep)
-        result.append(QLineF(line));
+    QVector<QLineF> result;
+    for (const Lines &lines : m_lines) {
+        result += lines.distant;
+        for (const QLine &line : lines.level + lines.steep)
+            result.append(QLineF(line));
+    }
     return result;
 }

@@ -7,6 +7,8 @@
 #include <QTransform>
 #include <QVector>
 
+#include <vector>
+
 class QColor;
 class QPainter;
 class QPainterPath;
@@ -16,8 +18,8 @@ struct ZtDrawnType;
 
 /**
  * Draws many objects quickly: thin lines without smooth edges, all of a colour at once, and curves as
- * polygons with no more corners than are seen. All objects have the same two colours, so their order does not
- * matter.
+ * polygons with no more corners than are seen. All objects but counters have the same two colours, so their
+ * order does not matter.
  *
  * For the screen only; pictures of reports show objects in full, however many there are.
  */
@@ -27,6 +29,7 @@ public:
     /** \a toView from the scene to the view, without turning. */
     explicit KvDeskRoughObjects(const QTransform &toView = QTransform())
         : m_toView(toView)
+        , m_lines(1)
     {}
 
     /** Forgets all objects but keeps their memory: asking for it again at every step takes longer. */
@@ -55,8 +58,18 @@ private:
     void addPath(const QPainterPath &path);
     void addMarkers(const QPolygonF &points);
 
+    /** Of one colour. */
+    struct Lines
+    {
+        QVector<QLine> level; ///< lines in whole pixels, nearer to level than to upright
+        QVector<QLine> steep;
+        QVector<QLineF> distant; ///< lines that end far outside of the view
+    };
+    static void drawHalo(QPainter *painter, const Lines &lines);
+    static void drawLines(QPainter *painter, const Lines &lines);
+    void drawHalos(QPainter *painter, const QColor &dark) const;
+
     QTransform m_toView;
-    QVector<QLine> m_level; ///< lines in whole pixels, nearer to level than to upright
-    QVector<QLine> m_steep;
-    QVector<QLineF> m_long; ///< lines that end far outside of the view
+    std::vector<Lines> m_lines; ///< by the place of their colour among those of counters
+    std::size_t m_color = 0;    ///< of the object that is being added
 };

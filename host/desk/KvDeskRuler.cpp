@@ -13,7 +13,7 @@
 
 namespace {
 
-constexpr double labelDistance = 64.0; ///< at least so many pixels lie between two labels
+constexpr double leastLabelDistance = 64.0; ///< at least so many pixels lie between two labels
 constexpr double labelledLength = 12.0;
 constexpr double plainLength = 5.0;
 constexpr int fontSize = 10;
@@ -91,7 +91,7 @@ QVector<KvDeskRuler::Tick> KvDeskRuler::ticks(double origin, double pixelsPerUni
     QVector<Tick> result;
     if (!(pixelsPerUnit > 0.0) || !std::isfinite(origin))
         return result;
-    const double labelled = roundStep(labelDistance / pixelsPerUnit);
+    const double labelled = roundStep(leastLabelDistance / pixelsPerUnit);
     // Ten marks between 1 and 2 or 5 and 10, four between 2 and 4.
     const bool isTwo =
         std::abs(labelled / std::pow(10.0, std::floor(std::log10(labelled) + 1e-9)) - 2.0) < 0.1;
@@ -104,6 +104,20 @@ QVector<KvDeskRuler::Tick> KvDeskRuler::ticks(double origin, double pixelsPerUni
     for (double i = first; i <= last; i += 1.0)
         result.append({origin + i * step * pixelsPerUnit, i * step, std::fmod(i, parts) == 0.0});
     return result;
+}
+
+std::optional<double> KvDeskRuler::textStart(double textWidth, double room, double distance)
+{
+    if (textRoom + textWidth <= room)
+        return textRoom;
+    // The text of the label before reads towards it.
+    const bool hasRoomBefore = 2.0 * (textWidth + textRoom) + textRoom <= distance;
+    return hasRoomBefore ? std::optional<double>(-textRoom - textWidth) : std::nullopt;
+}
+
+double KvDeskRuler::labelDistance() const
+{
+    return roundStep(leastLabelDistance / m_pixelsPerUnit) * m_pixelsPerUnit;
 }
 
 void KvDeskRuler::paintEvent(QPaintEvent *event)
@@ -136,7 +150,11 @@ void KvDeskRuler::drawTick(QPainter *painter, const Tick &tick) const
     painter->translate(isLevel ? QPointF(tick.position, 0.0) : QPointF(0.0, tick.position));
     if (!isLevel)
         painter->rotate(-90.0);
-    painter->drawText(QPointF(textRoom, fontSize + 1), numberText(tick.value));
+    const QString text = numberText(tick.value);
+    // Upright texts read from the bottom to the top.
+    const double room = isLevel ? length() - tick.position : tick.position;
+    if (const auto start = textStart(painter->fontMetrics().horizontalAdvance(text), room, labelDistance()))
+        painter->drawText(QPointF(*start, fontSize + 1), text);
     painter->restore();
 }
 

@@ -42,11 +42,21 @@ public:
      */
     static QVector<Tick> ticks(double origin, double pixelsPerUnit, double length);
 
+    /**
+     * Where the text of a label begins, from its mark in the direction of reading: behind the mark, or before
+     * it where it would be cut off; nowhere when it has no room there either.
+     * \param textWidth in pixels
+     * \param room      from the mark to the end of the ruler in that direction
+     * \param distance  of two labels
+     */
+    static std::optional<double> textStart(double textWidth, double room, double distance);
+
 protected:
     void paintEvent(QPaintEvent *event) override;
 
 private:
     double length() const;
+    double labelDistance() const;
     void drawTick(QPainter *painter, const Tick &tick) const;
     void drawPointer(QPainter *painter) const;
 

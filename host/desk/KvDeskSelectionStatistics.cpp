@@ -19,11 +19,15 @@ bool isAlike(const KvDeskSelectionStatistics::Group &a, const KvDeskSelectionSta
     return a.kind == b.kind && (a.kind != ZtGsManipulator::NoKind || a.unit == b.unit);
 }
 
-// The unit in which a value is shown.
-ZtUnit unitOf(double value, const KvDeskSelectionStatistics::Group &group)
+// The unit in which all figures of a selection are shown, so that they can be compared: the one in which the
+// mean reads best, or the spread where numbers of both signs have next to no mean.
+ZtUnit unitOf(const KvDeskRunningStatistics &numbers, int kind)
 {
-    const ZtUnit chosen = ZtUnitSettings::getInstance()->chosenUnit(group.kind);
-    return chosen.isEmpty() ? ZtMeasureFormat::readableUnit(value, group.kind) : chosen;
+    const ZtUnit chosen = ZtUnitSettings::getInstance()->chosenUnit(kind);
+    if (!chosen.isEmpty())
+        return chosen;
+    const double spread = numbers.count() > 1 ? numbers.standardDeviation() : 0.0;
+    return ZtMeasureFormat::readableUnit(qMax(std::abs(numbers.mean()), spread), kind);
 }
 
 QString unitTextOf(const KvDeskSelectionStatistics::Group &group)
@@ -35,15 +39,14 @@ QString unitTextOf(const KvDeskSelectionStatistics::Group &group)
     return zero.mid(zero.indexOf(QLatin1Char(' ')) + 1);
 }
 
-QString inUnit(double value, const KvDeskSelectionStatistics::Group &group, int digits)
+QString inUnit(double value, const KvDeskSelectionStatistics::Group &group, const ZtUnit &unit, int digits)
 {
     const auto number = [digits](double shown) {
-        return digits > 0 ? ZtMeasureFormat::significant(shown, digits) : ZtMeasureFormat::readable(shown);
+        return digits > 0 ? ZtMeasureFormat::significant(shown, digits) : ZtMeasureFormat::shortened(shown);
     };
     // A mean of counts may lie between two of them, a count does not.
     if (group.kind == ZtGsManipulator::Count && value == std::floor(value))
         return ZtMeasureFormat::drawnText(value, group.kind);
-    const ZtUnit unit = unitOf(value, group);
     return unit.isEmpty() ? ZtMeasureFormat::withUnit(number(value), unitTextOf(group))
                           : ZtMeasureFormat::withUnit(number(unit.fromBase(value)), unit.text());
 }
@@ -70,38 +73,37 @@ bool KvDeskSelectionStatistics::isMixed() const
                        [this](const Group &group) { return !isAlike(group, m_groups.first()); });
 }
 
-bool KvDeskSelectionStatistics::isSummedUp(const Group &group) const
+QVector<KvDeskSelectionStatistics::Group> KvDeskSelectionStatistics::sums() const
 {
-    const Group &first = m_groups.first();
-    return isAlike(group, first) && (!isMixed() || group.valueName == first.valueName);
+    QVector<Group> sums;
+    for (const Group &group : m_groups) {
+        const auto isOneSum = [this, &group](const Group &sum) {
+            return isAlike(sum, group) && (!isMixed() || sum.valueName == group.valueName);
+        };
+        const auto sum = std::find_if(sums.begin(), sums.end(), isOneSum);
+        if (sum == sums.end())
+            sums.append(group);
+        else
+            sum->numbers.add(group.numbers);
+    }
+    return sums;
 }
 
 KvDeskRunningStatistics KvDeskSelectionStatistics::numbers() const
 {
-    KvDeskRunningStatistics numbers;
-    for (const Group &group : m_groups) {
-        if (isSummedUp(group))
-            numbers.add(group.numbers);
-    }
-    return numbers;
+    return m_groups.isEmpty() ? KvDeskRunningStatistics() : sums().first().numbers;
 }
 
-QString KvDeskSelectionStatistics::format(double value) const
+QString KvDeskSelectionStatistics::line(const Group &sum) const
 {
-    return inUnit(value, m_groups.first(), ZtUnitSettings::getInstance()->significantDigits());
-}
-
-QString KvDeskSelectionStatistics::precise(double value) const
-{
-    return inUnit(value, m_groups.first(), preciseDigits);
-}
-
-QString KvDeskSelectionStatistics::text() const
-{
-    const KvDeskRunningStatistics all = numbers();
-    if (m_groups.isEmpty() || all.count() == 0)
+    const KvDeskRunningStatistics &all = sum.numbers;
+    if (all.count() == 0)
         return QString();
-    const QString name = isMixed() ? m_groups.first().valueName + QStringLiteral(": ") : QString();
+    const ZtUnit unit = unitOf(all, sum.kind);
+    const auto format = [&sum, &unit](double value) {
+        return inUnit(value, sum, unit, ZtUnitSettings::getInstance()->significantDigits());
+    };
+    const QString name = isMixed() ? sum.valueName + QStringLiteral(": ") : QString();
     if (all.count() == 1)
         return name + format(all.mean());
     //: number of values, their mean, standard deviation, smallest and largest one
@@ -110,19 +112,41 @@ QString KvDeskSelectionStatistics::text() const
                            format(all.minimum()), format(all.maximum()));
 }
 
+QString KvDeskSelectionStatistics::text() const
+{
+    return m_groups.isEmpty() ? QString() : line(sums().first());
+}
+
 QString KvDeskSelectionStatistics::details() const
 {
-    const KvDeskRunningStatistics all = numbers();
-    if (m_groups.isEmpty() || all.count() == 0)
+    if (m_groups.isEmpty() || numbers().count() == 0)
         return QString();
-    QStringList lines{tr("Selected values: %1").arg(count())};
-    if (isMixed())
-        lines.append(tr("\"%1\" among them: %2").arg(m_groups.first().valueName).arg(all.count()));
-    lines.append(tr("Mean: %1").arg(ZtLeftToRight::isolated(precise(all.mean()))));
+    const QStringList figures = isMixed() ? lines() : preciseFigures();
+    return (QStringList(tr("Selected values: %1").arg(count())) + figures).join(QLatin1Char('\n'));
+}
+
+QStringList KvDeskSelectionStatistics::lines() const
+{
+    QStringList lines;
+    for (const Group &sum : sums()) {
+        const QString text = line(sum);
+        if (!text.isEmpty())
+            lines.append(text);
+    }
+    return lines;
+}
+
+QStringList KvDeskSelectionStatistics::preciseFigures() const
+{
+    const KvDeskRunningStatistics all = numbers();
+    const ZtUnit unit = unitOf(all, m_groups.first().kind);
+    const auto precise = [this, &unit](double value) {
+        return ZtLeftToRight::isolated(inUnit(value, m_groups.first(), unit, preciseDigits));
+    };
+    QStringList lines{tr("Mean: %1").arg(precise(all.mean()))};
     if (all.count() > 1)
-        lines.append(
-            tr("Standard deviation: %1").arg(ZtLeftToRight::isolated(precise(all.standardDeviation()))));
-    lines.append(tr("Smallest: %1").arg(ZtLeftToRight::isolated(precise(all.minimum()))));
-    lines.append(tr("Largest: %1").arg(ZtLeftToRight::isolated(precise(all.maximum()))));
-    return lines.join(QLatin1Char('\n'));
+        lines.append(tr("Standard deviation: %1").arg(precise(all.standardDeviation())));
+    lines.append(tr("Smallest: %1").arg(precise(all.minimum())));
+    lines.append(tr("Largest: %1").arg(precise(all.maximum())));
+    return lines;
 }

@@ -5,13 +5,14 @@
 
 #include <QCoreApplication>
 #include <QString>
+#include <QStringList>
 #include <QVector>
 
 /**
  * What the selected values have in common, and how that reads in the status bar.
  *
- * Values that all measure the same are summed up together. Of a mixture, those are that have the name of the
- * first one; then the text says which.
+ * Values that all measure the same are summed up together, those of a mixture by their names; all figures of
+ * a sum are in one unit.
  */
 class KvDeskSelectionStatistics
 {
@@ -31,18 +32,19 @@ public:
 
     int count() const; ///< of all values
     bool isMixed() const;
-    /** The values that are summed up. */
+    /** Of all values; of a mixture those that have the name of the first. */
     KvDeskRunningStatistics numbers() const;
 
-    /** One line; empty without values. */
+    /** numbers() in one line; empty without values. */
     QString text() const;
-    /** Several lines with more digits. */
+    /** Several lines: more digits, or a line for each name of a mixture. */
     QString details() const;
 
 private:
-    bool isSummedUp(const Group &group) const;
-    QString format(double value) const;
-    QString precise(double value) const;
+    QVector<Group> sums() const;
+    QString line(const Group &sum) const;
+    QStringList lines() const;
+    QStringList preciseFigures() const;
 
     QVector<Group> m_groups;
 };

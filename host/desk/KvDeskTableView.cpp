@@ -114,8 +114,11 @@ std::unique_ptr<QMimeData> KvDeskTableView::selectedData() const
 QStringList KvDeskTableView::rowTexts(int row) const
 {
     QStringList fields;
-    for (int column = 0; column < model()->columnCount(); ++column)
-        fields.append(ZtLeftToRight::plain(model()->index(row, column).data().toString()));
+    for (int column = 0; column < model()->columnCount(); ++column) {
+        const QModelIndex index = model()->index(row, column);
+        const QVariant copied = index.data(CopyRole);
+        fields.append(ZtLeftToRight::plain((copied.isValid() ? copied : index.data()).toString()));
+    }
     return fields;
 }
 

@@ -13,9 +13,12 @@ class KvDeskTableView : public QTableView
 {
     Q_OBJECT
 public:
+    /** What a cell is copied as; cells without it are copied as they are shown. */
+    static constexpr int CopyRole = Qt::UserRole + 1;
+
     explicit KvDeskTableView(QWidget *parent = nullptr);
 
-    /** The selected rows as shown, top to bottom: fields with tabulators between them, one line each. */
+    /** The selected rows as they are copied, top to bottom: fields with tabulators between them, one line each. */
     QString selectedText() const;
     /** What is copied: selectedText(), below the headings where they are wanted, and the same as an HTML
      * table; null without a selection. */

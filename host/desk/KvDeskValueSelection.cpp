@@ -52,7 +52,7 @@ void KvDeskValueSelection::slotRowsSelected(const QItemSelection &aSelected,
     QSet<KvDeskObjectId> objects;
     for (const QItemSelectionRange &range : m_view->selectionModel()->selection()) {
         for (int row = range.top(); row <= range.bottom(); ++row) {
-            const KvDeskValueRow &value = m_model->row(m_sorted->sourceRow(row));
+            const KvDeskValueRow value = m_model->row(m_sorted->sourceRow(row));
             m_values.append({value.object, value.position});
             objects.insert(value.object);
         }
@@ -164,7 +164,7 @@ KvDeskSelectionStatistics KvDeskValueSelection::statistics() const
         const int row = m_model->rowOf(value.object, value.position);
         if (row < 0)
             continue;
-        const KvDeskValueRow &shown = m_model->row(row);
+        const KvDeskValueRow shown = m_model->row(row);
         const QPair<QPair<int, int>, int> key({value.object.type, value.position}, shown.kind);
         auto place = places.constFind(key);
         if (place == places.constEnd()) {

@@ -6,6 +6,7 @@
 #include <QScopedValueRollback>
 
 #include <algorithm>
+#include <numeric>
 #include <utility>
 
 KvDeskValueSortModel::KvDeskValueSortModel(KvDeskValueTableModel *source, QObject *parent)
@@ -70,23 +71,59 @@ QVariant KvDeskValueSortModel::headerData(int section, Qt::Orientation orientati
     return m_source->headerData(section, orientation, role);
 }
 
+// The words that neither the type nor the name of the value have: the object's name has to.
+QStringList KvDeskValueSortModel::wordsForObject(int sourceRow) const
+{
+    const QString type = m_source->text(sourceRow, KvDeskValueTableModel::TypeColumn);
+    const QString name = m_source->text(sourceRow, KvDeskValueTableModel::NameColumn);
+    QStringList words;
+    for (const QString &word : m_words) {
+        if (!type.contains(word, Qt::CaseInsensitive) && !name.contains(word, Qt::CaseInsensitive))
+            words.append(word);
+    }
+    return words;
+}
+
+bool KvDeskValueSortModel::isInObject(const QStringList &words, int sourceRow) const
+{
+    if (words.isEmpty())
+        return true;
+    const QString object = m_source->text(sourceRow, KvDeskValueTableModel::ObjectColumn);
+    return std::all_of(words.begin(), words.end(),
+                       [&object](const QString &word) { return object.contains(word, Qt::CaseInsensitive); });
+}
+
 bool KvDeskValueSortModel::accepts(int sourceRow) const
 {
-    for (const QString &word : m_words) {
-        bool isFound = false;
-        for (const int column : {KvDeskValueTableModel::ObjectColumn, KvDeskValueTableModel::NameColumn,
-                                 KvDeskValueTableModel::TypeColumn})
-            isFound = isFound || m_source->text(sourceRow, column).contains(word, Qt::CaseInsensitive);
-        if (!isFound)
-            return false;
+    return m_words.isEmpty() || isInObject(wordsForObject(sourceRow), sourceRow);
+}
+
+// All rows with a value of one name need the same words in the name of their object.
+KvDeskValueSortModel::Rows KvDeskValueSortModel::acceptedRows() const
+{
+    Rows rows;
+    rows.reserve(static_cast<std::size_t>(m_source->rowCount()));
+    QHash<QPair<int, int>, QStringList> words; // by type and position
+    for (int row = 0; row < m_source->rowCount(); ++row) {
+        bool isAccepted = m_words.isEmpty();
+        if (!isAccepted) {
+            const KvDeskValueRow shown = m_source->row(row);
+            const QPair<int, int> name(shown.object.type, shown.position);
+            auto found = words.constFind(name);
+            if (found == words.constEnd())
+                found = words.insert(name, wordsForObject(row));
+            isAccepted = isInObject(*found, row);
+        }
+        if (isAccepted)
+            rows.push_back(row);
     }
-    return true;
+    return rows;
 }
 
 int KvDeskValueSortModel::compareValues(int left, int right) const
 {
-    const KvDeskValueRow &a = m_source->row(left);
-    const KvDeskValueRow &b = m_source->row(right);
+    const KvDeskValueRow a = m_source->row(left);
+    const KvDeskValueRow b = m_source->row(right);
     if (a.kind != b.kind)
         return a.kind < b.kind ? -1 : 1;
     return a.value < b.value ? -1 : b.value < a.value ? 1 : 0;
@@ -110,15 +147,61 @@ bool KvDeskValueSortModel::isBefore(int left, int right) const
 
 KvDeskValueSortModel::Rows KvDeskValueSortModel::sortedRows() const
 {
-    Rows rows;
-    rows.reserve(static_cast<std::size_t>(m_source->rowCount()));
-    for (int row = 0; row < m_source->rowCount(); ++row) {
-        if (accepts(row))
-            rows.push_back(row);
-    }
-    if (m_column >= 0)
-        std::sort(rows.begin(), rows.end(), [this](int a, int b) { return isBefore(a, b); });
+    Rows rows = acceptedRows();
+    if (m_column == KvDeskValueTableModel::ValueColumn)
+        sortByValues(&rows);
+    else if (m_column >= 0)
+        sortByTexts(&rows);
     return rows;
+}
+
+// Numbers that lie next to each other in memory are compared much quicker than rows of the source.
+void KvDeskValueSortModel::sortByValues(Rows *rows) const
+{
+    struct Value
+    {
+        double value;
+        int kind;
+        int row;
+    };
+    std::vector<Value> values;
+    values.reserve(rows->size());
+    for (const int row : *rows) {
+        const KvDeskValueRow shown = m_source->row(row);
+        values.push_back({shown.value, shown.kind, row});
+    }
+    const bool isAscending = m_order == Qt::AscendingOrder;
+    const auto isBefore = [isAscending](const Value &a, const Value &b) {
+        if (a.kind != b.kind)
+            return (a.kind < b.kind) == isAscending;
+        if (a.value < b.value || b.value < a.value)
+            return (a.value < b.value) == isAscending;
+        return a.row < b.row;
+    };
+    std::sort(values.begin(), values.end(), isBefore);
+    std::transform(values.begin(), values.end(), rows->begin(), [](const Value &value) { return value.row; });
+}
+
+// Rows with the same text stay as they are, so each goes to the next free place of its text.
+void KvDeskValueSortModel::sortByTexts(Rows *rows) const
+{
+    std::vector<int> ranks = m_source->ranks(m_column);
+    if (ranks.empty())
+        return;
+    const int last = *std::max_element(ranks.begin(), ranks.end());
+    if (m_order == Qt::DescendingOrder)
+        std::transform(ranks.begin(), ranks.end(), ranks.begin(), [last](int rank) { return last - rank; });
+    std::vector<std::size_t> starts(static_cast<std::size_t>(last) + 2);
+    const auto rankOf = [&ranks](int row) {
+        return static_cast<std::size_t>(ranks[static_cast<std::size_t>(row)]);
+    };
+    for (const int row : *rows)
+        ++starts[rankOf(row) + 1];
+    std::partial_sum(starts.begin(), starts.end(), starts.begin());
+    Rows sorted(rows->size());
+    for (const int row : *rows)
+        sorted[starts[rankOf(row)]++] = row;
+    rows->swap(sorted);
 }
 
 void KvDeskValueSortModel::rebuild()

@@ -56,7 +56,12 @@ private:
 
     void connectSignals();
     void rebuild();
+    Rows acceptedRows() const;
+    QStringList wordsForObject(int sourceRow) const;
+    bool isInObject(const QStringList &words, int sourceRow) const;
     Rows sortedRows() const;
+    void sortByValues(Rows *rows) const;
+    void sortByTexts(Rows *rows) const;
     void setPlaces();
     bool accepts(int sourceRow) const;
     bool isBefore(int left, int right) const;

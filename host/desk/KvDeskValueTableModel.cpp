@@ -1,9 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskValueTableModel.h"
 
+#include "KvDeskTableView.h"
 #include "kernel/ZtGsManipulator.h"
 #include "kernel/ZtKernelData.h"
 #include "measuring/ZtDrawnType.h"
+#include "measuring/ZtImportedManipulator.h"
 
 #include <algorithm>
 #include <numeric>
@@ -64,6 +66,47 @@ QVector<int> allRows(std::size_t count)
 
 } // namespace
 
+/// Reads the values of objects of one type, of which there may be many.
+class KvDeskValueTableModel::Reader
+{
+public:
+    explicit Reader(int type)
+        : m_manipulator(kernel()->getGsManipulator(type))
+        , m_measuring(dynamic_cast<const ZtMeasuringManipulator *>(m_manipulator))
+    {}
+
+    void read(int objectIndex, int id, const ZtKernelObjectData *data, Rows *rows)
+    {
+        if (!m_measuring) {
+            readByName(objectIndex, id, data, rows);
+            return;
+        }
+        m_values.clear();
+        m_measuring->appendShownValues(data, &m_values);
+        for (const ZtMeasuredValue &value : m_values)
+            rows->push_back({value.value, objectIndex, value.position, value.kind});
+    }
+
+private:
+    void readByName(int objectIndex, int id, const ZtKernelObjectData *data, Rows *rows) const
+    {
+        const QStringList shown = m_manipulator->valueSet(id);
+        const QStringList names = m_manipulator->getValueNames();
+        for (int i = 0; i < names.size(); ++i) {
+            if (!m_manipulator->isValueShown(names.at(i), shown))
+                continue;
+            int kind = ZtGsManipulator::NoKind;
+            const QVariant value = m_manipulator->value(names.at(i), data, kind);
+            if (value.isValid())
+                rows->push_back({value.toDouble(), objectIndex, i, kind});
+        }
+    }
+
+    const ZtGsManipulator *m_manipulator;
+    const ZtMeasuringManipulator *m_measuring; ///< null for types of others
+    std::vector<ZtMeasuredValue> m_values;
+};
+
 KvDeskValueTableModel::KvDeskValueTableModel(QObject *parent)
     : QAbstractTableModel(parent)
 {
@@ -94,6 +137,8 @@ QVariant KvDeskValueTableModel::data(const QModelIndex &index, int role) const
         return text(index.row(), index.column());
     if (role == Qt::TextAlignmentRole)
         return alignmentOf(index.column());
+    if (role == KvDeskTableView::CopyRole && index.column() == ValueColumn)
+        return fullText(index.row());
     return QVariant();
 }
 
@@ -119,18 +164,42 @@ bool KvDeskValueTableModel::setData(const QModelIndex &index, const QVariant &va
 {
     if (!index.isValid() || role != Qt::EditRole || index.column() != ObjectColumn)
         return false;
-    const KvDeskObjectId object = row(index.row()).object;
+    const KvDeskObjectId object = objectOf(index.row()).id;
     const QString name = value.toString().simplified();
     if (name != text(index.row(), ObjectColumn))
         emit signalRenamed(object.type, object.id, name);
     return true;
 }
 
+const KvDeskValueTableModel::Object &KvDeskValueTableModel::objectOf(int row) const
+{
+    return m_objects[static_cast<std::size_t>(m_rows[static_cast<std::size_t>(row)].objectIndex)];
+}
+
+KvDeskValueRow KvDeskValueTableModel::row(int row) const
+{
+    const Row &shown = m_rows[static_cast<std::size_t>(row)];
+    return {objectOf(row).id, shown.objectIndex, shown.position, shown.kind, shown.value};
+}
+
+// Null when the object's type is gone before the change was announced.
+KvDeskValueTableModel::Name *KvDeskValueTableModel::nameOf(const Object &object) const
+{
+    if (object.name)
+        return object.name.get();
+    const ZtGsManipulator *const manipulator = kernel()->getGsManipulator(object.id.type);
+    if (manipulator)
+        object.name = std::make_unique<Name>(Name{manipulator->getObjectName(object.id.id), std::nullopt});
+    return object.name.get();
+}
+
 QString KvDeskValueTableModel::text(int row, int column) const
 {
-    const KvDeskValueRow &shown = this->row(row);
-    if (column == ObjectColumn)
-        return m_objects[static_cast<std::size_t>(shown.objectIndex)].name;
+    const KvDeskValueRow shown = this->row(row);
+    if (column == ObjectColumn) {
+        const Name *const name = nameOf(objectOf(row));
+        return name ? name->text : QString();
+    }
     // Between a change of the kernel and its announcement, what a row stands for may be gone.
     const ZtGsManipulator *const manipulator = kernel()->getGsManipulator(shown.object.type);
     if (!manipulator)
@@ -141,7 +210,20 @@ QString KvDeskValueTableModel::text(int row, int column) const
     if (column == NameColumn)
         return name;
     const ZtKernelObjectData *const data = kernel()->object(shown.object.type, shown.object.id);
-    return data ? manipulator->valueText(name, data) : QString();
+    if (!data)
+        return QString();
+    const auto *const imported = dynamic_cast<const ZtImportedManipulator *>(manipulator);
+    return imported ? imported->shortText(name, data) : manipulator->valueText(name, data);
+}
+
+QString KvDeskValueTableModel::fullText(int row) const
+{
+    const KvDeskValueRow shown = this->row(row);
+    const ZtGsManipulator *const manipulator = kernel()->getGsManipulator(shown.object.type);
+    const ZtKernelObjectData *const data = kernel()->object(shown.object.type, shown.object.id);
+    if (!manipulator || !data)
+        return QString();
+    return manipulator->valueText(manipulator->getValueNames().value(shown.position), data);
 }
 
 std::size_t KvDeskValueTableModel::lowerBound(const KvDeskObjectId &id) const
@@ -180,21 +262,29 @@ int KvDeskValueTableModel::rowOf(const KvDeskObjectId &object, int position) con
 {
     const Range rows = rowsOf(object);
     for (int row = rows.first; row < rows.first + rows.count; ++row) {
-        if (this->row(row).position == position)
+        if (m_rows[static_cast<std::size_t>(row)].position == position)
             return row;
     }
     return -1;
 }
 
+const QCollatorSortKey &KvDeskValueTableModel::sortKey(const Object &object) const
+{
+    Name *name = nameOf(object);
+    if (!name) {
+        object.name = std::make_unique<Name>();
+        name = object.name.get();
+    }
+    if (!name->sortKey)
+        name->sortKey = m_collator.sortKey(name->text);
+    return *name->sortKey;
+}
+
 const QCollatorSortKey &KvDeskValueTableModel::sortKey(int row, int column) const
 {
-    const KvDeskValueRow &shown = this->row(row);
-    if (column == ObjectColumn) {
-        const Object &object = m_objects[static_cast<std::size_t>(shown.objectIndex)];
-        if (!object.sortKey)
-            object.sortKey = m_collator.sortKey(object.name);
-        return *object.sortKey;
-    }
+    if (column == ObjectColumn)
+        return sortKey(objectOf(row));
+    const KvDeskValueRow shown = this->row(row);
     if (column == TypeColumn) {
         auto found = m_typeKeys.constFind(shown.object.type);
         if (found == m_typeKeys.constEnd())
@@ -211,6 +301,54 @@ const QCollatorSortKey &KvDeskValueTableModel::sortKey(int row, int column) cons
 int KvDeskValueTableModel::compareTexts(int left, int right, int column) const
 {
     return sortKey(left, column).compare(sortKey(right, column));
+}
+
+// Rows with the same text for sure: the number of the group of each row, and the first row of each group.
+void KvDeskValueTableModel::group(int column, std::vector<int> *groups, std::vector<int> *firstRows) const
+{
+    QHash<QPair<int, int>, int> known; // by type and position
+    groups->reserve(m_rows.size());
+    for (std::size_t row = 0; row < m_rows.size(); ++row) {
+        const Row &shown = m_rows[row];
+        const bool isSameObject = row > 0 && m_rows[row - 1].objectIndex == shown.objectIndex;
+        if (isSameObject && column != NameColumn) {
+            groups->push_back(groups->back());
+            continue;
+        }
+        int group = static_cast<int>(firstRows->size());
+        if (column != ObjectColumn) {
+            const int type = m_objects[static_cast<std::size_t>(shown.objectIndex)].id.type;
+            const QPair<int, int> text(type, column == NameColumn ? shown.position : 0);
+            const auto found = known.constFind(text);
+            group = found == known.constEnd() ? *known.insert(text, group) : *found;
+        }
+        if (group == static_cast<int>(firstRows->size()))
+            firstRows->push_back(static_cast<int>(row));
+        groups->push_back(group);
+    }
+}
+
+std::vector<int> KvDeskValueTableModel::ranks(int column) const
+{
+    std::vector<int> result;
+    std::vector<int> firstRows;
+    group(column, &result, &firstRows);
+    std::vector<int> order(firstRows.size());
+    std::iota(order.begin(), order.end(), 0);
+    const auto compare = [&](int a, int b) {
+        return compareTexts(firstRows[static_cast<std::size_t>(a)], firstRows[static_cast<std::size_t>(b)],
+                            column);
+    };
+    std::sort(order.begin(), order.end(), [&compare](int a, int b) { return compare(a, b) < 0; });
+    std::vector<int> rankOfGroup(order.size());
+    int rank = 0;
+    for (std::size_t i = 0; i < order.size(); ++i) {
+        rank += i > 0 && compare(order[i - 1], order[i]) != 0 ? 1 : 0;
+        rankOfGroup[static_cast<std::size_t>(order[i])] = rank;
+    }
+    for (int &place : result)
+        place = rankOfGroup[static_cast<std::size_t>(place)];
+    return result;
 }
 
 QString KvDeskValueTableModel::numberOf(const QString &text)
@@ -307,8 +445,12 @@ void KvDeskValueTableModel::readAgain()
     Objects objects;
     Rows rows;
     readAll(&objects, &rows);
-    const auto isSame = [](const KvDeskValueRow &a, const KvDeskValueRow &b) { return a.isSameValue(b); };
-    if (!std::equal(rows.begin(), rows.end(), m_rows.begin(), m_rows.end(), isSame)) {
+    const auto isSameObject = [](const Object &a, const Object &b) { return a.id == b.id; };
+    const auto isSameRow = [](const Row &a, const Row &b) {
+        return a.objectIndex == b.objectIndex && a.position == b.position;
+    };
+    if (!std::equal(objects.begin(), objects.end(), m_objects.begin(), m_objects.end(), isSameObject) ||
+        !std::equal(rows.begin(), rows.end(), m_rows.begin(), m_rows.end(), isSameRow)) {
         reset();
         return;
     }
@@ -334,12 +476,10 @@ void KvDeskValueTableModel::insertObject(const KvDeskObjectId &id)
     Object object;
     object.id = id;
     object.firstRow = index < m_objects.size() ? m_objects[index].firstRow : rowCount();
-    m_objects.insert(m_objects.begin() + static_cast<std::ptrdiff_t>(index), object);
     for (auto row = m_rows.begin() + object.firstRow; row != m_rows.end(); ++row)
         ++row->objectIndex;
-    Rows rows;
-    readObject(&m_objects[index], &rows);
-    replaceRows(index, rows);
+    m_objects.insert(m_objects.begin() + static_cast<std::ptrdiff_t>(index), std::move(object));
+    replaceRows(index, readObject(index, id));
 }
 
 void KvDeskValueTableModel::removeObject(const KvDeskObjectId &id)
@@ -353,12 +493,10 @@ void KvDeskValueTableModel::removeObject(const KvDeskObjectId &id)
 }
 
 // Puts rows in the place of those that an object has.
-void KvDeskValueTableModel::replaceRows(std::size_t index, Rows rows)
+void KvDeskValueTableModel::replaceRows(std::size_t index, const Rows &rows)
 {
     const Range old = rowsAt(index);
     const int count = static_cast<int>(rows.size());
-    for (KvDeskValueRow &row : rows)
-        row.objectIndex = static_cast<int>(index);
     if (old.count > 0) {
         beginRemoveRows(QModelIndex(), old.first, old.first + old.count - 1);
         m_rows.erase(m_rows.begin() + old.first, m_rows.begin() + old.first + old.count);
@@ -386,22 +524,16 @@ void KvDeskValueTableModel::changeObjects(const QVector<KvDeskObjectId> &ids)
     bool namesChanged = false;
     for (const KvDeskObjectId &id : ids) {
         const std::size_t index = lowerBound(id);
-        Object object;
-        object.id = id;
-        Rows rows;
-        readObject(&object, &rows);
+        const Rows rows = readObject(index, id);
         if (!hasRows(index, rows)) {
             reshaped.append(id);
             continue;
         }
-        namesChanged = rename(index, object.name) || namesChanged;
+        namesChanged = rename(index) || namesChanged;
         const Range range = rowsAt(index);
-        for (int i = 0; i < range.count; ++i) {
-            KvDeskValueRow &row = rows[static_cast<std::size_t>(i)];
-            row.objectIndex = static_cast<int>(index);
-            m_rows[static_cast<std::size_t>(range.first + i)] = row;
+        std::copy(rows.begin(), rows.end(), m_rows.begin() + range.first);
+        for (int i = 0; i < range.count; ++i)
             changedRows.append(range.first + i);
-        }
     }
     announceRows(changedRows, namesChanged);
     // One by one: whoever sorts the rows needs all but the coming ones in their order.
@@ -411,22 +543,17 @@ void KvDeskValueTableModel::changeObjects(const QVector<KvDeskObjectId> &ids)
 
 void KvDeskValueTableModel::reshapeObject(std::size_t index)
 {
-    Object object;
-    object.id = m_objects[index].id;
-    Rows rows;
-    readObject(&object, &rows);
+    const Rows rows = readObject(index, m_objects[index].id);
     replaceRows(index, Rows());
-    rename(index, object.name);
+    rename(index);
     replaceRows(index, rows);
 }
 
-bool KvDeskValueTableModel::rename(std::size_t index, const QString &name)
+// False for a name that nobody asked for, too: nobody shows it or put it in its place.
+bool KvDeskValueTableModel::rename(std::size_t index)
 {
-    if (m_objects[index].name == name)
-        return false;
-    m_objects[index].name = name;
-    m_objects[index].sortKey.reset();
-    return true;
+    const std::unique_ptr<Name> old = std::move(m_objects[index].name);
+    return old && nameOf(m_objects[index])->text != old->text;
 }
 
 // Whether an object has just these rows, with whatever values.
@@ -434,7 +561,7 @@ bool KvDeskValueTableModel::hasRows(std::size_t index, const Rows &rows) const
 {
     const Range range = rowsAt(index);
     const auto first = m_rows.begin() + range.first;
-    const auto isSame = [](const KvDeskValueRow &a, const KvDeskValueRow &b) { return a.isSameValue(b); };
+    const auto isSame = [](const Row &a, const Row &b) { return a.position == b.position; };
     return std::equal(first, first + range.count, rows.begin(), rows.end(), isSame);
 }
 
@@ -449,40 +576,31 @@ void KvDeskValueTableModel::announceRows(const QVector<int> &rows, bool namesCha
 
 void KvDeskValueTableModel::readAll(Objects *objects, Rows *rows)
 {
+    constexpr int sample = 1024; // objects that tell how many rows the others have
     const QMap<int, ZtObjectMap> &all = kernel()->objects();
     for (auto type = all.constBegin(); type != all.constEnd(); ++type) {
         if (!measuringManipulator(type.key()))
             continue;
-        objects->reserve(objects->size() + static_cast<std::size_t>(type->size()));
+        const std::size_t rowsBefore = rows->size();
+        const auto count = static_cast<std::size_t>(type->size());
+        objects->reserve(objects->size() + count);
+        Reader reader(type.key());
+        int done = 0;
         for (auto it = type->constBegin(); it != type->constEnd(); ++it) {
             Object object;
             object.id = {type.key(), it.key()};
             object.firstRow = static_cast<int>(rows->size());
-            readObject(&object, rows);
-            for (auto row = rows->begin() + object.firstRow; row != rows->end(); ++row)
-                row->objectIndex = static_cast<int>(objects->size());
+            reader.read(static_cast<int>(objects->size()), it.key(), it.value(), rows);
             objects->push_back(std::move(object));
+            if (++done == sample)
+                rows->reserve(rowsBefore + (rows->size() - rowsBefore) * count / sample + sample);
         }
     }
 }
 
-void KvDeskValueTableModel::readObject(Object *object, Rows *rows)
+KvDeskValueTableModel::Rows KvDeskValueTableModel::readObject(std::size_t index, const KvDeskObjectId &id)
 {
-    const KvDeskObjectId &id = object->id;
-    const ZtGsManipulator *const manipulator = kernel()->getGsManipulator(id.type);
-    const ZtKernelObjectData *const data = kernel()->object(id.type, id.id);
-    object->name = manipulator->getObjectName(id.id);
-    const QStringList shown = manipulator->valueSet(id.id);
-    const QStringList names = manipulator->getValueNames();
-    KvDeskValueRow row;
-    row.object = id;
-    for (int i = 0; i < names.size(); ++i) {
-        if (!manipulator->isValueShown(names.at(i), shown))
-            continue;
-        const QVariant value = manipulator->value(names.at(i), data, row.kind);
-        row.position = i;
-        row.value = value.toDouble();
-        if (value.isValid())
-            rows->push_back(row);
-    }
+    Rows rows;
+    Reader(id.type).read(static_cast<int>(index), id.id, kernel()->object(id.type, id.id), &rows);
+    return rows;
 }

@@ -44,10 +44,8 @@ bool ZtClassIndexTableReader::readTable()
     }
     if (hasFault() || rows == m_rowCount)
         return !hasFault();
-    return fail(
-        m_firstLine, 1,
-        tr("The first line announces %n row(s), but the table has this number of them: %1", "", m_rowCount)
-            .arg(rows));
+    return fail(m_firstLine, 1,
+                tr("The table has %n row(s), its first line announces %1", "", rows).arg(m_rowCount));
 }
 
 bool ZtClassIndexTableReader::readFirstRow()
@@ -101,11 +99,9 @@ bool ZtClassIndexTableReader::readRow(const ZtCsvRow &row)
 {
     const std::size_t fieldCount = static_cast<std::size_t>(m_valueCount) + 1;
     if (row.fields.size() != fieldCount)
-        return fail(
-            row.line, static_cast<int>(qMin(row.fields.size(), fieldCount)) + 1,
-            tr("The row has %n field(s), but the first line announces a class and this number of values: %1",
-               "", static_cast<int>(row.fields.size()))
-                .arg(m_valueCount));
+        return fail(row.line, static_cast<int>(qMin(row.fields.size(), fieldCount)) + 1,
+                    tr("The row has %n field(s) instead of %1", "", static_cast<int>(row.fields.size()))
+                        .arg(fieldCount));
     int type = 0;
     if (!readClass(row, &type))
         return false;

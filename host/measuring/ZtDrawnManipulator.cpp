@@ -114,6 +114,18 @@ QVariant ZtDrawnManipulator::value(const QString &valueName, const ZtKernelObjec
     return measureKind == Count ? QVariant(static_cast<int>(baseValue)) : QVariant(baseValue);
 }
 
+void ZtDrawnManipulator::appendValues(const ZtMeasuredObjectData &object,
+                                      std::vector<ZtMeasuredValue> *values) const
+{
+    if (!m_type.acceptsPoints(drawn(&object).points()))
+        return;
+    for (std::size_t i = 0; i < m_type.values.size(); ++i) {
+        const ZtDrawnValue &definition = m_type.values[i];
+        values->push_back({static_cast<int>(i), effectiveKind(definition, *m_calibration),
+                           inBaseUnits(definition, drawn(&object))});
+    }
+}
+
 QString ZtDrawnManipulator::valueText(const QString &valueName, const ZtKernelObjectData *object) const
 {
     double baseValue = 0.0;
@@ -174,7 +186,7 @@ QPainterPath ZtDrawnManipulator::outlineOf(const ZtDrawnType &type, const QPolyg
     return type.outline ? type.outline(points) : QPainterPath();
 }
 
-void ZtDrawnManipulator::drawShape(QPainter *painter, const ZtKernelObjectData *object) const
+void ZtDrawnManipulator::drawShape(QPainter *painter, int id, const ZtKernelObjectData *object) const
 {
     if (!object || !m_type.acceptsPoints(drawn(object).points()))
         return;
@@ -183,12 +195,12 @@ void ZtDrawnManipulator::drawShape(QPainter *painter, const ZtKernelObjectData *
     if (m_type.outline)
         objectPainter.drawOutline(outline(points));
     if (m_type.id == ZtDrawnType::Counter)
-        objectPainter.drawMarkers(points);
+        objectPainter.drawMarkers(points, ZtDrawnObjectPainter::counterColor(id));
 }
 
 void ZtDrawnManipulator::draw(QPainter *painter, int id, const ZtKernelObjectData *object) const
 {
-    drawShape(painter, object);
+    drawShape(painter, id, object);
     const QString text = labelText(id, object);
     if (!text.isEmpty() && !drawn(object).points().isEmpty())
         ZtDrawnObjectPainter(painter).drawLabel(drawn(object).points().first(), text);

@@ -28,7 +28,7 @@ public:
     void draw(QPainter *painter, int id, const ZtKernelObjectData *object) const override;
 
     /** As draw(), without the label. */
-    void drawShape(QPainter *painter, const ZtKernelObjectData *object) const;
+    void drawShape(QPainter *painter, int id, const ZtKernelObjectData *object) const;
     /** What the object's label reads: its name and the first value that is shown; of types without values
      * what they are there for. May be empty. */
     QString labelText(int id, const ZtKernelObjectData *object) const;
@@ -44,6 +44,10 @@ public:
 
     /** Fetches the names again after the language changed. */
     void retranslate();
+
+protected:
+    void appendValues(const ZtMeasuredObjectData &object,
+                      std::vector<ZtMeasuredValue> *values) const override;
 
 private:
     bool measure(const QString &valueName, const ZtKernelObjectData *object, double *baseValue,

@@ -8,6 +8,8 @@
 #include <QPainter>
 #include <QPainterPath>
 
+#include <cstdlib>
+
 namespace {
 
 // All lengths in device-independent pixels.
@@ -19,6 +21,27 @@ constexpr double labelPadding = 3.0;
 constexpr double labelOffset = 6.0;
 
 const QColor labelColor(255, 255, 255);
+
+constexpr int leastDistance = 120; ///< of colours that are told apart, over all three parts
+
+int distance(const QColor &a, const QColor &b)
+{
+    return std::abs(a.red() - b.red()) + std::abs(a.green() - b.green()) + std::abs(a.blue() - b.blue());
+}
+
+// They differ in brightness as well as in hue; neighbours differ most.
+QVector<QColor> makeCounterColors()
+{
+    const QColor palette[] = {{86, 180, 233}, {240, 110, 50},  {255, 255, 255}, {40, 190, 140},
+                              {240, 228, 66}, {235, 150, 205}, {120, 95, 255},  {160, 235, 235}};
+    const QColor own = ZtDrawnObjectPainter::lineColor();
+    QVector<QColor> colors{own};
+    for (const QColor &color : palette) {
+        if (distance(color, own) >= leastDistance)
+            colors.append(color);
+    }
+    return colors;
+}
 
 // Not cosmetic, as such pens are thin on screens with more than one pixel per device-independent one.
 QPen linePen(const QColor &color, double width)
@@ -45,12 +68,23 @@ QColor ZtDrawnObjectPainter::haloColor()
     return QColor(20, 20, 20, 190);
 }
 
+const QVector<QColor> &ZtDrawnObjectPainter::counterColors()
+{
+    static const QVector<QColor> colors = makeCounterColors();
+    return colors;
+}
+
+int ZtDrawnObjectPainter::counterColorIndex(int id)
+{
+    return qMax(0, id - 1) % counterColors().size();
+}
+
 void ZtDrawnObjectPainter::drawOutline(const QPainterPath &path) const
 {
     strokeOnDevice(m_painter->worldTransform().map(path));
 }
 
-void ZtDrawnObjectPainter::drawMarkers(const QPolygonF &points) const
+void ZtDrawnObjectPainter::drawMarkers(const QPolygonF &points, const QColor &color) const
 {
     QPainterPath path;
     const QPolygonF onDevice = m_painter->worldTransform().map(points);
@@ -60,10 +94,10 @@ void ZtDrawnObjectPainter::drawMarkers(const QPolygonF &points) const
         path.moveTo(point - QPointF(0, markerArm));
         path.lineTo(point + QPointF(0, markerArm));
     }
-    strokeOnDevice(path);
+    strokeOnDevice(path, color);
 }
 
-void ZtDrawnObjectPainter::strokeOnDevice(const QPainterPath &path) const
+void ZtDrawnObjectPainter::strokeOnDevice(const QPainterPath &path, const QColor &color) const
 {
     m_painter->save();
     m_painter->setWorldTransform(QTransform());
@@ -71,7 +105,7 @@ void ZtDrawnObjectPainter::strokeOnDevice(const QPainterPath &path) const
     m_painter->setBrush(Qt::NoBrush);
     m_painter->setPen(linePen(haloColor(), haloWidth));
     m_painter->drawPath(path);
-    m_painter->setPen(linePen(lineColor(), lineWidth));
+    m_painter->setPen(linePen(color, lineWidth));
     m_painter->drawPath(path);
     m_painter->restore();
 }

@@ -3,7 +3,9 @@
 
 #include "measuring/ZtMeasuringGlobal.h"
 
-class QColor;
+#include <QColor>
+#include <QVector>
+
 class QPainter;
 class QPainterPath;
 class QPointF;
@@ -29,7 +31,7 @@ public:
 
     void drawOutline(const QPainterPath &path) const;
     /** A small cross at each point. */
-    void drawMarkers(const QPolygonF &points) const;
+    void drawMarkers(const QPolygonF &points, const QColor &color = lineColor()) const;
     /** A text in a dark box, its lower left corner near \a anchor; moved so that it stays on the device when
      * \a anchor is on it. */
     void drawLabel(const QPointF &anchor, const QString &text) const;
@@ -38,6 +40,13 @@ public:
      * less care. */
     static QColor lineColor();
     static QColor haloColor();
+    /** The colours by which counters are told apart, wherever one is shown: that of all objects, then others
+     * that are seen on the dark line and differ for people who see few colours, too. */
+    static const QVector<QColor> &counterColors();
+    /** The place of a counter's colour among them. It depends on the id alone, so that a counter keeps its
+     * colour whatever becomes of others; after the last colour comes the first one again. */
+    static int counterColorIndex(int id);
+    static QColor counterColor(int id) { return counterColors().at(counterColorIndex(id)); }
 
     /** What a painter can reach, in the coordinates that it has without a transform. */
     static QRectF page(const QPainter &painter);
@@ -48,7 +57,7 @@ public:
     void drawLabelBox(const QRectF &box, const QString &text) const;
 
 private:
-    void strokeOnDevice(const QPainterPath &path) const;
+    void strokeOnDevice(const QPainterPath &path, const QColor &color = lineColor()) const;
 
     QPainter *m_painter;
 };

@@ -54,9 +54,25 @@ QVariant ZtImportedManipulator::value(const QString &valueName, const ZtKernelOb
     return found->value;
 }
 
+void ZtImportedManipulator::appendValues(const ZtMeasuredObjectData &object,
+                                         std::vector<ZtMeasuredValue> *values) const
+{
+    const int row = static_cast<const ZtImportedObjectData &>(object).row();
+    for (const ZtImportedCell &cell : m_type->row(row))
+        values->push_back({cell.valueIndex, m_type->unit(cell).kind(), cell.value});
+}
+
 QString ZtImportedManipulator::valueText(const QString &valueName, const ZtKernelObjectData *object) const
 {
     const ZtImportedCell *found = cell(valueName, object);
     return found ? ZtMeasureFormat::importedText(found->value, m_type->unit(*found), m_type->text(*found))
                  : QString();
+}
+
+QString ZtImportedManipulator::shortText(const QString &valueName, const ZtKernelObjectData *object) const
+{
+    const ZtImportedCell *found = cell(valueName, object);
+    return found
+               ? ZtMeasureFormat::importedShortText(found->value, m_type->unit(*found), m_type->text(*found))
+               : QString();
 }

@@ -21,8 +21,15 @@ public:
                    int &measureKind) const override;
     QString valueText(const QString &valueName, const ZtKernelObjectData *object) const override;
 
+    /** The value's text where people look at many of them; valueText() has all digits. */
+    QString shortText(const QString &valueName, const ZtKernelObjectData *object) const;
+
     const ZtImportedType &type() const { return *m_type; }
     std::shared_ptr<const ZtImportedType> sharedType() const { return m_type; }
+
+protected:
+    void appendValues(const ZtMeasuredObjectData &object,
+                      std::vector<ZtMeasuredValue> *values) const override;
 
 private:
     const ZtImportedCell *cell(const QString &valueName, const ZtKernelObjectData *object) const;

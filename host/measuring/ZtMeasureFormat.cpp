@@ -84,6 +84,13 @@ QString ZtMeasureFormat::readable(double value)
     return withoutNegativeZero(QString::number(value, 'f', decimals));
 }
 
+QString ZtMeasureFormat::shortened(double value)
+{
+    constexpr int digits = 3;
+    constexpr double smallest = 0.0005; // that three decimals show
+    return value != 0.0 && std::abs(value) < smallest ? significant(value, digits) : readable(value);
+}
+
 QString ZtMeasureFormat::withUnit(const QString &number, const QString &unitText)
 {
     return unitText.isEmpty() ? number : number + QLatin1Char(' ') + unitText;
@@ -146,4 +153,13 @@ QString ZtMeasureFormat::importedText(double baseValue, const ZtUnit &source, co
         return writtenText;
     const ZtUnit &unit = isConverted ? chosen : source;
     return withUnit(formatted(unit.fromBase(baseValue)), unit.text());
+}
+
+QString ZtMeasureFormat::importedShortText(double baseValue, const ZtUnit &source, const QString &writtenText)
+{
+    const QString text = importedText(baseValue, source, writtenText);
+    if (text != writtenText || source.kind() == ZtGsManipulator::Count)
+        return text;
+    const QString shorter = withUnit(shortened(source.fromBase(baseValue)), source.text());
+    return shorter.size() < text.size() ? shorter : text;
 }

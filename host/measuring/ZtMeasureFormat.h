@@ -21,6 +21,9 @@ public:
     /** A finite number with three decimals below 100, two below 1000, else one. */
     static QString readable(double value);
 
+    /** As readable(), but with significant digits where that would show nothing of a number but zeros. */
+    static QString shortened(double value);
+
     /** The text of a value in base units, in the user's unit or, when that is automatic, in a readable one.
      */
     static QString drawnText(double baseValue, int measureKind);
@@ -35,6 +38,10 @@ public:
      * \param writtenText number as the table wrote it, and unit
      */
     static QString importedText(double baseValue, const ZtUnit &source, const QString &writtenText);
+
+    /** The same where people look at many values one below another: no more digits than drawn objects have,
+     * unless the user chose how many. The digits that the table wrote, where those are fewer. */
+    static QString importedShortText(double baseValue, const ZtUnit &source, const QString &writtenText);
 
     /** The unit in which a value of kind Length or Area reads best; no unit for other kinds. */
     static ZtUnit readableUnit(double baseValue, int measureKind);

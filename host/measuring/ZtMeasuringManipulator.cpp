@@ -4,6 +4,7 @@
 #include "kernel/ZtKernelData.h"
 #include "measuring/ZtMeasuredObjectData.h"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 
@@ -43,6 +44,22 @@ QStringList ZtMeasuringManipulator::valueSet(int id) const
             shown.append(names.at(i));
     }
     return shown;
+}
+
+void ZtMeasuringManipulator::appendShownValues(const ZtKernelObjectData *object,
+                                               std::vector<ZtMeasuredValue> *values) const
+{
+    if (!object)
+        return;
+    const auto &measured = *static_cast<const ZtMeasuredObjectData *>(object);
+    const auto before = static_cast<std::ptrdiff_t>(values->size());
+    appendValues(measured, values);
+    if (measured.hiddenValues().isEmpty())
+        return;
+    const auto isHidden = [&](const ZtMeasuredValue &value) {
+        return !isValueShown(measured, value.position);
+    };
+    values->erase(std::remove_if(values->begin() + before, values->end(), isHidden), values->end());
 }
 
 QString ZtMeasuringManipulator::ownName(int id) const

@@ -4,7 +4,17 @@
 #include "kernel/ZtGsManipulator.h"
 #include "measuring/ZtMeasuringGlobal.h"
 
+#include <vector>
+
 class ZtMeasuredObjectData;
+
+/** One value that an object has. */
+struct ZtMeasuredValue
+{
+    int position = 0;   ///< in the type's value names
+    int kind = 0;       ///< ZtGsManipulator::MeasureKind
+    double value = 0.0; ///< in base units
+};
 
 /**
  * What the manipulators of this library share: the type id, and which values are shown.
@@ -18,6 +28,10 @@ public:
     int objectTypeId() const override { return m_typeId; }
     bool isValueShown(const QString &valueName, const QStringList &valueSet) const override;
     QStringList valueSet(int id) const override;
+
+    /** Appends the values of an object that are shown, in the order of their names; the same ones that
+     * value() gives by their names, for whoever needs those of very many objects. */
+    void appendShownValues(const ZtKernelObjectData *object, std::vector<ZtMeasuredValue> *values) const;
 
     /** Place of a value in getValueNames(), the first one for a name that comes twice; -1 for an unknown
      * name. */
@@ -36,6 +50,9 @@ protected:
     ZtMeasuringManipulator(int typeId, const QStringList &valueNames);
     void setObjectTypeId(int typeId) { m_typeId = typeId; }
     void changeValueNames(const QStringList &valueNames);
+    /** Appends all values that the object has, in the order of their names. */
+    virtual void appendValues(const ZtMeasuredObjectData &object,
+                              std::vector<ZtMeasuredValue> *values) const = 0;
 
 private:
     int m_typeId;

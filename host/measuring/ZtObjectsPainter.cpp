@@ -50,7 +50,8 @@ ZtLabelRequest request(const ZtDrawnManipulator &manipulator, const QPolygonF &p
 void ZtObjectsPainter::drawShape(QPainter *painter, const Object &object)
 {
     if (const ZtDrawnManipulator *const manipulator = manipulatorOf(object.first))
-        manipulator->drawShape(painter, ZtKernelData::getInstance()->object(object.first, object.second));
+        manipulator->drawShape(painter, object.second,
+                               ZtKernelData::getInstance()->object(object.first, object.second));
 }
 
 void ZtObjectsPainter::drawObjects(QPainter *painter, const QList<int> &types) const

@@ -11,6 +11,8 @@
 #include "KvDeskTypedPixelSize.h"
 #include "kernel/ZtAppSettings.h"
 
+#include <QHeaderView>
+
 namespace {
 
 using Dialog = KvDeskCalibrationDialog;
@@ -176,12 +178,16 @@ void KvDeskCalibrationDialogTest::showsTheHistoryOfTheObjective()
         calibration.setObjective(size < 3.0 ? QStringLiteral("5x") : QStringLiteral("50x"));
         desk.calibrator.calibrate(calibration);
     }
-    const Dialog dialog(&desk.calibrator);
+    Dialog dialog(&desk.calibrator);
+    dialog.show();
     QCOMPARE(dialog.history()->rowCount(), 1);
     dialog.objectiveBox()->setCurrentIndex(0);
     QCOMPARE(dialog.objective(), QStringLiteral("5x"));
     QCOMPARE(dialog.history()->rowCount(), 2);
     QCOMPARE(dialog.history()->calibration(0).micrometresPerPixel(), 2.0);
+    // The columns fill the table.
+    const auto *const table = dialog.findChild<KvDeskTableView *>();
+    QTRY_COMPARE(table->horizontalHeader()->length(), table->viewport()->width());
     QVERIFY(dialog.useAgainButton()->isEnabled());
     // Looking at it changes nothing.
     QCOMPARE(desk.document.calibration().objective(), QStringLiteral("50x"));

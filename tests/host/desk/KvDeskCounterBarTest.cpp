@@ -6,6 +6,7 @@
 #include "KvDeskCounterTool.h"
 #include "KvDeskResources.h"
 #include "KvDeskToolBox.h"
+#include "measuring/ZtDrawnObjectPainter.h"
 #include "measuring/ZtMeasuringManipulator.h"
 
 #include <QAction>
@@ -25,6 +26,7 @@ private slots:
     void isThereWhileTheUserCounts();
     void offersAFirstCounter();
     void classesHaveCountAndShare();
+    void classesHaveTheColoursOfTheirMarkers();
     void sharesFollowTheClicks();
     void namesAreThoseOfTheCounters();
     void chosenClassGetsTheClicks();
@@ -111,6 +113,22 @@ void KvDeskCounterBarTest::classesHaveCountAndShare()
     QCOMPARE(texts(), QStringList({QStringLiteral("Counter 1 3 pcs 75.000 %"),
                                    QStringLiteral("Counter 2 1 pcs 25.000 %"),
                                    QStringLiteral("Counter 3 0 pcs 0.000 %")}));
+}
+
+void KvDeskCounterBarTest::classesHaveTheColoursOfTheirMarkers()
+{
+    for (int i = 0; i < 12; ++i)
+        counter(1);
+    const auto colour = [this](int item) {
+        return m_bar->classes()->itemIcon(item).pixmap(16, 16).toImage().pixelColor(8, 8);
+    };
+    QCOMPARE(texts().size(), 12);
+    for (int i = 0; i < 12; ++i)
+        QCOMPARE(colour(i), ZtDrawnObjectPainter::counterColor(i + 1));
+    // A class keeps its colour when another one goes.
+    m_desk->editor.remove({{ZtDrawnType::Counter, 1}});
+    QCOMPARE(texts().size(), 11);
+    QCOMPARE(colour(0), ZtDrawnObjectPainter::counterColor(2));
 }
 
 void KvDeskCounterBarTest::sharesFollowTheClicks()

@@ -4,6 +4,7 @@
 #include "KvDeskObjectShape.h"
 #include "host/measuring/Polygon.h"
 #include "kernel/ZtKernelData.h"
+#include "measuring/ZtDrawnObjectPainter.h"
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "support/StatReportTest.h"
@@ -54,6 +55,7 @@ private slots:
     void isSeenOnAnyPicture_data();
     void isSeenOnAnyPicture();
     void leavesThePainterAlone();
+    void countersHaveTheirColours();
 
 private:
     QVector<QLineF> lines(int type, const QPolygonF &points, const QTransform &toView)
@@ -194,6 +196,29 @@ void KvDeskRoughObjectsTest::leavesThePainterAlone()
     QCOMPARE(painter.worldTransform(), QTransform::fromScale(2.0, 2.0));
     QVERIFY(painter.testRenderHint(QPainter::Antialiasing));
     QCOMPARE(painter.pen(), QPen());
+}
+
+void KvDeskRoughObjectsTest::countersHaveTheirColours()
+{
+    m_document.clear();
+    KvDeskRoughObjects objects{QTransform()};
+    QImage image(80, 40, QImage::Format_RGB32);
+    for (int round = 0; round < 2; ++round) {
+        objects.restart(QTransform());
+        image.fill(Qt::gray);
+        for (int id = 1; id <= 3; ++id) {
+            const QPointF place(20 * id, 20);
+            if (round == 0)
+                QCOMPARE(m_document.addObject(ZtDrawnType::Counter, polygon({place})), id);
+            objects.add({ZtDrawnType::Counter, id}, QRectF(place, place));
+        }
+        QPainter painter(&image);
+        objects.draw(&painter);
+        painter.end();
+        for (int id = 1; id <= 3; ++id)
+            QCOMPARE(image.pixelColor(20 * id, 20), ZtDrawnObjectPainter::counterColor(id));
+        QCOMPARE(objects.lines().size(), 6);
+    }
 }
 
 STATREPORT_TEST_MAIN(KvDeskRoughObjectsTest)

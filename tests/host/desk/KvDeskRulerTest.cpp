@@ -17,6 +17,9 @@ private slots:
     void units_data();
     void units();
     void isDrawn();
+    void labelsAreWhole_data();
+    void labelsAreWhole();
+    void topmostLabelIsWhole();
 };
 
 void KvDeskRulerTest::ticksAreRound_data()
@@ -97,6 +100,56 @@ void KvDeskRulerTest::isDrawn()
         ruler.setPointer(std::nullopt);
         QVERIFY(grab() == plain);
     }
+}
+
+void KvDeskRulerTest::labelsAreWhole_data()
+{
+    QTest::addColumn<double>("width");
+    QTest::addColumn<double>("room");
+    QTest::addColumn<double>("distance");
+    QTest::addColumn<bool>("isDrawn");
+    QTest::addColumn<bool>("isBehind");
+    QTest::newRow("room behind") << 20.0 << 100.0 << 64.0 << true << true;
+    QTest::newRow("just room behind") << 20.0 << 23.0 << 64.0 << true << true;
+    QTest::newRow("cut off behind") << 20.0 << 22.0 << 64.0 << true << false;
+    QTest::newRow("at the end") << 20.0 << 0.0 << 64.0 << true << false;
+    QTest::newRow("another label before") << 40.0 << 10.0 << 64.0 << false << false;
+}
+
+void KvDeskRulerTest::labelsAreWhole()
+{
+    QFETCH(double, width);
+    QFETCH(double, room);
+    QFETCH(double, distance);
+    QFETCH(bool, isBehind);
+    const std::optional<double> start = KvDeskRuler::textStart(width, room, distance);
+    QTEST(start.has_value(), "isDrawn");
+    if (!start)
+        return;
+    QCOMPARE(*start > 0.0, isBehind);
+    QVERIFY(isBehind ? *start + width <= room : *start + width < 0.0);
+    QVERIFY(isBehind || *start - width > -distance);
+}
+
+// The text of a mark at the very top lies below it instead of outside.
+void KvDeskRulerTest::topmostLabelIsWhole()
+{
+    KvDeskRuler ruler(Qt::Vertical);
+    ruler.resize(KvDeskRuler::thickness, 300);
+    const auto textColumns = [&ruler](int from, int to) {
+        const QImage image = ruler.grab().toImage();
+        const QColor ground = image.pixelColor(1, 60);
+        int count = 0;
+        for (int y = from; y < to; ++y) {
+            for (int x = 1; x < KvDeskRuler::thickness / 2; ++x)
+                count += image.pixelColor(x, y) != ground ? 1 : 0;
+        }
+        return count;
+    };
+    ruler.setScale(1.0, 1.0, 0.0);
+    QVERIFY(textColumns(2, 14) > 0);
+    ruler.setScale(40.0, 1.0, 0.0);
+    QVERIFY(textColumns(26, 38) > 0);
 }
 
 STATREPORT_TEST_MAIN(KvDeskRulerTest)

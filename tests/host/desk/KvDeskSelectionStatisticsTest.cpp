@@ -76,7 +76,7 @@ void KvDeskSelectionStatisticsTest::texts_data()
         "n = 2, mean 20.000 μm, SD 14.142 μm, min 10.000 μm, max 30.000 μm");
     row("mixed kinds", {lengths({10, 30}), group(QStringLiteral("Area"), M::Area, {5, 7})},
         "Length: n = 2, mean 20.000 μm, SD 14.142 μm, min 10.000 μm, max 30.000 μm");
-    row("mixed kinds, first of two names",
+    row("mixed kinds, two names of one",
         {group(QStringLiteral("Width"), M::Length, {10}), lengths({20}),
          group(QStringLiteral("Area"), M::Area, {5})},
         "Width: 10.000 μm");
@@ -95,6 +95,16 @@ void KvDeskSelectionStatisticsTest::texts_data()
     row("same name in two units",
         {group(QStringLiteral("Length"), M::NoKind, {1}, QStringLiteral("px")), lengths({2})},
         "Length: 1.000 px");
+    row("same values", {lengths({20000, 20000})},
+        "n = 2, mean 2.000 cm, SD 0.000 cm, min 2.000 cm, max 2.000 cm");
+    row("values that hardly differ", {lengths({20000, 20001})},
+        "n = 2, mean 2.000 cm, SD 0.0000707 cm, min 2.000 cm, max 2.000 cm");
+    row("smallest and largest far apart", {lengths({0.4, 20, 3000})},
+        "n = 3, mean 1.007 mm, SD 1.726 mm, min 0.000400 mm, max 3.000 mm");
+    row("both signs", {lengths({-3000, 3000})},
+        "n = 2, mean 0.000 mm, SD 4.243 mm, min -3.000 mm, max 3.000 mm");
+    row("areas", {group(QStringLiteral("Area"), M::Area, {4e6, 9e6})},
+        "n = 2, mean 6.500 mm², SD 3.536 mm², min 4.000 mm², max 9.000 mm²");
     row("no number", {lengths({nan, nan})}, "");
     row("some numbers", {lengths({nan, 10, 20})},
         "n = 2, mean 15.000 μm, SD 7.071 μm, min 10.000 μm, max 20.000 μm");
@@ -125,7 +135,7 @@ void KvDeskSelectionStatisticsTest::details()
     KvDeskSelectionStatistics statistics;
     statistics.add(lengths({1, 2}));
     QCOMPARE(statistics.details(),
-             QString::fromUtf8("Selected values: 2\nMean: 1.50000000 μm\nStandard deviation: 707.106781 nm\n"
+             QString::fromUtf8("Selected values: 2\nMean: 1.50000000 μm\nStandard deviation: 0.707106781 μm\n"
                                "Smallest: 1.00000000 μm\nLargest: 2.00000000 μm"));
     QVERIFY(!statistics.isMixed());
 }
@@ -139,8 +149,8 @@ void KvDeskSelectionStatisticsTest::detailsOfAMixture()
     QCOMPARE(statistics.count(), 3);
     QCOMPARE(statistics.numbers().count(), 1);
     QCOMPARE(statistics.details(),
-             QString::fromUtf8("Selected values: 3\n\"Length\" among them: 1\nMean: 1.00000000 μm\n"
-                               "Smallest: 1.00000000 μm\nLargest: 1.00000000 μm"));
+             QString::fromUtf8("Selected values: 3\nLength: 1.000 μm\n"
+                               "Area: n = 2, mean 6.000 μm², SD 1.414 μm², min 5.000 μm², max 7.000 μm²"));
 }
 
 STATREPORT_TEST_MAIN(KvDeskSelectionStatisticsTest)

@@ -14,6 +14,9 @@
 #include <QAbstractItemModelTester>
 #include <QRandomGenerator>
 
+#include <algorithm>
+#include <numeric>
+
 namespace {
 
 QPolygonF ofLength(double length)
@@ -44,6 +47,8 @@ class KvDeskValueSortModelTest : public StatReportTest
 private slots:
     void sorts_data();
     void sorts();
+    void sortsManyRows_data();
+    void sortsManyRows();
     void filters_data();
     void filters();
     void unsortedIsTheOrderOfTheSource();
@@ -95,6 +100,49 @@ void KvDeskValueSortModelTest::sorts()
     KvDeskValueSortModel model(&source);
     model.sort(column, order);
     QCOMPARE(KvDeskValueSortModelTest::column(model, column), expected);
+}
+
+void KvDeskValueSortModelTest::sortsManyRows_data()
+{
+    QTest::addColumn<int>("column");
+    QTest::addColumn<Qt::SortOrder>("order");
+    for (int column = 0; column < KvDeskValueTableModel::ColumnCount; ++column) {
+        QTest::addRow("column %d, ascending", column) << column << Qt::AscendingOrder;
+        QTest::addRow("column %d, descending", column) << column << Qt::DescendingOrder;
+    }
+}
+
+// As comparing rows one by one sorts them; those that are alike stay in the order of the source.
+void KvDeskValueSortModelTest::sortsManyRows()
+{
+    QFETCH(int, column);
+    QFETCH(Qt::SortOrder, order);
+    ZtMeasuringDocument document;
+    QRandomGenerator random(3);
+    for (int i = 0; i < 200; ++i) {
+        const int type = i % 2 == 0 ? ZtDrawnType::Line : ZtDrawnType::Rectangle;
+        const double size = random.bounded(1, 20);
+        document.addObject(type, polygon({QPointF(0, 0), QPointF(size, 4)}),
+                           QString::number(random.bounded(40)));
+    }
+    KvDeskValueTableModel source;
+    KvDeskValueSortModel model(&source);
+    model.sort(column, order);
+    const auto compare = [&](int a, int b) {
+        if (column != KvDeskValueTableModel::ValueColumn)
+            return source.compareTexts(a, b, column);
+        const double left = source.row(a).value;
+        const double right = source.row(b).value;
+        return left < right ? -1 : left > right ? 1 : 0;
+    };
+    const auto isBefore = [&](int a, int b) {
+        return order == Qt::AscendingOrder ? compare(a, b) < 0 : compare(b, a) < 0;
+    };
+    std::vector<int> expected(static_cast<std::size_t>(source.rowCount()));
+    std::iota(expected.begin(), expected.end(), 0);
+    std::stable_sort(expected.begin(), expected.end(), isBefore);
+    for (int row = 0; row < model.rowCount(); ++row)
+        QCOMPARE(model.sourceRow(row), expected[static_cast<std::size_t>(row)]);
 }
 
 void KvDeskValueSortModelTest::filters_data()

@@ -2,6 +2,7 @@
 #include "KvDeskValueTableModel.h"
 
 #include "DeskFiles.h"
+#include "KvDeskTableView.h"
 #include "host/measuring/Polygon.h"
 #include "kernel/ZtAppSettings.h"
 #include "kernel/ZtKernelData.h"
@@ -59,6 +60,8 @@ private slots:
     void rowsOfAnObject();
     void rowOfAValue();
     void tenThousandRows();
+    void importedDigitsAreShortened();
+    void gapsAndUnitsOfATable();
 
 private:
     static void change(int type, int id, const QPolygonF &points);
@@ -463,6 +466,40 @@ void KvDeskValueTableModelTest::tenThousandRows()
     QCOMPARE(model.rowCount(), 10000);
     QCOMPARE(model.text(9999, KvDeskValueTableModel::ObjectColumn), QStringLiteral("Bolt 9999"));
     QCOMPARE(model.row(9999).value, 9999500.0);
+}
+
+void KvDeskValueTableModelTest::importedDigitsAreShortened()
+{
+    const QByteArray table(
+        "Object,Length [mm],Mass [g],Cells [pcs]\nA,1.23456789,0.00000123456,12\nB,5,0,1\n");
+    QVERIFY(m_document->importTable(DeskFiles::text(QStringLiteral("digits.csv"), table),
+                                    ZtTableImportOptions(), &m_fault));
+    const KvDeskValueTableModel model;
+    const QStringList shown{QStringLiteral("1.235 mm"), QStringLiteral("0.00000123 g"),
+                            QStringLiteral("12 pcs"),   QStringLiteral("5 mm"),
+                            QStringLiteral("0 g"),      QStringLiteral("1 pcs")};
+    for (int row = 0; row < shown.size(); ++row)
+        QCOMPARE(model.text(row, KvDeskValueTableModel::ValueColumn), shown.at(row));
+    const QModelIndex length = model.index(0, KvDeskValueTableModel::ValueColumn);
+    QCOMPARE(length.data(KvDeskTableView::CopyRole).toString(), QStringLiteral("1.23456789 mm"));
+    QVERIFY(!model.index(0, 0).data(KvDeskTableView::CopyRole).isValid());
+    QCOMPARE(model.row(0).value, 1234.56789);
+}
+
+void KvDeskValueTableModelTest::gapsAndUnitsOfATable()
+{
+    const QByteArray table("Object,Length [mm],Area [mm2],Mass [g]\nA,1,,3\nB,,,\nC,,2,\n");
+    QVERIFY(m_document->importTable(DeskFiles::text(QStringLiteral("gaps.csv"), table),
+                                    ZtTableImportOptions(), &m_fault));
+    const KvDeskValueTableModel model;
+    QCOMPARE(model.rowCount(), 3);
+    const int positions[] = {0, 2, 1};
+    const int kinds[] = {ZtGsManipulator::Length, ZtGsManipulator::NoKind, ZtGsManipulator::Area};
+    for (int row = 0; row < 3; ++row) {
+        QCOMPARE(model.row(row).position, positions[row]);
+        QCOMPARE(model.row(row).kind, kinds[row]);
+    }
+    QCOMPARE(model.row(2).value, 2e6);
 }
 
 STATREPORT_TEST_MAIN(KvDeskValueTableModelTest)

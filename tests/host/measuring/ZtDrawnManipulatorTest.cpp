@@ -16,6 +16,7 @@
 #include <QImage>
 #include <QPainter>
 
+#include <algorithm>
 #include <cmath>
 #include <functional>
 #include <limits>
@@ -306,6 +307,12 @@ void ZtDrawnManipulatorTest::measures()
     QVERIFY2(std::abs(result.toDouble() - expected) <= 1e-9 * qMax(1.0, expected),
              qPrintable(result.toString()));
     QTEST(measured.manipulator.valueText(value, &object), "text");
+    std::vector<ZtMeasuredValue> all;
+    measured.manipulator.appendShownValues(&object, &all);
+    const int position = measured.manipulator.position(value);
+    QVERIFY(std::any_of(all.begin(), all.end(), [&](const ZtMeasuredValue &one) {
+        return one.position == position && one.kind == kind && one.value == result.toDouble();
+    }));
 }
 
 void ZtDrawnManipulatorTest::followsTheCalibration()

@@ -76,6 +76,7 @@ private slots:
     void followsTheSettings();
     void answersNothingForMissingCells();
     void hidesValues();
+    void allValuesAreThoseByName();
     void sharesItsTexts();
     void isFast();
 
@@ -185,6 +186,32 @@ void ZtImportedManipulatorTest::hidesValues()
     QVERIFY(!hiding.isValueShown(*first, 1));
     hiding.setValueShown(first, 1, true);
     QCOMPARE(hiding.valueSet(1), hiding.getValueNames());
+}
+
+void ZtImportedManipulatorTest::allValuesAreThoseByName()
+{
+    m_types = import("type,Length [cm],Cells [pcs],Mass [g]\nLeaf,5.10,12,\nLeaf,,1,3\nLeaf,7,8,9\n");
+    ZtImportedManipulator *const asked = manipulator(m_types.value(0));
+    for (int id = 1; id <= 3; ++id) {
+        std::vector<ZtMeasuredValue> values;
+        asked->appendShownValues(object(m_types.value(0), id), &values);
+        QCOMPARE(values.size(), id == 3 ? std::size_t(3) : std::size_t(2));
+        for (const ZtMeasuredValue &value : values) {
+            int kind = 0;
+            const QString name = asked->getValueNames().at(value.position);
+            QCOMPARE(value.value, asked->value(name, object(m_types.value(0), id), kind).toDouble());
+            QCOMPARE(value.kind, kind);
+        }
+    }
+    auto *const third =
+        static_cast<ZtImportedObjectData *>(ZtKernelData::getInstance()->object(m_types.value(0), 3));
+    asked->setValueShown(third, 1, false);
+    std::vector<ZtMeasuredValue> values;
+    asked->appendShownValues(third, &values);
+    QCOMPARE(values.size(), std::size_t(2));
+    QCOMPARE(values.back().position, 2);
+    asked->appendShownValues(nullptr, &values);
+    QCOMPARE(values.size(), std::size_t(2));
 }
 
 void ZtImportedManipulatorTest::sharesItsTexts()

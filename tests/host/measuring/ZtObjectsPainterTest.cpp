@@ -37,6 +37,8 @@ private slots:
     void objectsThatAreGoneHaveNone();
     void drawsTheTypesThatAreAskedFor();
     void drawsEveryObjectHoweverMany();
+    void countersHaveTheirColours();
+    void counterColoursDiffer();
     void scaleBarNeedsACalibration();
     void scaleBarBelongsToAllTypes();
 
@@ -220,6 +222,38 @@ void ZtObjectsPainterTest::drawsEveryObjectHoweverMany()
         QVERIFY(qRed(image.pixel(middle)) > 150);
         // Three pixels of halo above, softer than a hard line.
         QVERIFY(qAlpha(image.pixel(middle - QPoint(0, 2))) > 0);
+    }
+}
+
+void ZtObjectsPainterTest::countersHaveTheirColours()
+{
+    m_document.objectsPainter()->setLabelsShown(false);
+    for (int id = 1; id <= 4; ++id)
+        QCOMPARE(add(ZtDrawnType::Counter, polygon({{50.5 * id, 50.5}})).second, id);
+    const QImage image = drawn(*m_document.objectsPainter());
+    for (int id = 1; id <= 4; ++id) {
+        const QColor found = image.pixelColor(static_cast<int>(50.5 * id), 50);
+        const QColor expected = ZtDrawnObjectPainter::counterColor(id);
+        QVERIFY(qAbs(found.red() - expected.red()) < 40 && qAbs(found.green() - expected.green()) < 40 &&
+                qAbs(found.blue() - expected.blue()) < 40);
+    }
+}
+
+void ZtObjectsPainterTest::counterColoursDiffer()
+{
+    const QVector<QColor> &colors = ZtDrawnObjectPainter::counterColors();
+    QVERIFY(colors.size() >= 8);
+    QCOMPARE(colors.first(), ZtDrawnObjectPainter::lineColor());
+    QCOMPARE(ZtDrawnObjectPainter::counterColor(colors.size() + 1), colors.first());
+    QCOMPARE(ZtDrawnObjectPainter::counterColor(0), colors.first());
+    for (int i = 0; i < colors.size(); ++i) {
+        // Seen on the dark line below it, and so on any image.
+        QVERIFY(qGray(colors.at(i).rgb()) - qGray(ZtDrawnObjectPainter::haloColor().rgb()) >= 100);
+        for (int other = 0; other < i; ++other) {
+            const QColor &a = colors.at(i);
+            const QColor &b = colors.at(other);
+            QVERIFY(qAbs(a.red() - b.red()) + qAbs(a.green() - b.green()) + qAbs(a.blue() - b.blue()) >= 120);
+        }
     }
 }
 
