@@ -130,11 +130,7 @@ constexpr Definition definitions[] = {
 
 QString toolTip(const Definition &definition, const QAction &action)
 {
-    const QString name = KvDeskActions::tr(definition.toolTip);
-    const QString keys = action.shortcut().toString(QKeySequence::NativeText);
-    return keys.isEmpty()
-               ? name
-               : KvDeskActions::tr("%1 (%2)", "command (shortcut)").arg(name, ZtLeftToRight::isolated(keys));
+    return KvDeskActions::withShortcut(KvDeskActions::tr(definition.toolTip), action.shortcut());
 }
 
 QAction *createAction(const Definition &definition, QObject *parent)
@@ -160,6 +156,13 @@ KvDeskActions::KvDeskActions(QObject *parent)
     action(Quit)->setMenuRole(QAction::QuitRole);
     action(Settings)->setMenuRole(QAction::PreferencesRole);
     action(About)->setMenuRole(QAction::AboutRole);
+}
+
+QString KvDeskActions::withShortcut(const QString &name, const QKeySequence &shortcut)
+{
+    const QString keys = shortcut.toString(QKeySequence::NativeText);
+    return keys.isEmpty() ? name
+                          : tr("%1 (%2)", "command (shortcut)").arg(name, ZtLeftToRight::isolated(keys));
 }
 
 QString KvDeskActions::toolTip(Id id) const

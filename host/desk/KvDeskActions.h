@@ -5,6 +5,7 @@
 #include <QString>
 
 class QAction;
+class QKeySequence;
 
 /** The commands of the program, with texts, icons and shortcuts. Tool tips name the shortcut. */
 class KvDeskActions : public QObject
@@ -62,6 +63,9 @@ public:
         About,
         Count
     };
+
+    /** The tool tip of a command with a shortcut. */
+    static QString withShortcut(const QString &name, const QKeySequence &shortcut);
 
     explicit KvDeskActions(QObject *parent = nullptr);
 

@@ -35,15 +35,9 @@ const char geometryKey[] = "geometry";
 const char splitterKey[] = "splitter";
 const char zoomKey[] = "zoom";
 
-QString tipOf(const QString &name, const QKeySequence &key)
-{
-    return KvDeskActions::tr("%1 (%2)", "command (shortcut)")
-        .arg(name, key.toString(QKeySequence::NativeText));
-}
-
 void setPossible(QAction *action, bool isPossible, const QString &reason)
 {
-    const QString name = tipOf(action->text(), action->shortcut());
+    const QString name = KvDeskActions::withShortcut(action->text(), action->shortcut());
     action->setEnabled(isPossible);
     action->setToolTip(isPossible ? name : name + QLatin1Char('\n') + reason);
 }
@@ -100,7 +94,7 @@ QAction *KvDeskGuideWindow::addTo(QToolBar *bar, const char *icon, const QString
     const QString path = QStringLiteral("Icons/") + QLatin1String(icon);
     QAction *const action = bar->addAction(acss::createIcon(toolIconStyle, path, toolIconSize), name);
     action->setShortcuts(keys);
-    action->setToolTip(tipOf(name, keys.first()));
+    action->setToolTip(KvDeskActions::withShortcut(name, keys.first()));
     return action;
 }
 
@@ -131,7 +125,7 @@ void KvDeskGuideWindow::createFind(QToolBar *bar)
     m_findField->setFixedWidth(findWidth);
     m_findField->setPlaceholderText(tr("Find in the guide"));
     m_findField->setAccessibleName(m_findField->placeholderText());
-    m_findField->setToolTip(tipOf(m_findField->placeholderText(), QKeySequence::Find));
+    m_findField->setToolTip(KvDeskActions::withShortcut(m_findField->placeholderText(), QKeySequence::Find));
     m_findField->setClearButtonEnabled(true);
     bar->addWidget(m_findField);
     m_findPrevious = addTo(bar, "previous", tr("Find previous"),

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskValueTable.h"
 
+#include "KvDeskActions.h"
 #include "KvDeskEmptyState.h"
 #include "KvDeskObjectEditor.h"
 #include "KvDeskPanelHeader.h"
@@ -80,7 +81,8 @@ void KvDeskValueTable::createFilter()
     m_filter = new QLineEdit(this);
     m_filter->setPlaceholderText(tr("Filter by type, object or value name"));
     m_filter->setAccessibleName(tr("Filter of the measured values"));
-    m_filter->setToolTip(tr("Shows only rows that have all of these words (Ctrl+F)"));
+    m_filter->setToolTip(
+        KvDeskActions::withShortcut(tr("Shows only rows that have all of these words"), QKeySequence::Find));
     m_filter->setClearButtonEnabled(true);
     // Files that are dropped on it are for the window.
     m_filter->setAcceptDrops(false);

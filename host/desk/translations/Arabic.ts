@@ -1956,8 +1956,8 @@ Reported by %2</source>
         <translation>تصفية القيم المقيسة</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>لا يُظهر إلا الصفوف التي تحوي كل هذه الكلمات (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>لا يُظهر إلا الصفوف التي تحوي كل هذه الكلمات</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

@@ -1941,8 +1941,8 @@ Reported by %2</source>
         <translation>测量值筛选</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>仅显示包含所有这些词的行 (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>仅显示包含所有这些词的行</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

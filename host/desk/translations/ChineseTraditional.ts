@@ -1941,8 +1941,8 @@ Reported by %2</source>
         <translation>量測值篩選</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>僅顯示包含所有這些字詞的列 (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>僅顯示包含所有這些字詞的列</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

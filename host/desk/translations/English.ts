@@ -1944,8 +1944,8 @@ Reported by %2</translation>
         <translation>Filter of the measured values</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>Shows only rows that have all of these words (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>Shows only rows that have all of these words</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

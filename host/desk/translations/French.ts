@@ -1944,8 +1944,8 @@ Signalé par %2</translation>
         <translation>Filtre des valeurs mesurées</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>N’affiche que les lignes qui contiennent tous ces mots (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>N’affiche que les lignes qui contiennent tous ces mots</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

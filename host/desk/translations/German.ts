@@ -1944,8 +1944,8 @@ Gemeldet von %2</translation>
         <translation>Filter der Messwerte</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>Zeigt nur Zeilen, die alle diese Wörter enthalten (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>Zeigt nur Zeilen, die alle diese Wörter enthalten</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

@@ -1944,8 +1944,8 @@ Segnalato da %2</translation>
         <translation>Filtro dei valori misurati</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>Mostra solo le righe che contengono tutte queste parole (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>Mostra solo le righe che contengono tutte queste parole</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

@@ -1941,8 +1941,8 @@ Reported by %2</source>
         <translation>測定値のフィルター</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>入力した語をすべて含む行のみを表示します (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>入力した語をすべて含む行のみを表示します</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

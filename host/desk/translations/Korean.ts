@@ -1941,8 +1941,8 @@ Reported by %2</source>
         <translation>측정값 필터</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>입력한 단어가 모두 들어 있는 행만 표시합니다(Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>입력한 단어가 모두 들어 있는 행만 표시합니다</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

@@ -1947,8 +1947,8 @@ Reported by %2</source>
         <translation>Фильтр измеренных значений</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>Показывает только строки, содержащие все эти слова (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>Показывает только строки, содержащие все эти слова</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

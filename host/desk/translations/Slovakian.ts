@@ -1947,8 +1947,8 @@ Ohlásil: %2</translation>
         <translation>Filter nameraných hodnôt</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>Zobrazí iba riadky, ktoré obsahujú všetky tieto slová (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>Zobrazí iba riadky, ktoré obsahujú všetky tieto slová</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>

@@ -1944,8 +1944,8 @@ Notificado por %2</translation>
         <translation>Filtro de los valores medidos</translation>
     </message>
     <message>
-        <source>Shows only rows that have all of these words (Ctrl+F)</source>
-        <translation>Muestra solo las filas que contienen todas estas palabras (Ctrl+F)</translation>
+        <source>Shows only rows that have all of these words</source>
+        <translation>Muestra solo las filas que contienen todas estas palabras</translation>
     </message>
     <message>
         <source>No measured value matches the filter</source>
