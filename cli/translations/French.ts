@@ -79,7 +79,7 @@
     </message>
     <message>
         <source>Exit codes: 0 done, 1 the work failed, 2 wrong usage.</source>
-        <translation>Codes de retour : 0 terminé, 1 échec, 2 utilisation incorrecte.</translation>
+        <translation>Codes de retour&#xa0;: 0 terminé, 1 échec, 2 utilisation incorrecte.</translation>
     </message>
     <message>
         <source>Shows this text.</source>
@@ -175,7 +175,7 @@
     </message>
     <message>
         <source>the file to write is missing: -o OUT.pdf</source>
-        <translation>fichier à écrire manquant : -o OUT.pdf</translation>
+        <translation>fichier à écrire manquant&#xa0;: -o OUT.pdf</translation>
     </message>
     <message>
         <source>only one file can be read from standard input</source>
@@ -187,7 +187,7 @@
     </message>
     <message>
         <source>a command is missing: render, stats, check or blocks</source>
-        <translation>commande manquante : render, stats, check ou blocks</translation>
+        <translation>commande manquante&#xa0;: render, stats, check ou blocks</translation>
     </message>
     <message>
         <source>unknown command &quot;%1&quot;; it must be render, stats, check or blocks</source>
@@ -195,7 +195,7 @@
     </message>
     <message>
         <source>%1 (statreport --help tells more)</source>
-        <translation>%1 (aide : statreport --help)</translation>
+        <translation>%1 (aide&#xa0;: statreport --help)</translation>
     </message>
 </context>
 <context>
@@ -339,7 +339,7 @@
     </message>
     <message>
         <source>page width %1 px</source>
-        <translation>largeur de page %1 px</translation>
+        <translation>largeur de page %1&#xa0;px</translation>
     </message>
     <message>
         <source>is no fraction of the page width from 0 to 0.5</source>

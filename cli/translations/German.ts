@@ -339,7 +339,7 @@
     </message>
     <message>
         <source>page width %1 px</source>
-        <translation>Seitenbreite %1 px</translation>
+        <translation>Seitenbreite %1&#xa0;px</translation>
     </message>
     <message>
         <source>is no fraction of the page width from 0 to 0.5</source>

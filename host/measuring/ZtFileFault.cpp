@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtFileFault.h"
 
-#include <QFileDevice>
+#include <QFile>
 #include <QFileInfo>
 
 #include <cerrno>
@@ -36,7 +36,7 @@ int errorNumberOf(QFileDevice::FileError error)
 bool saysNothing(const QFileDevice &file)
 {
     const QString text = file.errorString();
-    return text.isEmpty() || text == QCoreApplication::translate("QIODevice", "Unknown error");
+    return text.isEmpty() || text == QFile().errorString(); // what Qt says where nothing is known
 }
 
 } // namespace

@@ -384,6 +384,14 @@
         <source>Show the first steps, the examples and the recent sessions</source>
         <translation>إظهار الخطوات الأولى والأمثلة والجلسات الأخيرة</translation>
     </message>
+    <message>
+        <source>&amp;User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read the user guide</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -563,6 +571,11 @@
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
         <translation>يذكر %1 أن حجم البكسل %2؛ وتقيس الجلسة بالبكسل</translation>
+    </message>
+    <message>
+        <source>Calibrated: %1, %2 per pixel</source>
+        <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -745,10 +758,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>الأرقام</translation>
     </message>
     <message>
-        <source>Only the selected objects (%1)</source>
-        <translation>الكائنات المحددة فقط (%1)</translation>
-    </message>
-    <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
         <translation>علامة ترتيب البايتات (BOM)، لبرامج الجداول التي لا تتوقع UTF-8</translation>
     </message>
@@ -809,6 +818,17 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Concerns CSV tables only</source>
         <translation>يخص جداول CSV فقط</translation>
     </message>
+    <message numerus="yes">
+        <source>Only the selected object(s) (%n)</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
@@ -849,10 +869,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>لم تُفتح الجلسة «%1».</translation>
     </message>
     <message>
-        <source>Session opened: %1 (objects: %2)</source>
-        <translation>فُتحت الجلسة: %1 (الكائنات: %2)</translation>
-    </message>
-    <message>
         <source>Image missing</source>
         <translation>الصورة مفقودة</translation>
     </message>
@@ -876,10 +892,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>%1: %2</source>
         <comment>file, remark</comment>
         <translation>%1: %2</translation>
-    </message>
-    <message>
-        <source>Table imported: %1 (objects: %2)</source>
-        <translation>استُورد الجدول: %1 (الكائنات: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
@@ -942,10 +954,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>جارٍ استعادة القياسات</translation>
     </message>
     <message>
-        <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>استُعيدت القياسات: %1 (الكائنات: %2)</translation>
-    </message>
-    <message>
         <source>Importing &quot;%1&quot;</source>
         <translation>جارٍ استيراد «%1»</translation>
     </message>
@@ -979,6 +987,39 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
             <numerusform>لم تُفتح %n ملفات.</numerusform>
             <numerusform>لم يُفتح %n ملفًا.</numerusform>
             <numerusform>لم يُفتح %n ملف.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Session opened: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Measurements restored: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Table imported: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
         </translation>
     </message>
 </context>
@@ -1077,10 +1118,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>هل تريد نقل «%1» إلى سلة المهملات؟</translation>
     </message>
     <message>
-        <source>Move the selected images (%1) to the trash?</source>
-        <translation>هل تريد نقل الصور المحددة (%1) إلى سلة المهملات؟</translation>
-    </message>
-    <message>
         <source>Move to trash</source>
         <translation>نقل إلى سلة المهملات</translation>
     </message>
@@ -1100,6 +1137,17 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
         <translation>ما زالت الملفات موجودة. إما أنها محمية من الكتابة أو لا توجد سلة مهملات لها.</translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n selected image(s) to the trash?</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskGalleryModel</name>
@@ -1114,6 +1162,56 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>Gallery</source>
         <translation>المعرض</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideCommand</name>
+    <message>
+        <source>The user guide is not installed</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideWindow</name>
+    <message>
+        <source>User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find in the guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the first place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the last place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -1443,10 +1541,17 @@ Dropped, because newer ones came first: %1</source>
         <source>Untitled session</source>
         <translation>جلسة بلا عنوان</translation>
     </message>
-    <message>
-        <source>%1 (objects: %2)</source>
+    <message numerus="yes">
+        <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1 (الكائنات: %2)</translation>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1518,10 +1623,6 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Selected values: %1</source>
         <translation>القيم المحددة: %1</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; among them: %2</source>
-        <translation>منها «%1»: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -2051,13 +2152,6 @@ Reported by %2</source>
     </message>
 </context>
 <context>
-    <name>QSaveFile</name>
-    <message>
-        <source>Filename refers to a directory</source>
-        <translation>يشير اسم الملف إلى مجلد</translation>
-    </message>
-</context>
-<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -2206,6 +2300,41 @@ Reported by %2</source>
     <message>
         <source>Diameter</source>
         <translation>القطر</translation>
+    </message>
+</context>
+<context>
+    <name>ZtFileFault</name>
+    <message>
+        <source>No such file or directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Is a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>File name too long</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No space left on device</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read-only file system</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Input/output error</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -2504,10 +2633,6 @@ Reported by %2</source>
         <translation>لا توجد قيمة %1 لإعطائها وحدة؛ القيم هي %2</translation>
     </message>
     <message>
-        <source>The first line announces %1 rows, but there are %2</source>
-        <translation>يعلن السطر الأول عن %1 من الصفوف، لكن عددها %2</translation>
-    </message>
-    <message>
         <source>The first line announces rows without values</source>
         <translation>يعلن السطر الأول عن صفوف بلا قيم</translation>
     </message>
@@ -2522,10 +2647,6 @@ Reported by %2</source>
     <message>
         <source>Value %1</source>
         <translation>القيمة %1</translation>
-    </message>
-    <message>
-        <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>عدد حقول الصف %1، لكن السطر الأول يعلن عن %2 من القيم وفئة</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
@@ -2578,6 +2699,28 @@ Reported by %2</source>
     <message>
         <source>Reading was cancelled</source>
         <translation>أُلغيت القراءة</translation>
+    </message>
+    <message numerus="yes">
+        <source>The table has %n row(s), its first line announces %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n field(s) instead of %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>

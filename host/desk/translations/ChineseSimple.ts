@@ -384,6 +384,14 @@
         <source>Show the first steps, the examples and the recent sessions</source>
         <translation>显示入门步骤、示例和最近的会话</translation>
     </message>
+    <message>
+        <source>&amp;User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read the user guide</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -563,6 +571,11 @@
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
         <translation>%1 中记录的像素尺寸为 %2；当前会话以像素为单位测量</translation>
+    </message>
+    <message>
+        <source>Calibrated: %1, %2 per pixel</source>
+        <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -745,10 +758,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>数字</translation>
     </message>
     <message>
-        <source>Only the selected objects (%1)</source>
-        <translation>仅所选对象 (%1)</translation>
-    </message>
-    <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
         <translation>字节顺序标记 (BOM)，供默认不使用 UTF-8 的电子表格软件识别</translation>
     </message>
@@ -809,6 +818,12 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Concerns CSV tables only</source>
         <translation>仅适用于 CSV 表格</translation>
     </message>
+    <message numerus="yes">
+        <source>Only the selected object(s) (%n)</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
@@ -849,10 +864,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>未能打开会话“%1”。</translation>
     </message>
     <message>
-        <source>Session opened: %1 (objects: %2)</source>
-        <translation>已打开会话：%1（对象数：%2）</translation>
-    </message>
-    <message>
         <source>Image missing</source>
         <translation>缺少图像</translation>
     </message>
@@ -876,10 +887,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>%1: %2</source>
         <comment>file, remark</comment>
         <translation>%1：%2</translation>
-    </message>
-    <message>
-        <source>Table imported: %1 (objects: %2)</source>
-        <translation>已导入表格：%1（对象数：%2）</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
@@ -942,10 +949,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>正在恢复测量数据</translation>
     </message>
     <message>
-        <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>已恢复测量数据：%1（对象数：%2）</translation>
-    </message>
-    <message>
         <source>Importing &quot;%1&quot;</source>
         <translation>正在导入“%1”</translation>
     </message>
@@ -974,6 +977,24 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <extracomment>%n is 2 at least</extracomment>
         <translation>
             <numerusform>有 %n 个文件未能打开。</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Session opened: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Measurements restored: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Table imported: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
         </translation>
     </message>
 </context>
@@ -1072,10 +1093,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>要将“%1”移到回收站吗？</translation>
     </message>
     <message>
-        <source>Move the selected images (%1) to the trash?</source>
-        <translation>要将所选图像 (%1) 移到回收站吗？</translation>
-    </message>
-    <message>
         <source>Move to trash</source>
         <translation>移到回收站</translation>
     </message>
@@ -1095,6 +1112,12 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
         <translation>文件仍在原处。文件受写保护，或者没有可用的回收站。</translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n selected image(s) to the trash?</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskGalleryModel</name>
@@ -1109,6 +1132,56 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>Gallery</source>
         <translation>图库</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideCommand</name>
+    <message>
+        <source>The user guide is not installed</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideWindow</name>
+    <message>
+        <source>User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find in the guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the first place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the last place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -1433,10 +1506,12 @@ Dropped, because newer ones came first: %1</source>
         <source>Untitled session</source>
         <translation>未命名会话</translation>
     </message>
-    <message>
-        <source>%1 (objects: %2)</source>
+    <message numerus="yes">
+        <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1（对象数：%2）</translation>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1503,10 +1578,6 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Selected values: %1</source>
         <translation>已选择 %1 个数值</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; among them: %2</source>
-        <translation>其中“%1”：%2 个</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -2036,13 +2107,6 @@ Reported by %2</source>
     </message>
 </context>
 <context>
-    <name>QSaveFile</name>
-    <message>
-        <source>Filename refers to a directory</source>
-        <translation>文件名指向的是文件夹</translation>
-    </message>
-</context>
-<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -2191,6 +2255,41 @@ Reported by %2</source>
     <message>
         <source>Diameter</source>
         <translation>直径</translation>
+    </message>
+</context>
+<context>
+    <name>ZtFileFault</name>
+    <message>
+        <source>No such file or directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Is a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>File name too long</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No space left on device</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read-only file system</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Input/output error</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -2489,10 +2588,6 @@ Reported by %2</source>
         <translation>没有可指定单位的数值 %1；现有数值为 %2</translation>
     </message>
     <message>
-        <source>The first line announces %1 rows, but there are %2</source>
-        <translation>第一行声明有 %1 行，实际有 %2 行</translation>
-    </message>
-    <message>
         <source>The first line announces rows without values</source>
         <translation>第一行声明的行不含数值</translation>
     </message>
@@ -2507,10 +2602,6 @@ Reported by %2</source>
     <message>
         <source>Value %1</source>
         <translation>数值 %1</translation>
-    </message>
-    <message>
-        <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>该行有 %1 个字段，但第一行声明有 %2 个数值和一个类别</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
@@ -2563,6 +2654,18 @@ Reported by %2</source>
     <message>
         <source>Reading was cancelled</source>
         <translation>读取已取消</translation>
+    </message>
+    <message numerus="yes">
+        <source>The table has %n row(s), its first line announces %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n field(s) instead of %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>

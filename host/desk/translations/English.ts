@@ -384,6 +384,14 @@
         <source>Show the first steps, the examples and the recent sessions</source>
         <translation>Show the first steps, the examples and the recent sessions</translation>
     </message>
+    <message>
+        <source>&amp;User guide</source>
+        <translation>&amp;User guide</translation>
+    </message>
+    <message>
+        <source>Read the user guide</source>
+        <translation>Read the user guide</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -563,6 +571,11 @@
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
         <translation>%1 states pixels of %2; the session measures in pixels</translation>
+    </message>
+    <message>
+        <source>Calibrated: %1, %2 per pixel</source>
+        <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
+        <translation>Calibrated: %1, %2 per pixel</translation>
     </message>
 </context>
 <context>
@@ -745,10 +758,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>Numbers</translation>
     </message>
     <message>
-        <source>Only the selected objects (%1)</source>
-        <translation>Only the selected objects (%1)</translation>
-    </message>
-    <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
         <translation>Byte order mark, for spreadsheets that do not expect UTF-8</translation>
     </message>
@@ -809,6 +818,13 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Concerns CSV tables only</source>
         <translation>Concerns CSV tables only</translation>
     </message>
+    <message numerus="yes">
+        <source>Only the selected object(s) (%n)</source>
+        <translation>
+            <numerusform>Only the selected object (%n)</numerusform>
+            <numerusform>Only the selected objects (%n)</numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
@@ -849,10 +865,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>The session &quot;%1&quot; was not opened.</translation>
     </message>
     <message>
-        <source>Session opened: %1 (objects: %2)</source>
-        <translation>Session opened: %1 (objects: %2)</translation>
-    </message>
-    <message>
         <source>Image missing</source>
         <translation>Image missing</translation>
     </message>
@@ -876,10 +888,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>%1: %2</source>
         <comment>file, remark</comment>
         <translation>%1: %2</translation>
-    </message>
-    <message>
-        <source>Table imported: %1 (objects: %2)</source>
-        <translation>Table imported: %1 (objects: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
@@ -942,10 +950,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>Restoring measurements</translation>
     </message>
     <message>
-        <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>Measurements restored: %1 (objects: %2)</translation>
-    </message>
-    <message>
         <source>Importing &quot;%1&quot;</source>
         <translation>Importing &quot;%1&quot;</translation>
     </message>
@@ -975,6 +979,27 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>
             <numerusform>%n file was not opened.</numerusform>
             <numerusform>%n files were not opened.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Session opened: %1 (%n object(s))</source>
+        <translation>
+            <numerusform>Session opened: %1 (%n object)</numerusform>
+            <numerusform>Session opened: %1 (%n objects)</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Measurements restored: %1 (%n object(s))</source>
+        <translation>
+            <numerusform>Measurements restored: %1 (%n object)</numerusform>
+            <numerusform>Measurements restored: %1 (%n objects)</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Table imported: %1 (%n object(s))</source>
+        <translation>
+            <numerusform>Table imported: %1 (%n object)</numerusform>
+            <numerusform>Table imported: %1 (%n objects)</numerusform>
         </translation>
     </message>
 </context>
@@ -1073,10 +1098,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>Move &quot;%1&quot; to the trash?</translation>
     </message>
     <message>
-        <source>Move the selected images (%1) to the trash?</source>
-        <translation>Move the selected images (%1) to the trash?</translation>
-    </message>
-    <message>
         <source>Move to trash</source>
         <translation>Move to trash</translation>
     </message>
@@ -1096,6 +1117,13 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
         <translation>The files are still there. They are write-protected, or there is no trash for them.</translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n selected image(s) to the trash?</source>
+        <translation>
+            <numerusform>Move %n selected image to the trash?</numerusform>
+            <numerusform>Move %n selected images to the trash?</numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskGalleryModel</name>
@@ -1110,6 +1138,56 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>Gallery</source>
         <translation>Gallery</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideCommand</name>
+    <message>
+        <source>The user guide is not installed</source>
+        <translation>The user guide is not installed</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideWindow</name>
+    <message>
+        <source>User guide</source>
+        <translation>User guide</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>Contents</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Back</translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation>Forward</translation>
+    </message>
+    <message>
+        <source>Find in the guide</source>
+        <translation>Find in the guide</translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation>Find previous</translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation>Find next</translation>
+    </message>
+    <message>
+        <source>This is the first place</source>
+        <translation>This is the first place</translation>
+    </message>
+    <message>
+        <source>This is the last place</source>
+        <translation>This is the last place</translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation>Not found</translation>
     </message>
 </context>
 <context>
@@ -1435,10 +1513,13 @@ Dropped, because newer ones came first: %1</translation>
         <source>Untitled session</source>
         <translation>Untitled session</translation>
     </message>
-    <message>
-        <source>%1 (objects: %2)</source>
+    <message numerus="yes">
+        <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1 (objects: %2)</translation>
+        <translation>
+            <numerusform>%1 (%n object)</numerusform>
+            <numerusform>%1 (%n objects)</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1506,10 +1587,6 @@ Dropped, because newer ones came first: %1</translation>
     <message>
         <source>Selected values: %1</source>
         <translation>Selected values: %1</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; among them: %2</source>
-        <translation>&quot;%1&quot; among them: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -2039,13 +2116,6 @@ Reported by %2</translation>
     </message>
 </context>
 <context>
-    <name>QSaveFile</name>
-    <message>
-        <source>Filename refers to a directory</source>
-        <translation>Filename refers to a directory</translation>
-    </message>
-</context>
-<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -2194,6 +2264,41 @@ Reported by %2</translation>
     <message>
         <source>Diameter</source>
         <translation>Diameter</translation>
+    </message>
+</context>
+<context>
+    <name>ZtFileFault</name>
+    <message>
+        <source>No such file or directory</source>
+        <translation>No such file or directory</translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation>Permission denied</translation>
+    </message>
+    <message>
+        <source>Is a directory</source>
+        <translation>Is a directory</translation>
+    </message>
+    <message>
+        <source>Not a directory</source>
+        <translation>Not a directory</translation>
+    </message>
+    <message>
+        <source>File name too long</source>
+        <translation>File name too long</translation>
+    </message>
+    <message>
+        <source>No space left on device</source>
+        <translation>No space left on device</translation>
+    </message>
+    <message>
+        <source>Read-only file system</source>
+        <translation>Read-only file system</translation>
+    </message>
+    <message>
+        <source>Input/output error</source>
+        <translation>Input/output error</translation>
     </message>
 </context>
 <context>
@@ -2492,10 +2597,6 @@ Reported by %2</translation>
         <translation>There is no value %1 to give a unit; the values are %2</translation>
     </message>
     <message>
-        <source>The first line announces %1 rows, but there are %2</source>
-        <translation>The first line announces %1 rows, but there are %2</translation>
-    </message>
-    <message>
         <source>The first line announces rows without values</source>
         <translation>The first line announces rows without values</translation>
     </message>
@@ -2510,10 +2611,6 @@ Reported by %2</translation>
     <message>
         <source>Value %1</source>
         <translation>Value %1</translation>
-    </message>
-    <message>
-        <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>The row has %1 fields, but the first line announces %2 values and a class</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
@@ -2566,6 +2663,20 @@ Reported by %2</translation>
     <message>
         <source>Reading was cancelled</source>
         <translation>Reading was cancelled</translation>
+    </message>
+    <message numerus="yes">
+        <source>The table has %n row(s), its first line announces %1</source>
+        <translation>
+            <numerusform>The table has %n row, its first line announces %1</numerusform>
+            <numerusform>The table has %n rows, its first line announces %1</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n field(s) instead of %1</source>
+        <translation>
+            <numerusform>The row has %n field instead of %1</numerusform>
+            <numerusform>The row has %n fields instead of %1</numerusform>
+        </translation>
     </message>
 </context>
 <context>

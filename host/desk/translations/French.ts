@@ -384,6 +384,14 @@
         <source>Show the first steps, the examples and the recent sessions</source>
         <translation>Afficher les premiers pas, les exemples et les sessions récentes</translation>
     </message>
+    <message>
+        <source>&amp;User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read the user guide</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -530,12 +538,12 @@
     <message>
         <source>%1 μm</source>
         <comment>size of a pixel</comment>
-        <translation>%1 μm</translation>
+        <translation>%1&#xa0;μm</translation>
     </message>
     <message>
         <source>%1 × %2 μm</source>
         <comment>width and height of a pixel</comment>
-        <translation>%1 × %2 μm</translation>
+        <translation>%1 × %2&#xa0;μm</translation>
     </message>
     <message>
         <source>Known distance</source>
@@ -564,6 +572,11 @@
         <source>%1 states pixels of %2; the session measures in pixels</source>
         <translation>%1 indique une taille de pixel de %2&#xa0;; la session mesure en pixels</translation>
     </message>
+    <message>
+        <source>Calibrated: %1, %2 per pixel</source>
+        <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>KvDeskCommandLine</name>
@@ -589,14 +602,14 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </source>
-        <translation>Utilisation : measuringdesk [OPTION...] [SESSION|IMAGE|TABLEAU|DOSSIER|VIDÉO...]
+        <translation>Utilisation&#xa0;: measuringdesk [OPTION...] [SESSION|IMAGE|TABLEAU|DOSSIER|VIDÉO...]
 Mesure des objets sur des images et affiche leurs valeurs.
 
   --session FICHIER   ouvrir une session
   --image FICHIER     ouvrir une image
   --table FICHIER     importer un tableau de valeurs mesurées
   --theme Dark|Light  thème pour cette exécution
-  --plugins DOSSIER   chercher aussi des plug-ins ici ; répétable
+  --plugins DOSSIER   chercher aussi des plug-ins ici&#xa0;; répétable
   --help              afficher ce texte
   --version           afficher la version
 
@@ -671,19 +684,19 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     <name>KvDeskExamples</name>
     <message>
         <source>Coin: first length</source>
-        <translation>Pièce : longueur</translation>
+        <translation>Pièce&#xa0;: longueur</translation>
     </message>
     <message>
         <source>Plate: dimensions</source>
-        <translation>Plaque : dimensions</translation>
+        <translation>Plaque&#xa0;: dimensions</translation>
     </message>
     <message>
         <source>Cells: counting</source>
-        <translation>Cellules : comptage</translation>
+        <translation>Cellules&#xa0;: comptage</translation>
     </message>
     <message>
         <source>Fibres: statistics</source>
-        <translation>Fibres : statistiques</translation>
+        <translation>Fibres&#xa0;: statistiques</translation>
     </message>
 </context>
 <context>
@@ -743,10 +756,6 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     <message>
         <source>Numbers</source>
         <translation>Nombres</translation>
-    </message>
-    <message>
-        <source>Only the selected objects (%1)</source>
-        <translation>Uniquement les objets sélectionnés (%1)</translation>
     </message>
     <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
@@ -809,6 +818,13 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
         <source>Concerns CSV tables only</source>
         <translation>Concerne uniquement les tableaux CSV</translation>
     </message>
+    <message numerus="yes">
+        <source>Only the selected object(s) (%n)</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
@@ -849,10 +865,6 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
         <translation>La session «&#xa0;%1&#xa0;» n’a pas été ouverte.</translation>
     </message>
     <message>
-        <source>Session opened: %1 (objects: %2)</source>
-        <translation>Session ouverte&#xa0;: %1 (objets&#xa0;: %2)</translation>
-    </message>
-    <message>
         <source>Image missing</source>
         <translation>Image manquante</translation>
     </message>
@@ -876,10 +888,6 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
         <source>%1: %2</source>
         <comment>file, remark</comment>
         <translation>%1&#xa0;: %2</translation>
-    </message>
-    <message>
-        <source>Table imported: %1 (objects: %2)</source>
-        <translation>Tableau importé&#xa0;: %1 (objets&#xa0;: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
@@ -942,10 +950,6 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
         <translation>Restauration des mesures</translation>
     </message>
     <message>
-        <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>Mesures restaurées&#xa0;: %1 (objets&#xa0;: %2)</translation>
-    </message>
-    <message>
         <source>Importing &quot;%1&quot;</source>
         <translation>Importation de «&#xa0;%1&#xa0;»</translation>
     </message>
@@ -975,6 +979,27 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
         <translation>
             <numerusform>%n fichier n’a pas été ouvert.</numerusform>
             <numerusform>%n fichiers n’ont pas été ouverts.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Session opened: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Measurements restored: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Table imported: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
         </translation>
     </message>
 </context>
@@ -1073,10 +1098,6 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
         <translation>Mettre «&#xa0;%1&#xa0;» à la corbeille&#xa0;?</translation>
     </message>
     <message>
-        <source>Move the selected images (%1) to the trash?</source>
-        <translation>Mettre les images sélectionnées (%1) à la corbeille&#xa0;?</translation>
-    </message>
-    <message>
         <source>Move to trash</source>
         <translation>Mettre à la corbeille</translation>
     </message>
@@ -1096,13 +1117,20 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
         <translation>Les fichiers sont toujours là. Ils sont protégés en écriture, ou il n’y a pas de corbeille pour eux.</translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n selected image(s) to the trash?</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskGalleryModel</name>
     <message>
         <source>%1 × %2 px</source>
         <comment>width, height</comment>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2&#xa0;px</translation>
     </message>
 </context>
 <context>
@@ -1110,6 +1138,56 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     <message>
         <source>Gallery</source>
         <translation>Galerie</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideCommand</name>
+    <message>
+        <source>The user guide is not installed</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideWindow</name>
+    <message>
+        <source>User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find in the guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the first place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the last place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -1237,7 +1315,7 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     </message>
     <message>
         <source>Stop the live image; other programs can use the camera then</source>
-        <translation>Arrêter l’image en direct ; d’autres programmes pourront alors utiliser la caméra</translation>
+        <translation>Arrêter l’image en direct&#xa0;; d’autres programmes pourront alors utiliser la caméra</translation>
     </message>
 </context>
 <context>
@@ -1435,10 +1513,13 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
         <source>Untitled session</source>
         <translation>Session sans titre</translation>
     </message>
-    <message>
-        <source>%1 (objects: %2)</source>
+    <message numerus="yes">
+        <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1 (objets&#xa0;: %2)</translation>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1506,10 +1587,6 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     <message>
         <source>Selected values: %1</source>
         <translation>Valeurs sélectionnées&#xa0;: %1</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; among them: %2</source>
-        <translation>Dont «&#xa0;%1&#xa0;»&#xa0;: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -1731,7 +1808,7 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     </message>
     <message>
         <source>Drag a line over the image: its length is listed at once. The report panel makes a PDF of all values.</source>
-        <translation>Tracez une ligne sur l’image en faisant glisser la souris : sa longueur s’affiche aussitôt dans la liste. Le panneau de rapport crée un PDF avec toutes les valeurs.</translation>
+        <translation>Tracez une ligne sur l’image en faisant glisser la souris&#xa0;: sa longueur s’affiche aussitôt dans la liste. Le panneau de rapport crée un PDF avec toutes les valeurs.</translation>
     </message>
     <message>
         <source>Examples to try</source>
@@ -1769,7 +1846,7 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     <name>KvDeskStatusBar</name>
     <message>
         <source>%1 × %2 px</source>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2&#xa0;px</translation>
     </message>
     <message>
         <source>%1 %</source>
@@ -2039,13 +2116,6 @@ Signalé par %2</translation>
     </message>
 </context>
 <context>
-    <name>QSaveFile</name>
-    <message>
-        <source>Filename refers to a directory</source>
-        <translation>Le nom de fichier désigne un dossier</translation>
-    </message>
-</context>
-<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -2194,6 +2264,41 @@ Signalé par %2</translation>
     <message>
         <source>Diameter</source>
         <translation>Diamètre</translation>
+    </message>
+</context>
+<context>
+    <name>ZtFileFault</name>
+    <message>
+        <source>No such file or directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Is a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>File name too long</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No space left on device</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read-only file system</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Input/output error</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -2492,10 +2597,6 @@ Signalé par %2</translation>
         <translation>Il n’y a pas de valeur %1 à laquelle attribuer une unité&#xa0;; les valeurs sont %2</translation>
     </message>
     <message>
-        <source>The first line announces %1 rows, but there are %2</source>
-        <translation>La première ligne annonce %1 lignes de données, mais il y en a %2</translation>
-    </message>
-    <message>
         <source>The first line announces rows without values</source>
         <translation>La première ligne annonce des lignes sans valeurs</translation>
     </message>
@@ -2510,10 +2611,6 @@ Signalé par %2</translation>
     <message>
         <source>Value %1</source>
         <translation>Valeur %1</translation>
-    </message>
-    <message>
-        <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>La ligne a %1 champs, mais la première ligne annonce %2 valeurs et une classe</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
@@ -2566,6 +2663,20 @@ Signalé par %2</translation>
     <message>
         <source>Reading was cancelled</source>
         <translation>La lecture a été annulée</translation>
+    </message>
+    <message numerus="yes">
+        <source>The table has %n row(s), its first line announces %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n field(s) instead of %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>

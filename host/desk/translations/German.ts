@@ -384,6 +384,14 @@
         <source>Show the first steps, the examples and the recent sessions</source>
         <translation>Erste Schritte, Beispiele und zuletzt verwendete Sitzungen anzeigen</translation>
     </message>
+    <message>
+        <source>&amp;User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read the user guide</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -530,12 +538,12 @@
     <message>
         <source>%1 μm</source>
         <comment>size of a pixel</comment>
-        <translation>%1 μm</translation>
+        <translation>%1&#xa0;μm</translation>
     </message>
     <message>
         <source>%1 × %2 μm</source>
         <comment>width and height of a pixel</comment>
-        <translation>%1 × %2 μm</translation>
+        <translation>%1 × %2&#xa0;μm</translation>
     </message>
     <message>
         <source>Known distance</source>
@@ -563,6 +571,11 @@
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
         <translation>%1 gibt eine Pixelgröße von %2 an; die Sitzung misst in Pixeln</translation>
+    </message>
+    <message>
+        <source>Calibrated: %1, %2 per pixel</source>
+        <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -745,10 +758,6 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
         <translation>Zahlen</translation>
     </message>
     <message>
-        <source>Only the selected objects (%1)</source>
-        <translation>Nur die ausgewählten Objekte (%1)</translation>
-    </message>
-    <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
         <translation>Byte Order Mark (BOM), für Tabellenkalkulationen, die kein UTF-8 erwarten</translation>
     </message>
@@ -809,6 +818,13 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
         <source>Concerns CSV tables only</source>
         <translation>Betrifft nur CSV-Tabellen</translation>
     </message>
+    <message numerus="yes">
+        <source>Only the selected object(s) (%n)</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
@@ -849,10 +865,6 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
         <translation>Die Sitzung „%1“ wurde nicht geöffnet.</translation>
     </message>
     <message>
-        <source>Session opened: %1 (objects: %2)</source>
-        <translation>Sitzung geöffnet: %1 (Objekte: %2)</translation>
-    </message>
-    <message>
         <source>Image missing</source>
         <translation>Bild fehlt</translation>
     </message>
@@ -876,10 +888,6 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
         <source>%1: %2</source>
         <comment>file, remark</comment>
         <translation>%1: %2</translation>
-    </message>
-    <message>
-        <source>Table imported: %1 (objects: %2)</source>
-        <translation>Tabelle importiert: %1 (Objekte: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
@@ -942,10 +950,6 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
         <translation>Messungen werden wiederhergestellt</translation>
     </message>
     <message>
-        <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>Messungen wiederhergestellt: %1 (Objekte: %2)</translation>
-    </message>
-    <message>
         <source>Importing &quot;%1&quot;</source>
         <translation>„%1“ wird importiert</translation>
     </message>
@@ -975,6 +979,27 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
         <translation>
             <numerusform>%n Datei wurde nicht geöffnet.</numerusform>
             <numerusform>%n Dateien wurden nicht geöffnet.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Session opened: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Measurements restored: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Table imported: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
         </translation>
     </message>
 </context>
@@ -1073,10 +1098,6 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
         <translation>„%1“ in den Papierkorb verschieben?</translation>
     </message>
     <message>
-        <source>Move the selected images (%1) to the trash?</source>
-        <translation>Die ausgewählten Bilder (%1) in den Papierkorb verschieben?</translation>
-    </message>
-    <message>
         <source>Move to trash</source>
         <translation>In den Papierkorb verschieben</translation>
     </message>
@@ -1096,13 +1117,20 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
         <translation>Die Dateien sind noch da. Sie sind schreibgeschützt, oder es gibt für sie keinen Papierkorb.</translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n selected image(s) to the trash?</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskGalleryModel</name>
     <message>
         <source>%1 × %2 px</source>
         <comment>width, height</comment>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2&#xa0;px</translation>
     </message>
 </context>
 <context>
@@ -1110,6 +1138,56 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     <message>
         <source>Gallery</source>
         <translation>Galerie</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideCommand</name>
+    <message>
+        <source>The user guide is not installed</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideWindow</name>
+    <message>
+        <source>User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find in the guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the first place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the last place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -1191,7 +1269,7 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     <message>
         <source>%1 fps</source>
         <extracomment>frames per second</extracomment>
-        <translation>%1 fps</translation>
+        <translation>%1&#xa0;fps</translation>
     </message>
     <message>
         <source>%1 delivers no pictures any more; this is the last one</source>
@@ -1435,10 +1513,13 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
         <source>Untitled session</source>
         <translation>Unbenannte Sitzung</translation>
     </message>
-    <message>
-        <source>%1 (objects: %2)</source>
+    <message numerus="yes">
+        <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1 (Objekte: %2)</translation>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1506,10 +1587,6 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
     <message>
         <source>Selected values: %1</source>
         <translation>Ausgewählte Werte: %1</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; among them: %2</source>
-        <translation>Davon „%1“: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -1769,7 +1846,7 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
     <name>KvDeskStatusBar</name>
     <message>
         <source>%1 × %2 px</source>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2&#xa0;px</translation>
     </message>
     <message>
         <source>%1 %</source>
@@ -2039,13 +2116,6 @@ Gemeldet von %2</translation>
     </message>
 </context>
 <context>
-    <name>QSaveFile</name>
-    <message>
-        <source>Filename refers to a directory</source>
-        <translation>Der Dateiname bezeichnet einen Ordner</translation>
-    </message>
-</context>
-<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -2194,6 +2264,41 @@ Gemeldet von %2</translation>
     <message>
         <source>Diameter</source>
         <translation>Durchmesser</translation>
+    </message>
+</context>
+<context>
+    <name>ZtFileFault</name>
+    <message>
+        <source>No such file or directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Is a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>File name too long</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No space left on device</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read-only file system</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Input/output error</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -2492,10 +2597,6 @@ Gemeldet von %2</translation>
         <translation>Es gibt keinen Wert %1, der eine Einheit erhalten könnte; die Werte sind %2</translation>
     </message>
     <message>
-        <source>The first line announces %1 rows, but there are %2</source>
-        <translation>Die erste Zeile kündigt %1 Datenzeilen an, vorhanden sind aber %2</translation>
-    </message>
-    <message>
         <source>The first line announces rows without values</source>
         <translation>Die erste Zeile kündigt Datenzeilen ohne Werte an</translation>
     </message>
@@ -2510,10 +2611,6 @@ Gemeldet von %2</translation>
     <message>
         <source>Value %1</source>
         <translation>Wert %1</translation>
-    </message>
-    <message>
-        <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>Die Zeile hat %1 Felder, die erste Zeile kündigt aber %2 Werte und eine Klasse an</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
@@ -2566,6 +2663,20 @@ Gemeldet von %2</translation>
     <message>
         <source>Reading was cancelled</source>
         <translation>Das Lesen wurde abgebrochen</translation>
+    </message>
+    <message numerus="yes">
+        <source>The table has %n row(s), its first line announces %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n field(s) instead of %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>

@@ -384,6 +384,14 @@
         <source>Show the first steps, the examples and the recent sessions</source>
         <translation>Mostra i primi passi, gli esempi e le sessioni recenti</translation>
     </message>
+    <message>
+        <source>&amp;User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read the user guide</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -563,6 +571,11 @@
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
         <translation>%1 indica una dimensione pixel di %2; la sessione misura in pixel</translation>
+    </message>
+    <message>
+        <source>Calibrated: %1, %2 per pixel</source>
+        <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -745,10 +758,6 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
         <translation>Numeri</translation>
     </message>
     <message>
-        <source>Only the selected objects (%1)</source>
-        <translation>Solo gli oggetti selezionati (%1)</translation>
-    </message>
-    <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
         <translation>Byte order mark (BOM), per fogli di calcolo che non prevedono UTF-8</translation>
     </message>
@@ -809,6 +818,13 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
         <source>Concerns CSV tables only</source>
         <translation>Riguarda solo le tabelle CSV</translation>
     </message>
+    <message numerus="yes">
+        <source>Only the selected object(s) (%n)</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
@@ -849,10 +865,6 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
         <translation>La sessione “%1” non è stata aperta.</translation>
     </message>
     <message>
-        <source>Session opened: %1 (objects: %2)</source>
-        <translation>Sessione aperta: %1 (oggetti: %2)</translation>
-    </message>
-    <message>
         <source>Image missing</source>
         <translation>Immagine mancante</translation>
     </message>
@@ -876,10 +888,6 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
         <source>%1: %2</source>
         <comment>file, remark</comment>
         <translation>%1: %2</translation>
-    </message>
-    <message>
-        <source>Table imported: %1 (objects: %2)</source>
-        <translation>Tabella importata: %1 (oggetti: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
@@ -942,10 +950,6 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
         <translation>Recupero delle misure</translation>
     </message>
     <message>
-        <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>Misure recuperate: %1 (oggetti: %2)</translation>
-    </message>
-    <message>
         <source>Importing &quot;%1&quot;</source>
         <translation>Importazione di “%1”</translation>
     </message>
@@ -975,6 +979,27 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
         <translation>
             <numerusform>%n file non è stato aperto.</numerusform>
             <numerusform>%n file non sono stati aperti.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Session opened: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Measurements restored: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Table imported: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
         </translation>
     </message>
 </context>
@@ -1073,10 +1098,6 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
         <translation>Spostare “%1” nel cestino?</translation>
     </message>
     <message>
-        <source>Move the selected images (%1) to the trash?</source>
-        <translation>Spostare nel cestino le immagini selezionate (%1)?</translation>
-    </message>
-    <message>
         <source>Move to trash</source>
         <translation>Sposta nel cestino</translation>
     </message>
@@ -1096,6 +1117,13 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
         <translation>I file sono ancora al loro posto. Sono protetti da scrittura oppure per loro non è disponibile un cestino.</translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n selected image(s) to the trash?</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskGalleryModel</name>
@@ -1110,6 +1138,56 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     <message>
         <source>Gallery</source>
         <translation>Galleria</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideCommand</name>
+    <message>
+        <source>The user guide is not installed</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideWindow</name>
+    <message>
+        <source>User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find in the guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the first place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the last place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -1435,10 +1513,13 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
         <source>Untitled session</source>
         <translation>Sessione senza titolo</translation>
     </message>
-    <message>
-        <source>%1 (objects: %2)</source>
+    <message numerus="yes">
+        <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1 (oggetti: %2)</translation>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1506,10 +1587,6 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     <message>
         <source>Selected values: %1</source>
         <translation>Valori selezionati: %1</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; among them: %2</source>
-        <translation>Di cui “%1”: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -2039,13 +2116,6 @@ Segnalato da %2</translation>
     </message>
 </context>
 <context>
-    <name>QSaveFile</name>
-    <message>
-        <source>Filename refers to a directory</source>
-        <translation>Il nome del file corrisponde a una cartella</translation>
-    </message>
-</context>
-<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -2194,6 +2264,41 @@ Segnalato da %2</translation>
     <message>
         <source>Diameter</source>
         <translation>Diametro</translation>
+    </message>
+</context>
+<context>
+    <name>ZtFileFault</name>
+    <message>
+        <source>No such file or directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Is a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>File name too long</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No space left on device</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read-only file system</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Input/output error</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -2492,10 +2597,6 @@ Segnalato da %2</translation>
         <translation>Non c&apos;è un valore %1 a cui assegnare un&apos;unità; i valori sono %2</translation>
     </message>
     <message>
-        <source>The first line announces %1 rows, but there are %2</source>
-        <translation>La prima riga del file annuncia %1 righe, ma ce ne sono %2</translation>
-    </message>
-    <message>
         <source>The first line announces rows without values</source>
         <translation>La prima riga del file annuncia righe senza valori</translation>
     </message>
@@ -2510,10 +2611,6 @@ Segnalato da %2</translation>
     <message>
         <source>Value %1</source>
         <translation>Valore %1</translation>
-    </message>
-    <message>
-        <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>La riga ha %1 campi, ma la prima riga del file annuncia %2 valori e una classe</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
@@ -2566,6 +2663,20 @@ Segnalato da %2</translation>
     <message>
         <source>Reading was cancelled</source>
         <translation>Lettura annullata</translation>
+    </message>
+    <message numerus="yes">
+        <source>The table has %n row(s), its first line announces %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n field(s) instead of %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>

@@ -384,6 +384,14 @@
         <source>Show the first steps, the examples and the recent sessions</source>
         <translation>Показать первые шаги, примеры и недавние сеансы</translation>
     </message>
+    <message>
+        <source>&amp;User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read the user guide</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -563,6 +571,11 @@
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
         <translation>%1: указан размер пикселя %2; в сеансе измерения ведутся в пикселях</translation>
+    </message>
+    <message>
+        <source>Calibrated: %1, %2 per pixel</source>
+        <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -745,10 +758,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>Числа</translation>
     </message>
     <message>
-        <source>Only the selected objects (%1)</source>
-        <translation>Только выделенные объекты (%1)</translation>
-    </message>
-    <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
         <translation>Метка порядка байтов (BOM) для табличных редакторов, не ожидающих UTF-8</translation>
     </message>
@@ -809,6 +818,14 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Concerns CSV tables only</source>
         <translation>Относится только к таблицам CSV</translation>
     </message>
+    <message numerus="yes">
+        <source>Only the selected object(s) (%n)</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
@@ -849,10 +866,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>Сеанс «%1» не открыт.</translation>
     </message>
     <message>
-        <source>Session opened: %1 (objects: %2)</source>
-        <translation>Сеанс открыт: %1 (объектов: %2)</translation>
-    </message>
-    <message>
         <source>Image missing</source>
         <translation>Нет изображения</translation>
     </message>
@@ -876,10 +889,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>%1: %2</source>
         <comment>file, remark</comment>
         <translation>%1: %2</translation>
-    </message>
-    <message>
-        <source>Table imported: %1 (objects: %2)</source>
-        <translation>Таблица импортирована: %1 (объектов: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
@@ -942,10 +951,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>Восстановление измерений</translation>
     </message>
     <message>
-        <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>Измерения восстановлены: %1 (объектов: %2)</translation>
-    </message>
-    <message>
         <source>Importing &quot;%1&quot;</source>
         <translation>Импорт «%1»</translation>
     </message>
@@ -976,6 +981,30 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
             <numerusform>Не открыт %n файл.</numerusform>
             <numerusform>Не открыто %n файла.</numerusform>
             <numerusform>Не открыто %n файлов.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Session opened: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Measurements restored: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Table imported: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
         </translation>
     </message>
 </context>
@@ -1074,10 +1103,6 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <translation>Переместить «%1» в корзину?</translation>
     </message>
     <message>
-        <source>Move the selected images (%1) to the trash?</source>
-        <translation>Переместить выделенные изображения (%1) в корзину?</translation>
-    </message>
-    <message>
         <source>Move to trash</source>
         <translation>Переместить в корзину</translation>
     </message>
@@ -1097,6 +1122,14 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
         <translation>Файлы остались на месте. Они защищены от записи, или для них нет корзины.</translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n selected image(s) to the trash?</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskGalleryModel</name>
@@ -1111,6 +1144,56 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>Gallery</source>
         <translation>Галерея</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideCommand</name>
+    <message>
+        <source>The user guide is not installed</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideWindow</name>
+    <message>
+        <source>User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find in the guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the first place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the last place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -1437,10 +1520,14 @@ Dropped, because newer ones came first: %1</source>
         <source>Untitled session</source>
         <translation>Безымянный сеанс</translation>
     </message>
-    <message>
-        <source>%1 (objects: %2)</source>
+    <message numerus="yes">
+        <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1 (объектов: %2)</translation>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1509,10 +1596,6 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Selected values: %1</source>
         <translation>Выделено значений: %1</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; among them: %2</source>
-        <translation>Из них «%1»: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -2042,13 +2125,6 @@ Reported by %2</source>
     </message>
 </context>
 <context>
-    <name>QSaveFile</name>
-    <message>
-        <source>Filename refers to a directory</source>
-        <translation>Имя файла указывает на папку</translation>
-    </message>
-</context>
-<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -2197,6 +2273,41 @@ Reported by %2</source>
     <message>
         <source>Diameter</source>
         <translation>Диаметр</translation>
+    </message>
+</context>
+<context>
+    <name>ZtFileFault</name>
+    <message>
+        <source>No such file or directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Is a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>File name too long</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No space left on device</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read-only file system</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Input/output error</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -2495,10 +2606,6 @@ Reported by %2</source>
         <translation>Нет величины %1, которой можно задать единицу; имеющиеся величины: %2</translation>
     </message>
     <message>
-        <source>The first line announces %1 rows, but there are %2</source>
-        <translation>Число строк, заявленное в первой строке (%1), не совпадает с фактическим (%2)</translation>
-    </message>
-    <message>
         <source>The first line announces rows without values</source>
         <translation>В первой строке заявлены строки без значений</translation>
     </message>
@@ -2513,10 +2620,6 @@ Reported by %2</source>
     <message>
         <source>Value %1</source>
         <translation>Величина %1</translation>
-    </message>
-    <message>
-        <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>Полей в строке: %1, а в первой строке заявлены значения (%2) и класс</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
@@ -2569,6 +2672,22 @@ Reported by %2</source>
     <message>
         <source>Reading was cancelled</source>
         <translation>Чтение отменено</translation>
+    </message>
+    <message numerus="yes">
+        <source>The table has %n row(s), its first line announces %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n field(s) instead of %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>

@@ -89,7 +89,7 @@
     </message>
     <message>
         <source>Show the image at 100 %</source>
-        <translation>Zobraziť obrázok na 100 %</translation>
+        <translation>Zobraziť obrázok na 100&#xa0;%</translation>
     </message>
     <message>
         <source>&amp;Measured values</source>
@@ -384,6 +384,14 @@
         <source>Show the first steps, the examples and the recent sessions</source>
         <translation>Zobraziť prvé kroky, príklady a nedávne relácie</translation>
     </message>
+    <message>
+        <source>&amp;User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read the user guide</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -530,12 +538,12 @@
     <message>
         <source>%1 μm</source>
         <comment>size of a pixel</comment>
-        <translation>%1 μm</translation>
+        <translation>%1&#xa0;μm</translation>
     </message>
     <message>
         <source>%1 × %2 μm</source>
         <comment>width and height of a pixel</comment>
-        <translation>%1 × %2 μm</translation>
+        <translation>%1 × %2&#xa0;μm</translation>
     </message>
     <message>
         <source>Known distance</source>
@@ -563,6 +571,11 @@
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
         <translation>%1 udáva veľkosť pixela %2; relácia meria v pixeloch</translation>
+    </message>
+    <message>
+        <source>Calibrated: %1, %2 per pixel</source>
+        <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -745,10 +758,6 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
         <translation>Čísla</translation>
     </message>
     <message>
-        <source>Only the selected objects (%1)</source>
-        <translation>Iba vybrané objekty (%1)</translation>
-    </message>
-    <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
         <translation>Značka poradia bajtov (BOM) pre tabuľkové procesory, ktoré neočakávajú UTF-8</translation>
     </message>
@@ -809,6 +818,14 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
         <source>Concerns CSV tables only</source>
         <translation>Týka sa len tabuliek CSV</translation>
     </message>
+    <message numerus="yes">
+        <source>Only the selected object(s) (%n)</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
@@ -849,10 +866,6 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
         <translation>Relácia „%1“ sa neotvorila.</translation>
     </message>
     <message>
-        <source>Session opened: %1 (objects: %2)</source>
-        <translation>Relácia otvorená: %1 (objekty: %2)</translation>
-    </message>
-    <message>
         <source>Image missing</source>
         <translation>Chýba obrázok</translation>
     </message>
@@ -876,10 +889,6 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
         <source>%1: %2</source>
         <comment>file, remark</comment>
         <translation>%1: %2</translation>
-    </message>
-    <message>
-        <source>Table imported: %1 (objects: %2)</source>
-        <translation>Tabuľka importovaná: %1 (objekty: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
@@ -942,10 +951,6 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
         <translation>Obnovujú sa merania</translation>
     </message>
     <message>
-        <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>Merania obnovené: %1 (objekty: %2)</translation>
-    </message>
-    <message>
         <source>Importing &quot;%1&quot;</source>
         <translation>Importuje sa „%1“</translation>
     </message>
@@ -976,6 +981,30 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
             <numerusform>%n súbor sa neotvoril.</numerusform>
             <numerusform>%n súbory sa neotvorili.</numerusform>
             <numerusform>%n súborov sa neotvorilo.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Session opened: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Measurements restored: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Table imported: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
         </translation>
     </message>
 </context>
@@ -1074,10 +1103,6 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
         <translation>Presunúť „%1“ do koša?</translation>
     </message>
     <message>
-        <source>Move the selected images (%1) to the trash?</source>
-        <translation>Presunúť vybrané obrázky (%1) do koša?</translation>
-    </message>
-    <message>
         <source>Move to trash</source>
         <translation>Presunúť do koša</translation>
     </message>
@@ -1097,13 +1122,21 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
         <translation>Súbory sú stále na svojom mieste. Sú chránené proti zápisu alebo pre ne neexistuje kôš.</translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n selected image(s) to the trash?</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskGalleryModel</name>
     <message>
         <source>%1 × %2 px</source>
         <comment>width, height</comment>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2&#xa0;px</translation>
     </message>
 </context>
 <context>
@@ -1111,6 +1144,56 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     <message>
         <source>Gallery</source>
         <translation>Galéria</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideCommand</name>
+    <message>
+        <source>The user guide is not installed</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideWindow</name>
+    <message>
+        <source>User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find in the guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the first place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the last place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -1192,7 +1275,7 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     <message>
         <source>%1 fps</source>
         <extracomment>frames per second</extracomment>
-        <translation>%1 sn./s</translation>
+        <translation>%1&#xa0;sn./s</translation>
     </message>
     <message>
         <source>%1 delivers no pictures any more; this is the last one</source>
@@ -1437,10 +1520,14 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
         <source>Untitled session</source>
         <translation>Relácia bez názvu</translation>
     </message>
-    <message>
-        <source>%1 (objects: %2)</source>
+    <message numerus="yes">
+        <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1 (objekty: %2)</translation>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1509,10 +1596,6 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     <message>
         <source>Selected values: %1</source>
         <translation>Vybrané hodnoty: %1</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; among them: %2</source>
-        <translation>Z toho „%1“: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -1772,12 +1855,12 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     <name>KvDeskStatusBar</name>
     <message>
         <source>%1 × %2 px</source>
-        <translation>%1 × %2 px</translation>
+        <translation>%1 × %2&#xa0;px</translation>
     </message>
     <message>
         <source>%1 %</source>
         <comment>zoom</comment>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
     <message>
         <source>x %1, y %2</source>
@@ -2042,13 +2125,6 @@ Ohlásil: %2</translation>
     </message>
 </context>
 <context>
-    <name>QSaveFile</name>
-    <message>
-        <source>Filename refers to a directory</source>
-        <translation>Názov súboru označuje priečinok</translation>
-    </message>
-</context>
-<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -2197,6 +2273,41 @@ Ohlásil: %2</translation>
     <message>
         <source>Diameter</source>
         <translation>Priemer</translation>
+    </message>
+</context>
+<context>
+    <name>ZtFileFault</name>
+    <message>
+        <source>No such file or directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Is a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>File name too long</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No space left on device</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read-only file system</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Input/output error</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -2495,10 +2606,6 @@ Ohlásil: %2</translation>
         <translation>Neexistuje veličina %1, ktorej by sa dala priradiť jednotka; veličiny sú %2</translation>
     </message>
     <message>
-        <source>The first line announces %1 rows, but there are %2</source>
-        <translation>Počet riadkov ohlásený v prvom riadku (%1) nesúhlasí so skutočným (%2)</translation>
-    </message>
-    <message>
         <source>The first line announces rows without values</source>
         <translation>Prvý riadok ohlasuje riadky bez hodnôt</translation>
     </message>
@@ -2513,10 +2620,6 @@ Ohlásil: %2</translation>
     <message>
         <source>Value %1</source>
         <translation>Veličina %1</translation>
-    </message>
-    <message>
-        <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>Počet polí v riadku: %1, ale prvý riadok ohlasuje hodnoty (%2) a triedu</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
@@ -2569,6 +2672,22 @@ Ohlásil: %2</translation>
     <message>
         <source>Reading was cancelled</source>
         <translation>Čítanie bolo zrušené</translation>
+    </message>
+    <message numerus="yes">
+        <source>The table has %n row(s), its first line announces %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n field(s) instead of %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>

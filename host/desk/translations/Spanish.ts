@@ -384,6 +384,14 @@
         <source>Show the first steps, the examples and the recent sessions</source>
         <translation>Mostrar los primeros pasos, los ejemplos y las sesiones recientes</translation>
     </message>
+    <message>
+        <source>&amp;User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read the user guide</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>KvDeskAutosave</name>
@@ -563,6 +571,11 @@
     <message>
         <source>%1 states pixels of %2; the session measures in pixels</source>
         <translation>%1 indica un tamaño de píxel de %2; la sesión mide en píxeles</translation>
+    </message>
+    <message>
+        <source>Calibrated: %1, %2 per pixel</source>
+        <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -745,10 +758,6 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
         <translation>Números</translation>
     </message>
     <message>
-        <source>Only the selected objects (%1)</source>
-        <translation>Solo los objetos seleccionados (%1)</translation>
-    </message>
-    <message>
         <source>Byte order mark, for spreadsheets that do not expect UTF-8</source>
         <translation>Marca de orden de bytes (BOM), para hojas de cálculo que no esperan UTF-8</translation>
     </message>
@@ -809,6 +818,13 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
         <source>Concerns CSV tables only</source>
         <translation>Solo afecta a las tablas CSV</translation>
     </message>
+    <message numerus="yes">
+        <source>Only the selected object(s) (%n)</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskExposureControl</name>
@@ -849,10 +865,6 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
         <translation>No se ha abierto la sesión «%1».</translation>
     </message>
     <message>
-        <source>Session opened: %1 (objects: %2)</source>
-        <translation>Sesión abierta: %1 (objetos: %2)</translation>
-    </message>
-    <message>
         <source>Image missing</source>
         <translation>Falta la imagen</translation>
     </message>
@@ -876,10 +888,6 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
         <source>%1: %2</source>
         <comment>file, remark</comment>
         <translation>%1: %2</translation>
-    </message>
-    <message>
-        <source>Table imported: %1 (objects: %2)</source>
-        <translation>Tabla importada: %1 (objetos: %2)</translation>
     </message>
     <message>
         <source>The session &quot;%1&quot; was not saved.</source>
@@ -942,10 +950,6 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
         <translation>Recuperando mediciones</translation>
     </message>
     <message>
-        <source>Measurements restored: %1 (objects: %2)</source>
-        <translation>Mediciones recuperadas: %1 (objetos: %2)</translation>
-    </message>
-    <message>
         <source>Importing &quot;%1&quot;</source>
         <translation>Importando «%1»</translation>
     </message>
@@ -975,6 +979,27 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
         <translation>
             <numerusform>No se ha abierto %n archivo.</numerusform>
             <numerusform>No se han abierto %n archivos.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Session opened: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Measurements restored: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Table imported: %1 (%n object(s))</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
         </translation>
     </message>
 </context>
@@ -1073,10 +1098,6 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
         <translation>¿Desea mover «%1» a la papelera?</translation>
     </message>
     <message>
-        <source>Move the selected images (%1) to the trash?</source>
-        <translation>¿Desea mover las imágenes seleccionadas (%1) a la papelera?</translation>
-    </message>
-    <message>
         <source>Move to trash</source>
         <translation>Mover a la papelera</translation>
     </message>
@@ -1096,6 +1117,13 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
         <source>The files are still there. They are write-protected, or there is no trash for them.</source>
         <translation>Los archivos siguen ahí. Están protegidos contra escritura o no hay papelera para ellos.</translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n selected image(s) to the trash?</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>KvDeskGalleryModel</name>
@@ -1110,6 +1138,56 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     <message>
         <source>Gallery</source>
         <translation>Galería</translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideCommand</name>
+    <message>
+        <source>The user guide is not installed</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>KvDeskGuideWindow</name>
+    <message>
+        <source>User guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find in the guide</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the first place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This is the last place</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -1435,10 +1513,13 @@ Descartados porque llegaron antes otros más nuevos: %1</translation>
         <source>Untitled session</source>
         <translation>Sesión sin título</translation>
     </message>
-    <message>
-        <source>%1 (objects: %2)</source>
+    <message numerus="yes">
+        <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation>%1 (objetos: %2)</translation>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1506,10 +1587,6 @@ Descartados porque llegaron antes otros más nuevos: %1</translation>
     <message>
         <source>Selected values: %1</source>
         <translation>Valores seleccionados: %1</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; among them: %2</source>
-        <translation>De ellos, «%1»: %2</translation>
     </message>
     <message>
         <source>Mean: %1</source>
@@ -2039,13 +2116,6 @@ Notificado por %2</translation>
     </message>
 </context>
 <context>
-    <name>QSaveFile</name>
-    <message>
-        <source>Filename refers to a directory</source>
-        <translation>El nombre de archivo corresponde a una carpeta</translation>
-    </message>
-</context>
-<context>
     <name>ZtAppSettings</name>
     <message>
         <source>The settings could not be saved to %1. Check that the folder is writable.</source>
@@ -2194,6 +2264,41 @@ Notificado por %2</translation>
     <message>
         <source>Diameter</source>
         <translation>Diámetro</translation>
+    </message>
+</context>
+<context>
+    <name>ZtFileFault</name>
+    <message>
+        <source>No such file or directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Is a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not a directory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>File name too long</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No space left on device</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Read-only file system</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Input/output error</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -2492,10 +2597,6 @@ Notificado por %2</translation>
         <translation>No existe el valor %1 al que dar una unidad; los valores son %2</translation>
     </message>
     <message>
-        <source>The first line announces %1 rows, but there are %2</source>
-        <translation>La primera línea anuncia %1 filas, pero hay %2</translation>
-    </message>
-    <message>
         <source>The first line announces rows without values</source>
         <translation>La primera línea anuncia filas sin valores</translation>
     </message>
@@ -2510,10 +2611,6 @@ Notificado por %2</translation>
     <message>
         <source>Value %1</source>
         <translation>Valor %1</translation>
-    </message>
-    <message>
-        <source>The row has %1 fields, but the first line announces %2 values and a class</source>
-        <translation>La fila tiene %1 campos, pero la primera línea anuncia %2 valores y una clase</translation>
     </message>
     <message>
         <source>The file is larger than %1 MB</source>
@@ -2566,6 +2663,20 @@ Notificado por %2</translation>
     <message>
         <source>Reading was cancelled</source>
         <translation>Lectura cancelada</translation>
+    </message>
+    <message numerus="yes">
+        <source>The table has %n row(s), its first line announces %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n field(s) instead of %1</source>
+        <translation type="unfinished">
+            <numerusform></numerusform>
+            <numerusform></numerusform>
+        </translation>
     </message>
 </context>
 <context>

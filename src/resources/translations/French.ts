@@ -323,11 +323,11 @@ Voulez-vous le remplacer&#xa0;?</translation>
     <name>KvReportGlyphs</name>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1</source>
-        <translation>Aucune police installée ne contient ces caractères ; le rapport les omet : %1</translation>
+        <translation>Aucune police installée ne contient ces caractères&#xa0;; le rapport les omet&#xa0;: %1</translation>
     </message>
     <message>
         <source>No installed font has these characters, the report leaves them out: %1 (fonts to install: %2)</source>
-        <translation>Aucune police installée ne contient ces caractères ; le rapport les omet : %1 (polices à installer : %2)</translation>
+        <translation>Aucune police installée ne contient ces caractères&#xa0;; le rapport les omet&#xa0;: %1 (polices à installer&#xa0;: %2)</translation>
     </message>
 </context>
 <context>
