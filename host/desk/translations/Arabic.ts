@@ -386,11 +386,11 @@
     </message>
     <message>
         <source>&amp;User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;دليل المستخدم</translation>
     </message>
     <message>
         <source>Read the user guide</source>
-        <translation type="unfinished"></translation>
+        <translation>قراءة دليل المستخدم</translation>
     </message>
 </context>
 <context>
@@ -575,7 +575,7 @@
     <message>
         <source>Calibrated: %1, %2 per pixel</source>
         <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>تمت المعايرة: %1، %2 لكل بكسل</translation>
     </message>
 </context>
 <context>
@@ -820,13 +820,13 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message numerus="yes">
         <source>Only the selected object(s) (%n)</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>الكائنات المحددة فقط (%n)</numerusform>
+            <numerusform>الكائن المحدد فقط (%n)</numerusform>
+            <numerusform>الكائنان المحددان فقط (%n)</numerusform>
+            <numerusform>الكائنات المحددة فقط (%n)</numerusform>
+            <numerusform>الكائنات المحددة فقط (%n)</numerusform>
+            <numerusform>الكائنات المحددة فقط (%n)</numerusform>
         </translation>
     </message>
 </context>
@@ -991,35 +991,35 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message numerus="yes">
         <source>Session opened: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>فُتحت الجلسة: %1 (%n كائن)</numerusform>
+            <numerusform>فُتحت الجلسة: %1 (كائن واحد)</numerusform>
+            <numerusform>فُتحت الجلسة: %1 (كائنان)</numerusform>
+            <numerusform>فُتحت الجلسة: %1 (%n كائنات)</numerusform>
+            <numerusform>فُتحت الجلسة: %1 (%n كائنًا)</numerusform>
+            <numerusform>فُتحت الجلسة: %1 (%n كائن)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Measurements restored: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>استُعيدت القياسات: %1 (%n كائن)</numerusform>
+            <numerusform>استُعيدت القياسات: %1 (كائن واحد)</numerusform>
+            <numerusform>استُعيدت القياسات: %1 (كائنان)</numerusform>
+            <numerusform>استُعيدت القياسات: %1 (%n كائنات)</numerusform>
+            <numerusform>استُعيدت القياسات: %1 (%n كائنًا)</numerusform>
+            <numerusform>استُعيدت القياسات: %1 (%n كائن)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Table imported: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>استُورد الجدول: %1 (%n كائن)</numerusform>
+            <numerusform>استُورد الجدول: %1 (كائن واحد)</numerusform>
+            <numerusform>استُورد الجدول: %1 (كائنان)</numerusform>
+            <numerusform>استُورد الجدول: %1 (%n كائنات)</numerusform>
+            <numerusform>استُورد الجدول: %1 (%n كائنًا)</numerusform>
+            <numerusform>استُورد الجدول: %1 (%n كائن)</numerusform>
         </translation>
     </message>
 </context>
@@ -1139,13 +1139,13 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message numerus="yes">
         <source>Move %n selected image(s) to the trash?</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>هل تريد نقل %n صورة محددة إلى سلة المهملات؟</numerusform>
+            <numerusform>هل تريد نقل الصورة المحددة إلى سلة المهملات؟</numerusform>
+            <numerusform>هل تريد نقل الصورتين المحددتين إلى سلة المهملات؟</numerusform>
+            <numerusform>هل تريد نقل %n صور محددة إلى سلة المهملات؟</numerusform>
+            <numerusform>هل تريد نقل %n صورة محددة إلى سلة المهملات؟</numerusform>
+            <numerusform>هل تريد نقل %n صورة محددة إلى سلة المهملات؟</numerusform>
         </translation>
     </message>
 </context>
@@ -1168,50 +1168,50 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <name>KvDeskGuideCommand</name>
     <message>
         <source>The user guide is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>دليل المستخدم غير مثبت</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGuideWindow</name>
     <message>
         <source>User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>دليل المستخدم</translation>
     </message>
     <message>
         <source>Contents</source>
-        <translation type="unfinished"></translation>
+        <translation>المحتويات</translation>
     </message>
     <message>
         <source>Back</source>
-        <translation type="unfinished"></translation>
+        <translation>رجوع</translation>
     </message>
     <message>
         <source>Forward</source>
-        <translation type="unfinished"></translation>
+        <translation>تقدم</translation>
     </message>
     <message>
         <source>Find in the guide</source>
-        <translation type="unfinished"></translation>
+        <translation>بحث في الدليل</translation>
     </message>
     <message>
         <source>Find previous</source>
-        <translation type="unfinished"></translation>
+        <translation>البحث عن السابق</translation>
     </message>
     <message>
         <source>Find next</source>
-        <translation type="unfinished"></translation>
+        <translation>البحث عن التالي</translation>
     </message>
     <message>
         <source>This is the first place</source>
-        <translation type="unfinished"></translation>
+        <translation>هذا أول موضع</translation>
     </message>
     <message>
         <source>This is the last place</source>
-        <translation type="unfinished"></translation>
+        <translation>هذا آخر موضع</translation>
     </message>
     <message>
         <source>Not found</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد نتائج</translation>
     </message>
 </context>
 <context>
@@ -1544,13 +1544,13 @@ Dropped, because newer ones came first: %1</source>
     <message numerus="yes">
         <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%1 (%n كائن)</numerusform>
+            <numerusform>%1 (كائن واحد)</numerusform>
+            <numerusform>%1 (كائنان)</numerusform>
+            <numerusform>%1 (%n كائنات)</numerusform>
+            <numerusform>%1 (%n كائنًا)</numerusform>
+            <numerusform>%1 (%n كائن)</numerusform>
         </translation>
     </message>
 </context>
@@ -2306,35 +2306,35 @@ Reported by %2</source>
     <name>ZtFileFault</name>
     <message>
         <source>No such file or directory</source>
-        <translation type="unfinished"></translation>
+        <translation>لا يوجد ملف أو مجلد بهذا الاسم</translation>
     </message>
     <message>
         <source>Permission denied</source>
-        <translation type="unfinished"></translation>
+        <translation>الإذن مرفوض</translation>
     </message>
     <message>
         <source>Is a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>هذا مجلد</translation>
     </message>
     <message>
         <source>Not a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>ليس مجلدًا</translation>
     </message>
     <message>
         <source>File name too long</source>
-        <translation type="unfinished"></translation>
+        <translation>اسم الملف طويل جدًا</translation>
     </message>
     <message>
         <source>No space left on device</source>
-        <translation type="unfinished"></translation>
+        <translation>لا توجد مساحة متبقية على الجهاز</translation>
     </message>
     <message>
         <source>Read-only file system</source>
-        <translation type="unfinished"></translation>
+        <translation>نظام ملفات للقراءة فقط</translation>
     </message>
     <message>
         <source>Input/output error</source>
-        <translation type="unfinished"></translation>
+        <translation>خطأ في الإدخال/الإخراج</translation>
     </message>
 </context>
 <context>
@@ -2702,24 +2702,24 @@ Reported by %2</source>
     </message>
     <message numerus="yes">
         <source>The table has %n row(s), its first line announces %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>في الجدول %n صف، بينما يعلن سطره الأول عن %1</numerusform>
+            <numerusform>في الجدول صف واحد، بينما يعلن سطره الأول عن %1</numerusform>
+            <numerusform>في الجدول صفان، بينما يعلن سطره الأول عن %1</numerusform>
+            <numerusform>في الجدول %n صفوف، بينما يعلن سطره الأول عن %1</numerusform>
+            <numerusform>في الجدول %n صفًا، بينما يعلن سطره الأول عن %1</numerusform>
+            <numerusform>في الجدول %n صف، بينما يعلن سطره الأول عن %1</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>The row has %n field(s) instead of %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>في الصف %n حقل بدلًا من %1</numerusform>
+            <numerusform>في الصف حقل واحد بدلًا من %1</numerusform>
+            <numerusform>في الصف حقلان بدلًا من %1</numerusform>
+            <numerusform>في الصف %n حقول بدلًا من %1</numerusform>
+            <numerusform>في الصف %n حقلًا بدلًا من %1</numerusform>
+            <numerusform>في الصف %n حقل بدلًا من %1</numerusform>
         </translation>
     </message>
 </context>

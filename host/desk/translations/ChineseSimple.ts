@@ -386,11 +386,11 @@
     </message>
     <message>
         <source>&amp;User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>用户指南(&amp;U)</translation>
     </message>
     <message>
         <source>Read the user guide</source>
-        <translation type="unfinished"></translation>
+        <translation>阅读用户指南</translation>
     </message>
 </context>
 <context>
@@ -575,7 +575,7 @@
     <message>
         <source>Calibrated: %1, %2 per pixel</source>
         <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>已校准：%1，每像素 %2</translation>
     </message>
 </context>
 <context>
@@ -820,8 +820,8 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message numerus="yes">
         <source>Only the selected object(s) (%n)</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>仅所选对象（%n 个）</numerusform>
         </translation>
     </message>
 </context>
@@ -981,20 +981,20 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message numerus="yes">
         <source>Session opened: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>已打开会话：%1（%n 个对象）</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Measurements restored: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>已恢复测量数据：%1（%n 个对象）</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Table imported: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>已导入表格：%1（%n 个对象）</numerusform>
         </translation>
     </message>
 </context>
@@ -1114,8 +1114,8 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message numerus="yes">
         <source>Move %n selected image(s) to the trash?</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>要将所选的 %n 张图像移到回收站吗？</numerusform>
         </translation>
     </message>
 </context>
@@ -1138,50 +1138,50 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <name>KvDeskGuideCommand</name>
     <message>
         <source>The user guide is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>未安装用户指南</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGuideWindow</name>
     <message>
         <source>User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>用户指南</translation>
     </message>
     <message>
         <source>Contents</source>
-        <translation type="unfinished"></translation>
+        <translation>目录</translation>
     </message>
     <message>
         <source>Back</source>
-        <translation type="unfinished"></translation>
+        <translation>后退</translation>
     </message>
     <message>
         <source>Forward</source>
-        <translation type="unfinished"></translation>
+        <translation>前进</translation>
     </message>
     <message>
         <source>Find in the guide</source>
-        <translation type="unfinished"></translation>
+        <translation>在指南中查找</translation>
     </message>
     <message>
         <source>Find previous</source>
-        <translation type="unfinished"></translation>
+        <translation>查找上一个</translation>
     </message>
     <message>
         <source>Find next</source>
-        <translation type="unfinished"></translation>
+        <translation>查找下一个</translation>
     </message>
     <message>
         <source>This is the first place</source>
-        <translation type="unfinished"></translation>
+        <translation>已是第一个位置</translation>
     </message>
     <message>
         <source>This is the last place</source>
-        <translation type="unfinished"></translation>
+        <translation>已是最后一个位置</translation>
     </message>
     <message>
         <source>Not found</source>
-        <translation type="unfinished"></translation>
+        <translation>未找到</translation>
     </message>
 </context>
 <context>
@@ -1509,8 +1509,8 @@ Dropped, because newer ones came first: %1</source>
     <message numerus="yes">
         <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%1（%n 个对象）</numerusform>
         </translation>
     </message>
 </context>
@@ -2261,35 +2261,35 @@ Reported by %2</source>
     <name>ZtFileFault</name>
     <message>
         <source>No such file or directory</source>
-        <translation type="unfinished"></translation>
+        <translation>没有那个文件或目录</translation>
     </message>
     <message>
         <source>Permission denied</source>
-        <translation type="unfinished"></translation>
+        <translation>权限不够</translation>
     </message>
     <message>
         <source>Is a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>是一个目录</translation>
     </message>
     <message>
         <source>Not a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>不是目录</translation>
     </message>
     <message>
         <source>File name too long</source>
-        <translation type="unfinished"></translation>
+        <translation>文件名过长</translation>
     </message>
     <message>
         <source>No space left on device</source>
-        <translation type="unfinished"></translation>
+        <translation>设备上没有空间</translation>
     </message>
     <message>
         <source>Read-only file system</source>
-        <translation type="unfinished"></translation>
+        <translation>只读文件系统</translation>
     </message>
     <message>
         <source>Input/output error</source>
-        <translation type="unfinished"></translation>
+        <translation>输入/输出错误</translation>
     </message>
 </context>
 <context>
@@ -2657,14 +2657,14 @@ Reported by %2</source>
     </message>
     <message numerus="yes">
         <source>The table has %n row(s), its first line announces %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>表格有 %n 行，但第一行声明为 %1 行</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>The row has %n field(s) instead of %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>该行有 %n 个字段，应为 %1 个</numerusform>
         </translation>
     </message>
 </context>

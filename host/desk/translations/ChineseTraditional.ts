@@ -386,11 +386,11 @@
     </message>
     <message>
         <source>&amp;User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>使用者指南(&amp;U)</translation>
     </message>
     <message>
         <source>Read the user guide</source>
-        <translation type="unfinished"></translation>
+        <translation>閱讀使用者指南</translation>
     </message>
 </context>
 <context>
@@ -575,7 +575,7 @@
     <message>
         <source>Calibrated: %1, %2 per pixel</source>
         <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>已校正：%1，每像素 %2</translation>
     </message>
 </context>
 <context>
@@ -820,8 +820,8 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message numerus="yes">
         <source>Only the selected object(s) (%n)</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>僅選取的物件（%n 個）</numerusform>
         </translation>
     </message>
 </context>
@@ -981,20 +981,20 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message numerus="yes">
         <source>Session opened: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>已開啟工作階段：%1（%n 個物件）</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Measurements restored: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>已還原量測資料：%1（%n 個物件）</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Table imported: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>已匯入表格：%1（%n 個物件）</numerusform>
         </translation>
     </message>
 </context>
@@ -1114,8 +1114,8 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     </message>
     <message numerus="yes">
         <source>Move %n selected image(s) to the trash?</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>要將選取的 %n 張影像移至垃圾桶嗎？</numerusform>
         </translation>
     </message>
 </context>
@@ -1138,50 +1138,50 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <name>KvDeskGuideCommand</name>
     <message>
         <source>The user guide is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>未安裝使用者指南</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGuideWindow</name>
     <message>
         <source>User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>使用者指南</translation>
     </message>
     <message>
         <source>Contents</source>
-        <translation type="unfinished"></translation>
+        <translation>目錄</translation>
     </message>
     <message>
         <source>Back</source>
-        <translation type="unfinished"></translation>
+        <translation>返回</translation>
     </message>
     <message>
         <source>Forward</source>
-        <translation type="unfinished"></translation>
+        <translation>前進</translation>
     </message>
     <message>
         <source>Find in the guide</source>
-        <translation type="unfinished"></translation>
+        <translation>在指南中尋找</translation>
     </message>
     <message>
         <source>Find previous</source>
-        <translation type="unfinished"></translation>
+        <translation>尋找上一個</translation>
     </message>
     <message>
         <source>Find next</source>
-        <translation type="unfinished"></translation>
+        <translation>尋找下一個</translation>
     </message>
     <message>
         <source>This is the first place</source>
-        <translation type="unfinished"></translation>
+        <translation>已是第一個位置</translation>
     </message>
     <message>
         <source>This is the last place</source>
-        <translation type="unfinished"></translation>
+        <translation>已是最後一個位置</translation>
     </message>
     <message>
         <source>Not found</source>
-        <translation type="unfinished"></translation>
+        <translation>找不到</translation>
     </message>
 </context>
 <context>
@@ -1509,8 +1509,8 @@ Dropped, because newer ones came first: %1</source>
     <message numerus="yes">
         <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%1（%n 個物件）</numerusform>
         </translation>
     </message>
 </context>
@@ -2261,35 +2261,35 @@ Reported by %2</source>
     <name>ZtFileFault</name>
     <message>
         <source>No such file or directory</source>
-        <translation type="unfinished"></translation>
+        <translation>沒有此一檔案或目錄</translation>
     </message>
     <message>
         <source>Permission denied</source>
-        <translation type="unfinished"></translation>
+        <translation>拒絕不符權限的操作</translation>
     </message>
     <message>
         <source>Is a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>是個目錄</translation>
     </message>
     <message>
         <source>Not a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>並不是一個目錄</translation>
     </message>
     <message>
         <source>File name too long</source>
-        <translation type="unfinished"></translation>
+        <translation>檔名太長</translation>
     </message>
     <message>
         <source>No space left on device</source>
-        <translation type="unfinished"></translation>
+        <translation>裝置上已無多餘空間</translation>
     </message>
     <message>
         <source>Read-only file system</source>
-        <translation type="unfinished"></translation>
+        <translation>唯讀的檔案系統</translation>
     </message>
     <message>
         <source>Input/output error</source>
-        <translation type="unfinished"></translation>
+        <translation>輸入/輸出錯誤</translation>
     </message>
 </context>
 <context>
@@ -2657,14 +2657,14 @@ Reported by %2</source>
     </message>
     <message numerus="yes">
         <source>The table has %n row(s), its first line announces %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>表格有 %n 列資料，但第一行宣告為 %1 列</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>The row has %n field(s) instead of %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>該列有 %n 個欄位，應為 %1 個</numerusform>
         </translation>
     </message>
 </context>

@@ -386,11 +386,11 @@
     </message>
     <message>
         <source>&amp;User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Guide de l’utilisateur</translation>
     </message>
     <message>
         <source>Read the user guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Lire le guide de l’utilisateur</translation>
     </message>
 </context>
 <context>
@@ -575,7 +575,7 @@
     <message>
         <source>Calibrated: %1, %2 per pixel</source>
         <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>Étalonné : %1, %2 par pixel</translation>
     </message>
 </context>
 <context>
@@ -820,9 +820,9 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     </message>
     <message numerus="yes">
         <source>Only the selected object(s) (%n)</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Uniquement l’objet sélectionné (%n)</numerusform>
+            <numerusform>Uniquement les objets sélectionnés (%n)</numerusform>
         </translation>
     </message>
 </context>
@@ -983,23 +983,23 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     </message>
     <message numerus="yes">
         <source>Session opened: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Session ouverte : %1 (%n objet)</numerusform>
+            <numerusform>Session ouverte : %1 (%n objets)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Measurements restored: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Mesures restaurées : %1 (%n objet)</numerusform>
+            <numerusform>Mesures restaurées : %1 (%n objets)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Table imported: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Tableau importé : %1 (%n objet)</numerusform>
+            <numerusform>Tableau importé : %1 (%n objets)</numerusform>
         </translation>
     </message>
 </context>
@@ -1119,9 +1119,9 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     </message>
     <message numerus="yes">
         <source>Move %n selected image(s) to the trash?</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Mettre %n image sélectionnée à la corbeille ?</numerusform>
+            <numerusform>Mettre %n images sélectionnées à la corbeille ?</numerusform>
         </translation>
     </message>
 </context>
@@ -1144,50 +1144,50 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     <name>KvDeskGuideCommand</name>
     <message>
         <source>The user guide is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>Le guide de l’utilisateur n’est pas installé</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGuideWindow</name>
     <message>
         <source>User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Guide de l’utilisateur</translation>
     </message>
     <message>
         <source>Contents</source>
-        <translation type="unfinished"></translation>
+        <translation>Sommaire</translation>
     </message>
     <message>
         <source>Back</source>
-        <translation type="unfinished"></translation>
+        <translation>Précédent</translation>
     </message>
     <message>
         <source>Forward</source>
-        <translation type="unfinished"></translation>
+        <translation>Suivant</translation>
     </message>
     <message>
         <source>Find in the guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Rechercher dans le guide</translation>
     </message>
     <message>
         <source>Find previous</source>
-        <translation type="unfinished"></translation>
+        <translation>Occurrence précédente</translation>
     </message>
     <message>
         <source>Find next</source>
-        <translation type="unfinished"></translation>
+        <translation>Occurrence suivante</translation>
     </message>
     <message>
         <source>This is the first place</source>
-        <translation type="unfinished"></translation>
+        <translation>C’est le premier endroit consulté</translation>
     </message>
     <message>
         <source>This is the last place</source>
-        <translation type="unfinished"></translation>
+        <translation>C’est le dernier endroit consulté</translation>
     </message>
     <message>
         <source>Not found</source>
-        <translation type="unfinished"></translation>
+        <translation>Introuvable</translation>
     </message>
 </context>
 <context>
@@ -1516,9 +1516,9 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     <message numerus="yes">
         <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%1 (%n objet)</numerusform>
+            <numerusform>%1 (%n objets)</numerusform>
         </translation>
     </message>
 </context>
@@ -2270,35 +2270,35 @@ Signalé par %2</translation>
     <name>ZtFileFault</name>
     <message>
         <source>No such file or directory</source>
-        <translation type="unfinished"></translation>
+        <translation>aucun fichier ou dossier de ce type</translation>
     </message>
     <message>
         <source>Permission denied</source>
-        <translation type="unfinished"></translation>
+        <translation>permission non accordée</translation>
     </message>
     <message>
         <source>Is a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>est un dossier</translation>
     </message>
     <message>
         <source>Not a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>n’est pas un dossier</translation>
     </message>
     <message>
         <source>File name too long</source>
-        <translation type="unfinished"></translation>
+        <translation>nom de fichier trop long</translation>
     </message>
     <message>
         <source>No space left on device</source>
-        <translation type="unfinished"></translation>
+        <translation>aucun espace disponible sur le périphérique</translation>
     </message>
     <message>
         <source>Read-only file system</source>
-        <translation type="unfinished"></translation>
+        <translation>système de fichiers accessible en lecture seulement</translation>
     </message>
     <message>
         <source>Input/output error</source>
-        <translation type="unfinished"></translation>
+        <translation>erreur d’entrée/sortie</translation>
     </message>
 </context>
 <context>
@@ -2666,16 +2666,16 @@ Signalé par %2</translation>
     </message>
     <message numerus="yes">
         <source>The table has %n row(s), its first line announces %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Le tableau a %n ligne, sa première ligne en annonce %1</numerusform>
+            <numerusform>Le tableau a %n lignes, sa première ligne en annonce %1</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>The row has %n field(s) instead of %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>La ligne a %n champ au lieu de %1</numerusform>
+            <numerusform>La ligne a %n champs au lieu de %1</numerusform>
         </translation>
     </message>
 </context>

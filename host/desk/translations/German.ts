@@ -386,11 +386,11 @@
     </message>
     <message>
         <source>&amp;User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Benutzerhandbuch</translation>
     </message>
     <message>
         <source>Read the user guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Benutzerhandbuch lesen</translation>
     </message>
 </context>
 <context>
@@ -575,7 +575,7 @@
     <message>
         <source>Calibrated: %1, %2 per pixel</source>
         <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>Kalibriert: %1, %2 pro Pixel</translation>
     </message>
 </context>
 <context>
@@ -820,9 +820,9 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     </message>
     <message numerus="yes">
         <source>Only the selected object(s) (%n)</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Nur das ausgewählte Objekt (%n)</numerusform>
+            <numerusform>Nur die ausgewählten Objekte (%n)</numerusform>
         </translation>
     </message>
 </context>
@@ -983,23 +983,23 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     </message>
     <message numerus="yes">
         <source>Session opened: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Sitzung geöffnet: %1 (%n Objekt)</numerusform>
+            <numerusform>Sitzung geöffnet: %1 (%n Objekte)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Measurements restored: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Messungen wiederhergestellt: %1 (%n Objekt)</numerusform>
+            <numerusform>Messungen wiederhergestellt: %1 (%n Objekte)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Table imported: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Tabelle importiert: %1 (%n Objekt)</numerusform>
+            <numerusform>Tabelle importiert: %1 (%n Objekte)</numerusform>
         </translation>
     </message>
 </context>
@@ -1119,9 +1119,9 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     </message>
     <message numerus="yes">
         <source>Move %n selected image(s) to the trash?</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%n ausgewähltes Bild in den Papierkorb verschieben?</numerusform>
+            <numerusform>%n ausgewählte Bilder in den Papierkorb verschieben?</numerusform>
         </translation>
     </message>
 </context>
@@ -1144,50 +1144,50 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     <name>KvDeskGuideCommand</name>
     <message>
         <source>The user guide is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>Das Benutzerhandbuch ist nicht installiert</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGuideWindow</name>
     <message>
         <source>User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Benutzerhandbuch</translation>
     </message>
     <message>
         <source>Contents</source>
-        <translation type="unfinished"></translation>
+        <translation>Inhalt</translation>
     </message>
     <message>
         <source>Back</source>
-        <translation type="unfinished"></translation>
+        <translation>Zurück</translation>
     </message>
     <message>
         <source>Forward</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorwärts</translation>
     </message>
     <message>
         <source>Find in the guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Im Handbuch suchen</translation>
     </message>
     <message>
         <source>Find previous</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorherige Fundstelle</translation>
     </message>
     <message>
         <source>Find next</source>
-        <translation type="unfinished"></translation>
+        <translation>Nächste Fundstelle</translation>
     </message>
     <message>
         <source>This is the first place</source>
-        <translation type="unfinished"></translation>
+        <translation>Dies ist die erste aufgerufene Stelle</translation>
     </message>
     <message>
         <source>This is the last place</source>
-        <translation type="unfinished"></translation>
+        <translation>Dies ist die letzte aufgerufene Stelle</translation>
     </message>
     <message>
         <source>Not found</source>
-        <translation type="unfinished"></translation>
+        <translation>Nicht gefunden</translation>
     </message>
 </context>
 <context>
@@ -1516,9 +1516,9 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
     <message numerus="yes">
         <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%1 (%n Objekt)</numerusform>
+            <numerusform>%1 (%n Objekte)</numerusform>
         </translation>
     </message>
 </context>
@@ -2270,35 +2270,35 @@ Gemeldet von %2</translation>
     <name>ZtFileFault</name>
     <message>
         <source>No such file or directory</source>
-        <translation type="unfinished"></translation>
+        <translation>Datei oder Verzeichnis nicht gefunden</translation>
     </message>
     <message>
         <source>Permission denied</source>
-        <translation type="unfinished"></translation>
+        <translation>keine Berechtigung</translation>
     </message>
     <message>
         <source>Is a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>ist ein Verzeichnis</translation>
     </message>
     <message>
         <source>Not a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>ist kein Verzeichnis</translation>
     </message>
     <message>
         <source>File name too long</source>
-        <translation type="unfinished"></translation>
+        <translation>der Dateiname ist zu lang</translation>
     </message>
     <message>
         <source>No space left on device</source>
-        <translation type="unfinished"></translation>
+        <translation>auf dem Gerät ist kein Speicherplatz mehr verfügbar</translation>
     </message>
     <message>
         <source>Read-only file system</source>
-        <translation type="unfinished"></translation>
+        <translation>das Dateisystem ist nur lesbar</translation>
     </message>
     <message>
         <source>Input/output error</source>
-        <translation type="unfinished"></translation>
+        <translation>Eingabe-/Ausgabefehler</translation>
     </message>
 </context>
 <context>
@@ -2666,16 +2666,16 @@ Gemeldet von %2</translation>
     </message>
     <message numerus="yes">
         <source>The table has %n row(s), its first line announces %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Die Tabelle hat %n Datenzeile, ihre erste Zeile kündigt %1 an</numerusform>
+            <numerusform>Die Tabelle hat %n Datenzeilen, ihre erste Zeile kündigt %1 an</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>The row has %n field(s) instead of %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Die Zeile hat %n Feld statt %1</numerusform>
+            <numerusform>Die Zeile hat %n Felder statt %1</numerusform>
         </translation>
     </message>
 </context>

@@ -386,11 +386,11 @@
     </message>
     <message>
         <source>&amp;User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Guida utente</translation>
     </message>
     <message>
         <source>Read the user guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Leggi la guida utente</translation>
     </message>
 </context>
 <context>
@@ -575,7 +575,7 @@
     <message>
         <source>Calibrated: %1, %2 per pixel</source>
         <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>Calibrato: %1, %2 per pixel</translation>
     </message>
 </context>
 <context>
@@ -820,9 +820,9 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     </message>
     <message numerus="yes">
         <source>Only the selected object(s) (%n)</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Solo l&apos;oggetto selezionato (%n)</numerusform>
+            <numerusform>Solo gli oggetti selezionati (%n)</numerusform>
         </translation>
     </message>
 </context>
@@ -983,23 +983,23 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     </message>
     <message numerus="yes">
         <source>Session opened: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Sessione aperta: %1 (%n oggetto)</numerusform>
+            <numerusform>Sessione aperta: %1 (%n oggetti)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Measurements restored: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Misure recuperate: %1 (%n oggetto)</numerusform>
+            <numerusform>Misure recuperate: %1 (%n oggetti)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Table imported: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Tabella importata: %1 (%n oggetto)</numerusform>
+            <numerusform>Tabella importata: %1 (%n oggetti)</numerusform>
         </translation>
     </message>
 </context>
@@ -1119,9 +1119,9 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     </message>
     <message numerus="yes">
         <source>Move %n selected image(s) to the trash?</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Spostare %n immagine selezionata nel cestino?</numerusform>
+            <numerusform>Spostare %n immagini selezionate nel cestino?</numerusform>
         </translation>
     </message>
 </context>
@@ -1144,50 +1144,50 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     <name>KvDeskGuideCommand</name>
     <message>
         <source>The user guide is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>La guida utente non è installata</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGuideWindow</name>
     <message>
         <source>User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Guida utente</translation>
     </message>
     <message>
         <source>Contents</source>
-        <translation type="unfinished"></translation>
+        <translation>Sommario</translation>
     </message>
     <message>
         <source>Back</source>
-        <translation type="unfinished"></translation>
+        <translation>Indietro</translation>
     </message>
     <message>
         <source>Forward</source>
-        <translation type="unfinished"></translation>
+        <translation>Avanti</translation>
     </message>
     <message>
         <source>Find in the guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Trova nella guida</translation>
     </message>
     <message>
         <source>Find previous</source>
-        <translation type="unfinished"></translation>
+        <translation>Trova precedente</translation>
     </message>
     <message>
         <source>Find next</source>
-        <translation type="unfinished"></translation>
+        <translation>Trova successivo</translation>
     </message>
     <message>
         <source>This is the first place</source>
-        <translation type="unfinished"></translation>
+        <translation>Questo è il primo punto visitato</translation>
     </message>
     <message>
         <source>This is the last place</source>
-        <translation type="unfinished"></translation>
+        <translation>Questo è l&apos;ultimo punto visitato</translation>
     </message>
     <message>
         <source>Not found</source>
-        <translation type="unfinished"></translation>
+        <translation>Non trovato</translation>
     </message>
 </context>
 <context>
@@ -1516,9 +1516,9 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     <message numerus="yes">
         <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%1 (%n oggetto)</numerusform>
+            <numerusform>%1 (%n oggetti)</numerusform>
         </translation>
     </message>
 </context>
@@ -2270,35 +2270,35 @@ Segnalato da %2</translation>
     <name>ZtFileFault</name>
     <message>
         <source>No such file or directory</source>
-        <translation type="unfinished"></translation>
+        <translation>file o directory non esistente</translation>
     </message>
     <message>
         <source>Permission denied</source>
-        <translation type="unfinished"></translation>
+        <translation>permesso negato</translation>
     </message>
     <message>
         <source>Is a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>è una directory</translation>
     </message>
     <message>
         <source>Not a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>non è una directory</translation>
     </message>
     <message>
         <source>File name too long</source>
-        <translation type="unfinished"></translation>
+        <translation>nome del file troppo lungo</translation>
     </message>
     <message>
         <source>No space left on device</source>
-        <translation type="unfinished"></translation>
+        <translation>spazio esaurito sul device</translation>
     </message>
     <message>
         <source>Read-only file system</source>
-        <translation type="unfinished"></translation>
+        <translation>file system in sola lettura</translation>
     </message>
     <message>
         <source>Input/output error</source>
-        <translation type="unfinished"></translation>
+        <translation>errore di input/output</translation>
     </message>
 </context>
 <context>
@@ -2666,16 +2666,16 @@ Segnalato da %2</translation>
     </message>
     <message numerus="yes">
         <source>The table has %n row(s), its first line announces %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>La tabella ha %n riga, ma la prima riga del file ne annuncia %1</numerusform>
+            <numerusform>La tabella ha %n righe, ma la prima riga del file ne annuncia %1</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>The row has %n field(s) instead of %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>La riga ha %n campo invece di %1</numerusform>
+            <numerusform>La riga ha %n campi invece di %1</numerusform>
         </translation>
     </message>
 </context>

@@ -386,11 +386,11 @@
     </message>
     <message>
         <source>&amp;User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Používateľská príručka</translation>
     </message>
     <message>
         <source>Read the user guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Prečítať používateľskú príručku</translation>
     </message>
 </context>
 <context>
@@ -575,7 +575,7 @@
     <message>
         <source>Calibrated: %1, %2 per pixel</source>
         <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>Kalibrované: %1, %2 na pixel</translation>
     </message>
 </context>
 <context>
@@ -820,10 +820,10 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     </message>
     <message numerus="yes">
         <source>Only the selected object(s) (%n)</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Iba vybraný objekt (%n)</numerusform>
+            <numerusform>Iba vybrané objekty (%n)</numerusform>
+            <numerusform>Iba vybrané objekty (%n)</numerusform>
         </translation>
     </message>
 </context>
@@ -985,26 +985,26 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     </message>
     <message numerus="yes">
         <source>Session opened: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Relácia otvorená: %1 (%n objekt)</numerusform>
+            <numerusform>Relácia otvorená: %1 (%n objekty)</numerusform>
+            <numerusform>Relácia otvorená: %1 (%n objektov)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Measurements restored: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Merania obnovené: %1 (%n objekt)</numerusform>
+            <numerusform>Merania obnovené: %1 (%n objekty)</numerusform>
+            <numerusform>Merania obnovené: %1 (%n objektov)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Table imported: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Tabuľka importovaná: %1 (%n objekt)</numerusform>
+            <numerusform>Tabuľka importovaná: %1 (%n objekty)</numerusform>
+            <numerusform>Tabuľka importovaná: %1 (%n objektov)</numerusform>
         </translation>
     </message>
 </context>
@@ -1124,10 +1124,10 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     </message>
     <message numerus="yes">
         <source>Move %n selected image(s) to the trash?</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Presunúť %n vybraný obrázok do koša?</numerusform>
+            <numerusform>Presunúť %n vybrané obrázky do koša?</numerusform>
+            <numerusform>Presunúť %n vybraných obrázkov do koša?</numerusform>
         </translation>
     </message>
 </context>
@@ -1150,50 +1150,50 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     <name>KvDeskGuideCommand</name>
     <message>
         <source>The user guide is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>Používateľská príručka nie je nainštalovaná</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGuideWindow</name>
     <message>
         <source>User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Používateľská príručka</translation>
     </message>
     <message>
         <source>Contents</source>
-        <translation type="unfinished"></translation>
+        <translation>Obsah</translation>
     </message>
     <message>
         <source>Back</source>
-        <translation type="unfinished"></translation>
+        <translation>Späť</translation>
     </message>
     <message>
         <source>Forward</source>
-        <translation type="unfinished"></translation>
+        <translation>Dopredu</translation>
     </message>
     <message>
         <source>Find in the guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Hľadať v príručke</translation>
     </message>
     <message>
         <source>Find previous</source>
-        <translation type="unfinished"></translation>
+        <translation>Hľadať predchádzajúce</translation>
     </message>
     <message>
         <source>Find next</source>
-        <translation type="unfinished"></translation>
+        <translation>Hľadať ďalšie</translation>
     </message>
     <message>
         <source>This is the first place</source>
-        <translation type="unfinished"></translation>
+        <translation>Toto je prvé navštívené miesto</translation>
     </message>
     <message>
         <source>This is the last place</source>
-        <translation type="unfinished"></translation>
+        <translation>Toto je posledné navštívené miesto</translation>
     </message>
     <message>
         <source>Not found</source>
-        <translation type="unfinished"></translation>
+        <translation>Nenájdené</translation>
     </message>
 </context>
 <context>
@@ -1523,10 +1523,10 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     <message numerus="yes">
         <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%1 (%n objekt)</numerusform>
+            <numerusform>%1 (%n objekty)</numerusform>
+            <numerusform>%1 (%n objektov)</numerusform>
         </translation>
     </message>
 </context>
@@ -2279,35 +2279,35 @@ Ohlásil: %2</translation>
     <name>ZtFileFault</name>
     <message>
         <source>No such file or directory</source>
-        <translation type="unfinished"></translation>
+        <translation>adresár alebo súbor neexistuje</translation>
     </message>
     <message>
         <source>Permission denied</source>
-        <translation type="unfinished"></translation>
+        <translation>prístup odmietnutý</translation>
     </message>
     <message>
         <source>Is a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>je adresár</translation>
     </message>
     <message>
         <source>Not a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>nie je adresár</translation>
     </message>
     <message>
         <source>File name too long</source>
-        <translation type="unfinished"></translation>
+        <translation>meno súboru príliš dlhé</translation>
     </message>
     <message>
         <source>No space left on device</source>
-        <translation type="unfinished"></translation>
+        <translation>na zariadení už nie je žiadne miesto</translation>
     </message>
     <message>
         <source>Read-only file system</source>
-        <translation type="unfinished"></translation>
+        <translation>súborový systém dovoľuje len čítanie</translation>
     </message>
     <message>
         <source>Input/output error</source>
-        <translation type="unfinished"></translation>
+        <translation>chyba vstupu/výstupu</translation>
     </message>
 </context>
 <context>
@@ -2675,18 +2675,18 @@ Ohlásil: %2</translation>
     </message>
     <message numerus="yes">
         <source>The table has %n row(s), its first line announces %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Tabuľka má %n riadok, ale jej prvý riadok ohlasuje %1</numerusform>
+            <numerusform>Tabuľka má %n riadky, ale jej prvý riadok ohlasuje %1</numerusform>
+            <numerusform>Tabuľka má %n riadkov, ale jej prvý riadok ohlasuje %1</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>The row has %n field(s) instead of %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Riadok má %n pole namiesto %1</numerusform>
+            <numerusform>Riadok má %n polia namiesto %1</numerusform>
+            <numerusform>Riadok má %n polí namiesto %1</numerusform>
         </translation>
     </message>
 </context>

@@ -386,11 +386,11 @@
     </message>
     <message>
         <source>&amp;User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Guía del usuario</translation>
     </message>
     <message>
         <source>Read the user guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Leer la guía del usuario</translation>
     </message>
 </context>
 <context>
@@ -575,7 +575,7 @@
     <message>
         <source>Calibrated: %1, %2 per pixel</source>
         <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
-        <translation type="unfinished"></translation>
+        <translation>Calibrado: %1, %2 por píxel</translation>
     </message>
 </context>
 <context>
@@ -820,9 +820,9 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     </message>
     <message numerus="yes">
         <source>Only the selected object(s) (%n)</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Solo el objeto seleccionado (%n)</numerusform>
+            <numerusform>Solo los objetos seleccionados (%n)</numerusform>
         </translation>
     </message>
 </context>
@@ -983,23 +983,23 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     </message>
     <message numerus="yes">
         <source>Session opened: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Sesión abierta: %1 (%n objeto)</numerusform>
+            <numerusform>Sesión abierta: %1 (%n objetos)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Measurements restored: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Mediciones recuperadas: %1 (%n objeto)</numerusform>
+            <numerusform>Mediciones recuperadas: %1 (%n objetos)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Table imported: %1 (%n object(s))</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>Tabla importada: %1 (%n objeto)</numerusform>
+            <numerusform>Tabla importada: %1 (%n objetos)</numerusform>
         </translation>
     </message>
 </context>
@@ -1119,9 +1119,9 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     </message>
     <message numerus="yes">
         <source>Move %n selected image(s) to the trash?</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>¿Desea mover %n imagen seleccionada a la papelera?</numerusform>
+            <numerusform>¿Desea mover %n imágenes seleccionadas a la papelera?</numerusform>
         </translation>
     </message>
 </context>
@@ -1144,50 +1144,50 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     <name>KvDeskGuideCommand</name>
     <message>
         <source>The user guide is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>La guía del usuario no está instalada</translation>
     </message>
 </context>
 <context>
     <name>KvDeskGuideWindow</name>
     <message>
         <source>User guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Guía del usuario</translation>
     </message>
     <message>
         <source>Contents</source>
-        <translation type="unfinished"></translation>
+        <translation>Contenido</translation>
     </message>
     <message>
         <source>Back</source>
-        <translation type="unfinished"></translation>
+        <translation>Atrás</translation>
     </message>
     <message>
         <source>Forward</source>
-        <translation type="unfinished"></translation>
+        <translation>Adelante</translation>
     </message>
     <message>
         <source>Find in the guide</source>
-        <translation type="unfinished"></translation>
+        <translation>Buscar en la guía</translation>
     </message>
     <message>
         <source>Find previous</source>
-        <translation type="unfinished"></translation>
+        <translation>Buscar anterior</translation>
     </message>
     <message>
         <source>Find next</source>
-        <translation type="unfinished"></translation>
+        <translation>Buscar siguiente</translation>
     </message>
     <message>
         <source>This is the first place</source>
-        <translation type="unfinished"></translation>
+        <translation>Este es el primer lugar visitado</translation>
     </message>
     <message>
         <source>This is the last place</source>
-        <translation type="unfinished"></translation>
+        <translation>Este es el último lugar visitado</translation>
     </message>
     <message>
         <source>Not found</source>
-        <translation type="unfinished"></translation>
+        <translation>No encontrado</translation>
     </message>
 </context>
 <context>
@@ -1516,9 +1516,9 @@ Descartados porque llegaron antes otros más nuevos: %1</translation>
     <message numerus="yes">
         <source>%1 (%n object(s))</source>
         <extracomment>%1 is the name of a session</extracomment>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>%1 (%n objeto)</numerusform>
+            <numerusform>%1 (%n objetos)</numerusform>
         </translation>
     </message>
 </context>
@@ -2270,35 +2270,35 @@ Notificado por %2</translation>
     <name>ZtFileFault</name>
     <message>
         <source>No such file or directory</source>
-        <translation type="unfinished"></translation>
+        <translation>no existe el fichero o el directorio</translation>
     </message>
     <message>
         <source>Permission denied</source>
-        <translation type="unfinished"></translation>
+        <translation>permiso denegado</translation>
     </message>
     <message>
         <source>Is a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>es un directorio</translation>
     </message>
     <message>
         <source>Not a directory</source>
-        <translation type="unfinished"></translation>
+        <translation>no es un directorio</translation>
     </message>
     <message>
         <source>File name too long</source>
-        <translation type="unfinished"></translation>
+        <translation>nombre de fichero demasiado largo</translation>
     </message>
     <message>
         <source>No space left on device</source>
-        <translation type="unfinished"></translation>
+        <translation>no queda espacio en el dispositivo</translation>
     </message>
     <message>
         <source>Read-only file system</source>
-        <translation type="unfinished"></translation>
+        <translation>sistema de ficheros de solo lectura</translation>
     </message>
     <message>
         <source>Input/output error</source>
-        <translation type="unfinished"></translation>
+        <translation>error de entrada/salida</translation>
     </message>
 </context>
 <context>
@@ -2666,16 +2666,16 @@ Notificado por %2</translation>
     </message>
     <message numerus="yes">
         <source>The table has %n row(s), its first line announces %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>La tabla tiene %n fila, pero su primera línea anuncia %1</numerusform>
+            <numerusform>La tabla tiene %n filas, pero su primera línea anuncia %1</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>The row has %n field(s) instead of %1</source>
-        <translation type="unfinished">
-            <numerusform></numerusform>
-            <numerusform></numerusform>
+        <translation>
+            <numerusform>La fila tiene %n campo en lugar de %1</numerusform>
+            <numerusform>La fila tiene %n campos en lugar de %1</numerusform>
         </translation>
     </message>
 </context>
