@@ -4,10 +4,8 @@
 #include <QAction>
 #include <QRegularExpression>
 
-namespace {
-
 // Languages without letters of their own put the shortcut's behind the text: "(&O)".
-QString plainText(QString text)
+QString KvDeskActionButton::plainText(QString text)
 {
     static const QRegularExpression letterBehind(QStringLiteral("\\s?\\(&\\w\\)"));
     text.remove(letterBehind);
@@ -16,8 +14,6 @@ QString plainText(QString text)
         text.chop(3);
     return text;
 }
-
-} // namespace
 
 KvDeskActionButton::KvDeskActionButton(QAction *action, QWidget *parent)
     : QPushButton(parent)

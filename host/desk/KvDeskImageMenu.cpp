@@ -1,9 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskImageMenu.h"
 
+#include "KvDeskActionButton.h"
 #include "KvDeskActions.h"
 #include "KvDeskImageView.h"
 
+#include <QAction>
 #include <QGuiApplication>
 
 KvDeskImageMenu::KvDeskImageMenu(KvDeskActions *actions, KvDeskImageView *view)
@@ -23,8 +25,19 @@ KvDeskImageMenu::KvDeskImageMenu(KvDeskActions *actions, KvDeskImageView *view)
     addSeparator();
     add({A::SelectAll});
     addSeparator();
-    add({A::ZoomFit, A::ZoomActual});
+    addWithoutLetter(actions->action(A::ZoomFit));
+    addWithoutLetter(actions->action(A::ZoomActual));
     connect(view, SIGNAL(signalMenuRequested(QPoint)), this, SLOT(slotShow(QPoint)));
+}
+
+// In the menus of the window it stands among others: here its letter may be another command's.
+void KvDeskImageMenu::addWithoutLetter(QAction *action)
+{
+    const QString keys = action->shortcut().toString(QKeySequence::NativeText);
+    QAction *const shown =
+        addAction(action->icon(), KvDeskActionButton::plainText(action->text()) + QLatin1Char('\t') + keys,
+                  action, SLOT(trigger()));
+    shown->setToolTip(action->toolTip());
 }
 
 void KvDeskImageMenu::slotShow(const QPoint &aPosition)

@@ -14,6 +14,9 @@ public:
     /** Belongs to \a view. */
     KvDeskImageMenu(KvDeskActions *actions, KvDeskImageView *view);
 
+private:
+    void addWithoutLetter(QAction *action);
+
 private slots:
     void slotShow(const QPoint &aPosition);
 };

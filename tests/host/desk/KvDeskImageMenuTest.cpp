@@ -35,6 +35,7 @@ private slots:
     void draggingHasNoMenu();
     void startPageHasNoMenu();
     void actsOnTheSelection();
+    void zooms();
     void readsInTheProgramsDirection();
 
 private:
@@ -98,8 +99,10 @@ void KvDeskImageMenuTest::offersWhatCanBeDone()
     QStringList texts;
     for (const QAction *const action : m_menu->actions())
         texts.append(action->text());
-    QCOMPARE(texts.join(QLatin1Char('|')),
-             QStringLiteral("Re&name||Cu&t|&Copy|&Paste|&Delete||Select &all||&Fit to window|&Actual size"));
+    QCOMPARE(
+        texts.join(QLatin1Char('|')),
+        QStringLiteral(
+            "Re&name||Cu&t|&Copy|&Paste|&Delete||Select &all||Fit to window\tCtrl+0|Actual size\tCtrl+1"));
     // What is not possible says why.
     QVERIFY(m_menu->toolTipsVisible());
 }
@@ -212,6 +215,21 @@ void KvDeskImageMenuTest::actsOnTheSelection()
     QVERIFY(isShown());
     QVERIFY(!m_actions->action(KvDeskActions::Delete)->isEnabled());
     QVERIFY(m_actions->action(KvDeskActions::SelectAll)->isEnabled());
+}
+
+void KvDeskImageMenuTest::zooms()
+{
+    connect(m_actions->action(KvDeskActions::ZoomFit), SIGNAL(triggered()), &m_desk->view,
+                                                              SLOT(slotZoomFit()));
+    connect(m_actions->action(KvDeskActions::ZoomActual), SIGNAL(triggered()), &m_desk->view,
+                                                                 SLOT(slotZoomActual()));
+    const QList<QAction *> all = m_menu->actions();
+    QVERIFY(!m_desk->view.isFitted());
+    all.at(all.size() - 2)->trigger();
+    QVERIFY(m_desk->view.isFitted());
+    all.last()->trigger();
+    QVERIFY(!m_desk->view.isFitted());
+    QCOMPARE(m_desk->view.zoom(), 1.0);
 }
 
 void KvDeskImageMenuTest::readsInTheProgramsDirection()
