@@ -30,8 +30,8 @@ set(CPACK_DEBIAN_HOST_PACKAGE_SECTION libs)
 set(CPACK_DEBIAN_HOST_PACKAGE_CONTROL_EXTRA ${PROJECT_SOURCE_DIR}/packaging/linux/triggers
   ${PROJECT_BINARY_DIR}/none/postinst ${PROJECT_BINARY_DIR}/none/postrm)
 set(CPACK_COMPONENT_HOST_DESCRIPTION "libraries that measuring applications and report plug-ins share
- The contract between an image-measurement application and its report plug-ins:
- object types and measured objects, frames, signals, settings, tools, themes.")
+The contract between an image-measurement application and its report plug-ins:
+object types and measured objects, frames, signals, settings, tools, themes.")
 
 set(CPACK_DEBIAN_DESK_PACKAGE_NAME measuringdesk)
 set(CPACK_DEBIAN_DESK_PACKAGE_SECTION science)
@@ -39,23 +39,23 @@ set(CPACK_DEBIAN_DESK_PACKAGE_DEPENDS "libstatreporthost${PROJECT_VERSION_MAJOR}
 set(CPACK_DEBIAN_DESK_PACKAGE_RECOMMENDS
   "statreport-plugin ${exact}, fonts-open-sans, fonts-noto-core, fonts-noto-cjk, qttranslations5-l10n")
 set(CPACK_COMPONENT_DESK_DESCRIPTION "measure objects on microscope and camera images
- Opens an image or a camera, is calibrated, and measures lengths, angles,
- areas, diameters and counts. With the report plug-in its values go into PDF
- reports.
- The command-line program statreport makes the same reports without a display.")
+Opens an image or a camera, is calibrated, and measures lengths, angles,
+areas, diameters and counts. With the report plug-in its values go into PDF
+reports.
+The command-line program statreport makes the same reports without a display.")
 
 set(CPACK_DEBIAN_PLUGIN_PACKAGE_NAME statreport-plugin)
 set(CPACK_DEBIAN_PLUGIN_PACKAGE_SECTION science)
 set(CPACK_DEBIAN_PLUGIN_PACKAGE_DEPENDS "libstatreporthost${PROJECT_VERSION_MAJOR} ${exact}")
 set(CPACK_DEBIAN_PLUGIN_PACKAGE_ENHANCES measuringdesk)
 set(CPACK_COMPONENT_PLUGIN_DESCRIPTION "statistics reports for image-measurement applications
- A plug-in with a templates editor, live statistics and PDF reports of what was
- measured, and templates to start from.")
+A plug-in with a templates editor, live statistics and PDF reports of what was
+measured, and templates to start from.")
 
 set(CPACK_DEBIAN_SDK_PACKAGE_NAME libstatreporthost-dev)
 set(CPACK_DEBIAN_SDK_PACKAGE_SECTION libdevel)
 set(CPACK_DEBIAN_SDK_PACKAGE_DEPENDS "libstatreporthost${PROJECT_VERSION_MAJOR} ${exact}, qtbase5-dev")
 set(CPACK_COMPONENT_SDK_DESCRIPTION "headers for applications that load report plug-ins
- Headers, a CMake package (StatReportHost) and a minimal application.")
+Headers, a CMake package (StatReportHost) and a minimal application.")
 
 include(CPack)

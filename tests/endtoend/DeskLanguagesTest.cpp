@@ -6,6 +6,8 @@
 #include "KvDeskCalibrationDialog.h"
 #include "KvDeskCalibrator.h"
 #include "KvDeskExportDialog.h"
+#include "KvDeskGuideCommand.h"
+#include "KvDeskGuideWindow.h"
 #include "KvDeskImageView.h"
 #include "KvDeskLanguages.h"
 #include "KvDeskLiveBar.h"
@@ -280,6 +282,9 @@ void DeskLanguagesTest::everyDialogHasRoom()
         calibration->wayButton(way)->click();
         look(calibration, "calibration");
     }
+    KvDeskGuideWindow guide(KvDeskGuideCommand::guide());
+    guide.show();
+    look(&guide, "guide");
     QVERIFY2(m_faults.isEmpty(), lines(m_faults));
 }
 
