@@ -435,7 +435,7 @@ void DeskMeasuringTest::exportsAndImportsAgain()
     QTRY_COMPARE(shown()->rowCount(), 2 * before.size());
     QCOMPARE(window()->session()->objectCount(), 6);
     QCOMPARE(dialogs.dialogs().size(), 2);
-    // Those of the file come last; they are shown with all digits that it has.
+    // Those of the file come last; all digits that it has are kept.
     const KvDeskValueTableModel *const model = window()->valueTable()->model();
     for (int row = 0; row < before.size(); ++row) {
         const int imported = row + before.size();
