@@ -44,4 +44,5 @@ private:
     QVector<KvDeskObjectId> m_counters; ///< in the order of the list
     QComboBox *m_classes = nullptr;
     QToolButton *m_newClass = nullptr;
+    QWidget *m_hint = nullptr;
 };
