@@ -94,6 +94,7 @@ void KvDeskLiveBar::resizeEvent(QResizeEvent *event)
     m_layout->setDirection(isNarrow ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
     m_layout->setSpacing(isNarrow ? thinMargin : groupSpacing);
     m_exposure->setCompact(isNarrow);
+    updateGeometry();
 }
 
 void KvDeskLiveBar::connectSignals()

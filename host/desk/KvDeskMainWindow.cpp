@@ -62,7 +62,7 @@ namespace {
 constexpr QSize firstSize(1280, 800);
 constexpr QSize smallestSize(800, 528);
 constexpr int valuesWidth = 416;
-constexpr QSize leastImageSize(280, 200); ///< the panels give way first
+constexpr QSize leastImageSize(280, 248); ///< the panels give way first
 constexpr int logHeight = 144;
 constexpr int galleryHeight = 188; ///< one row of thumbnails
 

@@ -87,6 +87,7 @@ void KvDeskRecoveryBar::placeButtons()
     m_layout->setDirection(isNarrow ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
     // The menu of the others names it, too.
     m_session->setVisible(!isNarrow);
+    updateGeometry();
 }
 
 QString KvDeskRecoveryBar::text() const

@@ -45,7 +45,6 @@ KvDeskStepRow::KvDeskStepRow(int number, const QString &title, const QString &te
     m_buttons->setSpacing(controlSpacing);
     // The buttons stand at the end of their line.
     m_buttons->addStretch();
-    m_layout->setContentsMargins(groupSpacing, controlSpacing, groupSpacing, controlSpacing);
     m_layout->addLayout(m_head, 1);
     m_layout->addLayout(m_buttons);
     setNarrow(false);
@@ -82,11 +81,14 @@ void KvDeskStepRow::setNarrow(bool isNarrow)
 {
     m_layout->setDirection(isNarrow ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
     m_layout->setSpacing(isNarrow ? controlSpacing : groupSpacing);
+    const int side = isNarrow ? controlSpacing : groupSpacing;
+    m_layout->setContentsMargins(side, controlSpacing, side, controlSpacing);
 }
 
 QSize KvDeskStepRow::minimumSizeHint() const
 {
     const int content = qMax(m_head->minimumSize().width(), m_buttons->minimumSize().width());
-    const QMargins margins = m_layout->contentsMargins() + contentsMargins();
-    return QSize(content + margins.left() + margins.right(), QFrame::minimumSizeHint().height());
+    const QMargins frame = contentsMargins();
+    return QSize(content + 2 * controlSpacing + frame.left() + frame.right(),
+                 QFrame::minimumSizeHint().height());
 }

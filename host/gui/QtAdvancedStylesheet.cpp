@@ -207,9 +207,12 @@ void QtAdvancedStylesheet::applyTo(QApplication *application) const
 
     substituteFonts();
     QFont font(bodyFont);
-    // Only where the language asks for it: whoever sets a family alone still gets these behind it.
-    if (m_bodyFamilies.size() > 1)
+    if (m_bodyFamilies.size() > 1) {
         font.setFamilies(m_bodyFamilies);
+        // Fonts that differ only in what comes behind the first family share one in memory, and fonts of
+        // report pages must not share these.
+        font.setStyleStrategy(QFont::PreferQuality);
+    }
     font.setPixelSize(bodyPixelSize);
     setStyleOnce(application);
     QApplication::setPalette(palette());

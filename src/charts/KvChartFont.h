@@ -18,6 +18,7 @@ inline QFont make(qreal pointSize, QFont::Weight weight = QFont::Normal)
     // All of them: what a font leaves open, widgets take from the application, whose fonts go by its
     // language.
     font.setFamilies({font.family()});
+    font.setStyleStrategy(QFont::PreferDefault);
     font.setPointSizeF(pointSize);
     font.setWeight(weight);
     font.setLetterSpacing(QFont::AbsoluteSpacing, kSmallestSpacing);

@@ -21,6 +21,7 @@ inline QFont make(int pixelSize, QFont::Weight weight = QFont::Normal)
     // All of them: what a font leaves open, widgets take from the application, whose fonts go by its
     // language.
     font.setFamilies({font.family()});
+    font.setStyleStrategy(QFont::PreferDefault);
     font.setPixelSize(pixelSize);
     font.setWeight(weight);
     font.setLetterSpacing(QFont::AbsoluteSpacing, kSmallestSpacing);

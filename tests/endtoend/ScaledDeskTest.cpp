@@ -188,7 +188,10 @@ void ScaledDeskTest::windowsFitTheScreen()
             continue;
         const QSize least = widget->minimumSize();
         QVERIFY2(least.width() <= screen.width() && least.height() <= screen.height(),
-                 widget->metaObject()->className());
+                 qPrintable(QStringLiteral("%1 %2x%3")
+                                .arg(QLatin1String(widget->metaObject()->className()))
+                                .arg(least.width())
+                                .arg(least.height())));
         ++count;
     }
     QVERIFY(count >= 6);
