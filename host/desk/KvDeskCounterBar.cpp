@@ -25,6 +25,7 @@ namespace {
 constexpr int margin = 8;
 constexpr int classesWidth = 240;
 constexpr int leastClassesWidth = 96;
+constexpr int leastWidthWithHint = 400;
 constexpr QSize iconSize(24, 24);
 constexpr QSize buttonSize(32, 28);
 
@@ -63,7 +64,7 @@ KvDeskCounterBar::KvDeskCounterBar(KvDeskToolBox *toolBox, KvDeskImageView *view
 
 void KvDeskCounterBar::createWidgets()
 {
-    auto *const label = new QLabel(tr("Clicks count for"), this);
+    auto *const label = new KvDeskElidedLabel(tr("Clicks count for"), this);
     m_classes = new QComboBox(this);
     // As wide as may be whatever it lists, which changes with every click; narrower only where there is no
     // room.
@@ -81,15 +82,15 @@ void KvDeskCounterBar::createWidgets()
     m_newClass->setAutoRaise(true);
     m_newClass->setToolTip(tr("Count another class"));
     m_newClass->setAccessibleName(m_newClass->toolTip());
-    auto *const hint = new KvDeskElidedLabel(tr("A right click takes a place away"), this);
-    hint->setProperty("caption", true);
+    m_hint = new KvDeskElidedLabel(tr("A right click takes a place away"), this);
+    m_hint->setProperty("caption", true);
     auto *const layout = new QHBoxLayout(this);
     layout->setContentsMargins(margin, margin, margin, margin);
     layout->setSpacing(margin);
     layout->addWidget(label);
     layout->addWidget(m_classes);
     layout->addWidget(m_newClass);
-    layout->addWidget(hint);
+    layout->addWidget(m_hint);
 }
 
 void KvDeskCounterBar::slotToolChanged()
@@ -129,6 +130,9 @@ void KvDeskCounterBar::slotUpdate()
     while (m_classes->count() < texts.size())
         m_classes->addItem(texts.at(m_classes->count()));
     showColors();
+    // Where the names are cut.
+    for (int i = 0; i < texts.size(); ++i)
+        m_classes->setItemData(i, texts.at(i), Qt::ToolTipRole);
     m_classes->setCurrentIndex(qMax(0, m_counters.indexOf(m_toolBox->counterTool()->counter())));
     place();
 }
@@ -161,6 +165,7 @@ void KvDeskCounterBar::slotNewClass()
 void KvDeskCounterBar::place()
 {
     // In a narrow view the hint goes first, then the names are cut.
+    m_hint->setVisible(parentWidget()->width() >= leastWidthWithHint);
     const QSize wanted = sizeHint();
     resize(qMin(wanted.width(), parentWidget()->width()), wanted.height());
     move((parentWidget()->width() - width()) / 2, margin);

@@ -47,4 +47,5 @@ private:
     QComboBox *m_classes = nullptr;
     QVector<QIcon> m_swatches; ///< in the order of the counters' colours
     QToolButton *m_newClass = nullptr;
+    QWidget *m_hint = nullptr;
 };

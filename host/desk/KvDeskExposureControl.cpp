@@ -24,11 +24,11 @@ constexpr double resolution = 0.001;  ///< milliseconds; a logarithm needs a sma
 
 KvDeskExposureControl::KvDeskExposureControl(QWidget *parent)
     : QWidget(parent)
+    , m_label(new QLabel(tr("E&xposure"), this))
     , m_slider(new QSlider(Qt::Horizontal, this))
     , m_field(new QDoubleSpinBox(this))
 {
-    auto *const label = new QLabel(tr("E&xposure"), this);
-    label->setBuddy(m_field);
+    m_label->setBuddy(m_field);
     m_slider->setRange(0, steps);
     m_slider->setPageStep(steps / 20);
     m_slider->setMinimumWidth(narrowSliderWidth);
@@ -49,11 +49,17 @@ KvDeskExposureControl::KvDeskExposureControl(QWidget *parent)
     auto *const layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(spacing);
-    layout->addWidget(label);
+    layout->addWidget(m_label);
     layout->addWidget(m_slider);
     layout->addWidget(m_field);
     connect(m_slider, SIGNAL(valueChanged(int)), this, SLOT(slotSliderMoved(int)));
     connect(m_field, SIGNAL(valueChanged(double)), this, SLOT(slotFieldChanged(double)));
+}
+
+void KvDeskExposureControl::setCompact(bool isCompact)
+{
+    m_label->setVisible(!isCompact);
+    m_slider->setVisible(!isCompact);
 }
 
 double KvDeskExposureControl::lowest() const

@@ -6,6 +6,7 @@
 #include <QWidget>
 
 class QDoubleSpinBox;
+class QLabel;
 class QSlider;
 
 /** A slider and a field for the exposure time of a camera. The slider is logarithmic: cameras reach from
@@ -19,6 +20,8 @@ public:
     QSlider *slider() const { return m_slider; }
     QDoubleSpinBox *field() const { return m_field; }
 
+    /** The field alone, which needs little space; what it is for says its tool tip. */
+    void setCompact(bool isCompact);
     /** The times to choose from, and the one the camera has; emits nothing. */
     void setExposure(const ZtExposureRange &range, double milliseconds);
 
@@ -34,6 +37,7 @@ private:
     int positionOf(double milliseconds) const;
     double lowest() const;
 
+    QLabel *m_label;
     QSlider *m_slider;
     QDoubleSpinBox *m_field;
     ZtExposureRange m_range;

@@ -24,6 +24,7 @@ namespace {
 constexpr int margin = 8;
 constexpr int thinMargin = 4;
 constexpr int groupSpacing = 16;
+constexpr int oneLineWidth = 600; ///< a narrower bar has two lines
 constexpr int rateInterval = 500; ///< milliseconds
 constexpr QSize iconSize(16, 16);
 constexpr QSize buttonSize(32, 28);
@@ -64,17 +65,37 @@ void KvDeskLiveBar::createWidgets()
     m_frameRate->setMinimumWidth(
         m_frameRate->fontMetrics().horizontalAdvance(tr("%1 fps").arg(QStringLiteral("000.0"))));
 
-    auto *const layout = new QHBoxLayout(this);
-    layout->setContentsMargins(margin, thinMargin, margin, thinMargin);
-    layout->setSpacing(margin);
-    layout->addWidget(m_freeze);
-    layout->addWidget(m_icon);
-    layout->addWidget(m_status, 1);
-    layout->addWidget(m_run);
-    layout->addSpacing(groupSpacing - margin);
-    layout->addWidget(m_exposure);
-    layout->addSpacing(groupSpacing - margin);
-    layout->addWidget(m_frameRate);
+    m_first = new QHBoxLayout;
+    m_first->setSpacing(margin);
+    m_first->addWidget(m_freeze);
+    m_first->addWidget(m_icon);
+    m_first->addWidget(m_status, 1);
+    m_first->addWidget(m_run);
+    auto *const second = new QHBoxLayout;
+    second->setSpacing(groupSpacing);
+    second->addWidget(m_exposure);
+    second->addWidget(m_frameRate);
+    m_layout = new QBoxLayout(QBoxLayout::LeftToRight, this);
+    m_layout->setContentsMargins(margin, thinMargin, margin, thinMargin);
+    m_layout->addLayout(m_first, 1);
+    m_layout->addLayout(second);
+    m_layout->setSpacing(groupSpacing);
+}
+
+// Of two lines.
+QSize KvDeskLiveBar::minimumSizeHint() const
+{
+    return QSize(m_first->minimumSize().width() + 2 * margin, QFrame::minimumSizeHint().height());
+}
+
+void KvDeskLiveBar::resizeEvent(QResizeEvent *event)
+{
+    QFrame::resizeEvent(event);
+    const bool isNarrow = width() < oneLineWidth;
+    m_layout->setDirection(isNarrow ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
+    m_layout->setSpacing(isNarrow ? thinMargin : groupSpacing);
+    m_exposure->setCompact(isNarrow);
+    updateGeometry();
 }
 
 void KvDeskLiveBar::connectSignals()

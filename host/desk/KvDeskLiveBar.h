@@ -7,6 +7,8 @@
 class KvDeskActions;
 class KvDeskElidedLabel;
 class KvDeskExposureControl;
+class QBoxLayout;
+class QHBoxLayout;
 class QLabel;
 class QToolButton;
 class QPushButton;
@@ -31,6 +33,11 @@ public:
     QToolButton *freezeButton() const { return m_freeze; }
     QPushButton *runButton() const { return m_run; }
 
+    QSize minimumSizeHint() const override; ///< of two lines, which a narrow bar has
+
+protected:
+    void resizeEvent(QResizeEvent *event) override;
+
 private slots:
     void slotSourceChanged();
     void slotUpdate();
@@ -50,6 +57,8 @@ private:
 
     KvDeskActions *m_actions;
     ZtMeasuringDocument *m_document;
+    QBoxLayout *m_layout = nullptr;
+    QHBoxLayout *m_first = nullptr; ///< the line with the state of the source
     QLabel *m_icon = nullptr;
     KvDeskElidedLabel *m_status = nullptr;
     QPushButton *m_run = nullptr; ///< stops, starts or connects again, whichever is due

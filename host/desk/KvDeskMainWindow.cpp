@@ -64,8 +64,9 @@
 namespace {
 
 constexpr QSize firstSize(1280, 800);
-constexpr QSize smallestSize(800, 520);
+constexpr QSize smallestSize(800, 528);
 constexpr int valuesWidth = 416;
+constexpr QSize leastImageSize(280, 248); ///< the panels give way first
 constexpr int logHeight = 144;
 constexpr int galleryHeight = 188; ///< one row of thumbnails
 
@@ -185,6 +186,7 @@ void KvDeskMainWindow::createPanels()
 QWidget *KvDeskMainWindow::createImageColumn()
 {
     auto *const column = new QWidget(this);
+    column->setMinimumSize(leastImageSize);
     auto *const layout = new QVBoxLayout(column);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(0);

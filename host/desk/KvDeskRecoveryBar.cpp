@@ -17,6 +17,7 @@
 namespace {
 
 constexpr int margin = 8;
+constexpr int leastTextWidth = 320; ///< beside the buttons; with less, these go below the text
 
 } // namespace
 
@@ -51,14 +52,43 @@ void KvDeskRecoveryBar::createWidgets()
     m_restore->setToolTip(tr("Open these measurements as a session with unsaved changes"));
     m_discard = new QPushButton(tr("Discard"), this);
     m_discard->setToolTip(tr("Delete these measurements for good"));
-    auto *const layout = new QHBoxLayout(this);
-    layout->setContentsMargins(2 * margin, margin, margin, margin);
-    layout->setSpacing(margin);
-    layout->addWidget(m_text, 1);
-    layout->addWidget(m_session);
-    layout->addWidget(m_others);
-    layout->addWidget(m_restore);
-    layout->addWidget(m_discard);
+    auto *const texts = new QHBoxLayout;
+    texts->setSpacing(margin);
+    texts->addWidget(m_text, 1);
+    texts->addWidget(m_session);
+    texts->addWidget(m_others);
+    m_buttons = new QHBoxLayout;
+    m_buttons->setSpacing(margin);
+    m_buttons->addStretch();
+    m_buttons->addWidget(m_restore);
+    m_buttons->addWidget(m_discard);
+    m_layout = new QBoxLayout(QBoxLayout::LeftToRight, this);
+    m_layout->setContentsMargins(2 * margin, margin, margin, margin);
+    m_layout->setSpacing(margin);
+    m_layout->addLayout(texts, 1);
+    m_layout->addLayout(m_buttons);
+}
+
+// Of the buttons below the text.
+QSize KvDeskRecoveryBar::minimumSizeHint() const
+{
+    return QSize(m_buttons->minimumSize().width() + 3 * margin, QFrame::minimumSizeHint().height());
+}
+
+void KvDeskRecoveryBar::resizeEvent(QResizeEvent *event)
+{
+    QFrame::resizeEvent(event);
+    placeButtons();
+}
+
+void KvDeskRecoveryBar::placeButtons()
+{
+    const int besideButtons = width() - m_buttons->minimumSize().width() - 4 * margin;
+    const bool isNarrow = besideButtons < leastTextWidth;
+    m_layout->setDirection(isNarrow ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
+    // The menu of the others names it, too.
+    m_session->setVisible(!isNarrow);
+    updateGeometry();
 }
 
 QString KvDeskRecoveryBar::text() const
@@ -88,6 +118,7 @@ void KvDeskRecoveryBar::slotUpdate()
     m_others->setText(tr("%n more", "measurements that were not saved", m_recovery->count() - 1));
     setVisible(m_recovery->count() > 0);
     showCurrent();
+    placeButtons();
 }
 
 void KvDeskRecoveryBar::showCurrent()

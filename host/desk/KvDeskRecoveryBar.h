@@ -5,6 +5,8 @@
 
 class KvDeskElidedLabel;
 class KvDeskRecovery;
+class QBoxLayout;
+class QHBoxLayout;
 class QLabel;
 class QMenu;
 class QPushButton;
@@ -24,6 +26,11 @@ public:
     /** Lists all copies; hidden when there is one only. */
     QToolButton *othersButton() const { return m_others; }
 
+    QSize minimumSizeHint() const override; ///< with the buttons below the text
+
+protected:
+    void resizeEvent(QResizeEvent *event) override;
+
 private slots:
     void slotUpdate();
     void slotRestore();
@@ -32,10 +39,13 @@ private slots:
 
 private:
     void createWidgets();
+    void placeButtons();
     void showCurrent();
     QString timeText(int index) const;
 
     KvDeskRecovery *m_recovery;
+    QBoxLayout *m_layout = nullptr;
+    QHBoxLayout *m_buttons = nullptr;
     QLabel *m_text = nullptr;
     KvDeskElidedLabel *m_session = nullptr;
     QToolButton *m_others = nullptr;

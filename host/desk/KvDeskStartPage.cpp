@@ -25,7 +25,9 @@ namespace {
 constexpr int controlSpacing = 8;
 constexpr int groupSpacing = 16;
 constexpr int pageMargin = 24;
+constexpr int narrowMargin = 8;
 constexpr int widestPage = 720;
+constexpr int narrowStep = 400; ///< below it, steps have their buttons under the text
 constexpr QSize thumbnailSize(148, 111);
 constexpr QSize exampleSize(160, 142);
 constexpr int mostRecent = 4;
@@ -39,13 +41,14 @@ QLabel *groupTitle(const QString &text, QWidget *parent)
 }
 
 // Null for a session that cannot be read or has no picture: then its name has to do.
-QPixmap thumbnail(const QString &sessionPath)
+QPixmap thumbnail(const QString &sessionPath, double pixelRatio)
 {
     ZtSession session;
     ZtFault fault;
     if (!ZtSession::load(sessionPath, &session, &fault))
         return QPixmap();
-    return QPixmap::fromImage(KvDeskThumbnailReader::read(session.imagePath).image);
+    return QPixmap::fromImage(
+        KvDeskThumbnailReader::read(session.imagePath, thumbnailSize * pixelRatio).image);
 }
 
 // An ampersand would underline the letter after it.
@@ -83,14 +86,14 @@ KvDeskStartPage::KvDeskStartPage(KvDeskActions *actions, QMenu *sourceMenu, cons
 
 void KvDeskStartPage::createSteps(QVBoxLayout *layout, KvDeskActions *actions, QMenu *sourceMenu)
 {
-    auto *const heading = new QHBoxLayout;
-    heading->addWidget(groupTitle(tr("From an image to a report"), this), 1);
+    m_heading = new QHBoxLayout;
+    m_heading->addWidget(groupTitle(tr("From an image to a report"), this), 1);
     m_back = new QPushButton(tr("Back to the image"), this);
     m_back->setToolTip(
         tr("%1 (%2)", "command (shortcut)")
             .arg(m_back->text(), QKeySequence(Qt::Key_Escape).toString(QKeySequence::NativeText)));
     connect(m_back, SIGNAL(clicked()), this, SIGNAL(signalLeft()));
-    heading->addWidget(m_back);
+    m_heading->addWidget(m_back);
 
     auto *const open =
         new KvDeskStepRow(1, tr("Open an image"), tr("A picture file, or the live image of a camera."), this);
@@ -107,8 +110,9 @@ void KvDeskStartPage::createSteps(QVBoxLayout *layout, KvDeskActions *actions, Q
 
     auto *const steps = new QVBoxLayout;
     steps->setSpacing(controlSpacing);
-    steps->addLayout(heading);
-    for (KvDeskStepRow *const row : {open, m_calibrate, m_measure})
+    steps->addLayout(m_heading);
+    m_steps = {open, m_calibrate, m_measure};
+    for (KvDeskStepRow *const row : qAsConst(m_steps))
         steps->addWidget(row);
     layout->addLayout(steps);
 }
@@ -144,7 +148,7 @@ void KvDeskStartPage::addExample(const QString &path)
 {
     auto *const button = new QToolButton(m_examplesGroup);
     button->setToolButtonStyle(Qt::ToolButtonTextUnderIcon);
-    button->setIcon(thumbnail(path));
+    button->setIcon(thumbnail(path, devicePixelRatioF()));
     button->setIconSize(thumbnailSize);
     button->setFixedSize(exampleSize);
     button->setText(buttonText(KvDeskExamples::title(path)));
@@ -198,11 +202,31 @@ void KvDeskStartPage::listRecent()
 
 void KvDeskStartPage::placeExamples()
 {
-    const int room = width() - 2 * pageMargin + controlSpacing;
+    const QMargins margins = layout()->contentsMargins();
+    const int room = width() - margins.left() - margins.right() + controlSpacing;
     const int columns = qMax(1, room / (exampleSize.width() + controlSpacing));
     for (int i = 0; i < m_examples.size(); ++i)
         m_examplesLayout->addWidget(m_examples.at(i), i / columns, i % columns);
-    m_examplesLayout->setColumnStretch(columns, 1);
+    for (int i = 0; i <= m_examples.size(); ++i)
+        m_examplesLayout->setColumnStretch(i, i == columns ? 1 : 0);
+}
+
+void KvDeskStartPage::placeSteps()
+{
+    const bool isNarrow = width() - 2 * pageMargin < narrowStep;
+    const int margin = isNarrow ? narrowMargin : pageMargin;
+    layout()->setContentsMargins(margin, margin, margin, margin);
+    for (KvDeskStepRow *const row : qAsConst(m_steps))
+        row->setNarrow(isNarrow);
+}
+
+// The layout's would be that of the present places, and the page could never become narrower.
+QSize KvDeskStartPage::minimumSizeHint() const
+{
+    int content = qMax(exampleSize.width(), m_heading->minimumSize().width());
+    for (const KvDeskStepRow *const row : m_steps)
+        content = qMax(content, row->minimumSizeHint().width());
+    return QSize(content + 2 * narrowMargin, QWidget::minimumSizeHint().height());
 }
 
 void KvDeskStartPage::showEvent(QShowEvent *event)
@@ -215,6 +239,7 @@ void KvDeskStartPage::showEvent(QShowEvent *event)
 void KvDeskStartPage::resizeEvent(QResizeEvent *event)
 {
     QWidget::resizeEvent(event);
+    placeSteps();
     placeExamples();
 }
 

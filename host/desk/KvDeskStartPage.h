@@ -6,6 +6,7 @@
 class KvDeskActions;
 class KvDeskStepRow;
 class QGridLayout;
+class QHBoxLayout;
 class QLabel;
 class QMenu;
 class QPushButton;
@@ -33,6 +34,8 @@ public:
     QList<QPushButton *> recentButtons() const { return m_recent; }
     QPushButton *backButton() const { return m_back; }
 
+    QSize minimumSizeHint() const override; ///< with everything below one another
+
 signals:
     void signalExampleChosen(const QString &aPath);
     void signalRecentChosen(const QString &aPath);
@@ -56,8 +59,11 @@ private:
     void addExample(const QString &path);
     void addRecent(const QString &path);
     void placeExamples();
+    void placeSteps();
 
     QString m_examplesFolder;
+    QHBoxLayout *m_heading = nullptr;
+    QList<KvDeskStepRow *> m_steps;
     KvDeskStepRow *m_calibrate = nullptr;
     KvDeskStepRow *m_measure = nullptr;
     QPushButton *m_back = nullptr;

@@ -11,12 +11,6 @@ QColor themeColor(const char *token)
     return acss::QtAdvancedStylesheet::getInstance()->color(QLatin1String(token));
 }
 
-// The pale red of the dark theme cannot be read on white.
-QColor errorColor()
-{
-    return themeColor(themeColor("window").lightness() < 128 ? "danger" : "danger-hover");
-}
-
 } // namespace
 
 void KvDeskStatus::log(int category, const QString &message, const QString &source)
@@ -54,7 +48,7 @@ QColor KvDeskStatus::color(int category)
     case ZtAppStatus::Warning:
         return themeColor("warning");
     case ZtAppStatus::Error:
-        return errorColor();
+        return themeColor("error");
     default:
         return themeColor("muted");
     }

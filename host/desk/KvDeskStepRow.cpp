@@ -27,7 +27,9 @@ QLabel *label(const QString &text, const char *look, QWidget *parent)
 
 KvDeskStepRow::KvDeskStepRow(int number, const QString &title, const QString &text, QWidget *parent)
     : QFrame(parent)
-    , m_layout(new QHBoxLayout(this))
+    , m_layout(new QBoxLayout(QBoxLayout::LeftToRight, this))
+    , m_head(new QHBoxLayout)
+    , m_buttons(new QHBoxLayout)
 {
     setProperty("card", true);
     auto *const badge = new QLabel(QString::number(number), this);
@@ -37,19 +39,22 @@ KvDeskStepRow::KvDeskStepRow(int number, const QString &title, const QString &te
     texts->setSpacing(4);
     texts->addWidget(label(title, "groupTitle", this));
     texts->addWidget(label(text, "caption", this));
-    m_layout->setContentsMargins(groupSpacing, controlSpacing, groupSpacing, controlSpacing);
-    m_layout->setSpacing(controlSpacing);
-    m_layout->addWidget(badge);
-    m_layout->addSpacing(controlSpacing);
-    m_layout->addLayout(texts, 1);
-    m_layout->addSpacing(controlSpacing);
+    m_head->setSpacing(groupSpacing);
+    m_head->addWidget(badge);
+    m_head->addLayout(texts, 1);
+    m_buttons->setSpacing(controlSpacing);
+    // The buttons stand at the end of their line.
+    m_buttons->addStretch();
+    m_layout->addLayout(m_head, 1);
+    m_layout->addLayout(m_buttons);
+    setNarrow(false);
 }
 
 void KvDeskStepRow::addAction(QAction *action, bool isPrimary)
 {
     auto *const button = new KvDeskActionButton(action, this);
     button->setDefault(isPrimary);
-    m_layout->addWidget(button);
+    m_buttons->addWidget(button);
 }
 
 void KvDeskStepRow::addMenu(QMenu *menu, const QString &toolTip)
@@ -63,11 +68,27 @@ void KvDeskStepRow::addMenu(QMenu *menu, const QString &toolTip)
     button->setFocusPolicy(Qt::StrongFocus);
     button->setToolTip(toolTip);
     button->setAccessibleName(toolTip);
-    m_layout->addWidget(button);
+    m_buttons->addWidget(button);
 }
 
 void KvDeskStepRow::setObstacle(const QString &reason)
 {
     for (KvDeskActionButton *const button : findChildren<KvDeskActionButton *>())
         button->setObstacle(reason);
+}
+
+void KvDeskStepRow::setNarrow(bool isNarrow)
+{
+    m_layout->setDirection(isNarrow ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
+    m_layout->setSpacing(isNarrow ? controlSpacing : groupSpacing);
+    const int side = isNarrow ? controlSpacing : groupSpacing;
+    m_layout->setContentsMargins(side, controlSpacing, side, controlSpacing);
+}
+
+QSize KvDeskStepRow::minimumSizeHint() const
+{
+    const int content = qMax(m_head->minimumSize().width(), m_buttons->minimumSize().width());
+    const QMargins frame = contentsMargins();
+    return QSize(content + 2 * controlSpacing + frame.left() + frame.right(),
+                 QFrame::minimumSizeHint().height());
 }

@@ -4,10 +4,14 @@
 #include <QFrame>
 
 class QAction;
+class QBoxLayout;
 class QHBoxLayout;
 class QMenu;
 
-/** One of several steps to follow: its number, what it is about, and buttons that do it. */
+/**
+ * One of several steps to follow: its number, what it is about, and buttons that do it. The buttons stand
+ * beside the text, and below it where the row is narrow.
+ */
 class KvDeskStepRow : public QFrame
 {
     Q_OBJECT
@@ -20,7 +24,13 @@ public:
     void addMenu(QMenu *menu, const QString &toolTip);
     /** The reason why the step cannot be taken now; empty when it can. Concerns actions only. */
     void setObstacle(const QString &reason);
+    /** Puts the buttons below the text, or beside it. */
+    void setNarrow(bool isNarrow);
+
+    QSize minimumSizeHint() const override; ///< of a narrow row
 
 private:
-    QHBoxLayout *m_layout;
+    QBoxLayout *m_layout;
+    QHBoxLayout *m_head;
+    QHBoxLayout *m_buttons;
 };

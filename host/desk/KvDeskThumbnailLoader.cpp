@@ -4,6 +4,7 @@
 #include "KvDeskGalleryEntry.h"
 #include "KvDeskThumbnailReader.h"
 
+#include <QGuiApplication>
 #include <QMutex>
 #include <QRunnable>
 #include <QThreadPool>
@@ -25,6 +26,13 @@ QString keyOf(const QString &folder, const KvDeskGalleryEntry &entry)
         .arg(entry.bytes);
 }
 
+/// Sharp on every screen, of which there may be several.
+QSize largestThumbnail()
+{
+    constexpr double usualRatio = 2.0;
+    return KvDeskThumbnailReader::usual * qMax(1.0, qGuiApp->devicePixelRatio() / usualRatio);
+}
+
 } // namespace
 
 /// Whom jobs report to, who may die while they run.
@@ -39,6 +47,7 @@ class KvDeskThumbnailLoader::Job : public QRunnable
 public:
     Job(const Wish &wish, std::shared_ptr<Receiver> receiver)
         : m_wish(wish)
+        , m_largest(largestThumbnail())
         , m_receiver(std::move(receiver))
     {}
 
@@ -46,7 +55,7 @@ public:
     {
         if (!isWanted())
             return;
-        const KvDeskThumbnail thumbnail = KvDeskThumbnailReader::read(m_wish.path);
+        const KvDeskThumbnail thumbnail = KvDeskThumbnailReader::read(m_wish.path, m_largest);
         const QMutexLocker locker(&m_receiver->mutex);
         if (m_receiver->loader)
             QMetaObject::invokeMethod(m_receiver->loader, "slotLoaded", Qt::QueuedConnection,
@@ -62,6 +71,7 @@ private:
     }
 
     Wish m_wish;
+    QSize m_largest;
     std::shared_ptr<Receiver> m_receiver;
 };
 

@@ -9,22 +9,19 @@
 
 namespace {
 
-bool fits(const QSize &size)
+bool fits(const QSize &size, const QSize &largest)
 {
-    return size.width() <= KvDeskThumbnailReader::largest.width() &&
-           size.height() <= KvDeskThumbnailReader::largest.height();
+    return size.width() <= largest.width() && size.height() <= largest.height();
 }
 
 // A line is at least one pixel high.
-QSize fitted(const QSize &size)
+QSize fitted(const QSize &size, const QSize &largest)
 {
-    if (fits(size))
-        return size;
-    return size.scaled(KvDeskThumbnailReader::largest, Qt::KeepAspectRatio).expandedTo(QSize(1, 1));
+    return fits(size, largest) ? size : size.scaled(largest, Qt::KeepAspectRatio).expandedTo(QSize(1, 1));
 }
 
 /// JPEG is decoded at a fraction of its size in a fraction of the time. False when the file is none.
-bool readJpeg(const QString &path, KvDeskThumbnail *thumbnail)
+bool readJpeg(const QString &path, const QSize &largest, KvDeskThumbnail *thumbnail)
 {
     QImageReader reader(path);
     reader.setDecideFormatFromContent(true);
@@ -34,7 +31,8 @@ bool readJpeg(const QString &path, KvDeskThumbnail *thumbnail)
     // Turned by a quarter afterwards, so the size to decode is the one before.
     const bool isTurned = reader.transformation() & QImageIOHandler::TransformationRotate90;
     const QSize size = isTurned ? reader.size().transposed() : reader.size();
-    reader.setScaledSize(isTurned ? fitted(size).transposed() : fitted(size));
+    const QSize scaled = fitted(size, largest);
+    reader.setScaledSize(isTurned ? scaled.transposed() : scaled);
     thumbnail->image = reader.read();
     thumbnail->size = size;
     return !thumbnail->image.isNull();
@@ -42,10 +40,10 @@ bool readJpeg(const QString &path, KvDeskThumbnail *thumbnail)
 
 } // namespace
 
-KvDeskThumbnail KvDeskThumbnailReader::read(const QString &path)
+KvDeskThumbnail KvDeskThumbnailReader::read(const QString &path, const QSize &largest)
 {
     KvDeskThumbnail thumbnail;
-    if (readJpeg(path, &thumbnail))
+    if (readJpeg(path, largest, &thumbnail))
         return thumbnail;
     ZtPicture picture;
     ZtFault fault;
@@ -54,9 +52,9 @@ KvDeskThumbnail KvDeskThumbnailReader::read(const QString &path)
         return thumbnail;
     }
     thumbnail.size = picture.image.size();
-    thumbnail.image =
-        fits(thumbnail.size)
-            ? picture.image
-            : picture.image.scaled(fitted(thumbnail.size), Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+    thumbnail.image = fits(thumbnail.size, largest)
+                          ? picture.image
+                          : picture.image.scaled(fitted(thumbnail.size, largest), Qt::IgnoreAspectRatio,
+                                                 Qt::SmoothTransformation);
     return thumbnail;
 }

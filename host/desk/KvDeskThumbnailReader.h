@@ -7,8 +7,10 @@
 class KvDeskThumbnailReader
 {
 public:
-    /** Thumbnails fit into this, with the proportions of the picture; small pictures are not enlarged. */
-    static constexpr QSize largest = QSize(256, 192);
+    /** Large enough for the gallery on a screen at up to 200 %. */
+    static constexpr QSize usual = QSize(256, 192);
 
-    static KvDeskThumbnail read(const QString &path);
+    /** Thumbnails fit into \a largest, with the proportions of the picture; small pictures are not enlarged.
+     */
+    static KvDeskThumbnail read(const QString &path, const QSize &largest = usual);
 };

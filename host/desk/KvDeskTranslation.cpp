@@ -2,6 +2,7 @@
 #include "KvDeskTranslation.h"
 
 #include "KvDeskLanguages.h"
+#include "gui/QtAdvancedStylesheet.h"
 
 #include <QGuiApplication>
 #include <QLibraryInfo>
@@ -53,6 +54,7 @@ KvDeskTranslation::KvDeskTranslation(const QString &language)
     m_direction = std::make_unique<DirectionTranslator>(locale.textDirection());
     QCoreApplication::installTranslator(m_direction.get());
     QGuiApplication::setLayoutDirection(locale.textDirection());
+    acss::QtAdvancedStylesheet::getInstance()->setLanguage(locale);
 }
 
 KvDeskTranslation::~KvDeskTranslation()

@@ -29,6 +29,7 @@
 namespace {
 
 constexpr int minimumColumnWidth = 48;
+constexpr int headingPadding = 8;
 constexpr int largestUnitWidth = 80;
 constexpr int rounding = 2;       ///< pixels by which a text may be wider than its whole pixels
 constexpr int sampledRows = 1000; ///< whose texts are measured at first, spread over the table
@@ -81,7 +82,9 @@ void KvDeskValueTable::createFilter()
     m_filter = new QLineEdit(this);
     m_filter->setPlaceholderText(tr("Filter by type, object or value name"));
     m_filter->setAccessibleName(tr("Filter of the measured values"));
+    // A narrow field cannot show all it says.
     m_filter->setToolTip(
+        m_filter->placeholderText() + QLatin1Char('\n') +
         KvDeskActions::withShortcut(tr("Shows only rows that have all of these words"), QKeySequence::Find));
     m_filter->setClearButtonEnabled(true);
     // Files that are dropped on it are for the window.
@@ -251,7 +254,8 @@ void KvDeskValueTable::slotMeasureTexts()
     makeRoomForValues();
 }
 
-// A number that is cut short would be read as another one: rather the texts before it are shortened.
+// A number that is cut short would be read as another one: rather the texts before it are shortened, as far
+// as their headings can be read.
 void KvDeskValueTable::makeRoomForValues()
 {
     const int room = m_view->viewport()->width() - m_valueWidth;
@@ -259,9 +263,16 @@ void KvDeskValueTable::makeRoomForValues()
     const QScopedValueRollback<bool> fitting(m_isFitting, true);
     for (int column = 0; column < m_textWidths.size(); ++column) {
         const int width = m_textWidths.at(column);
-        m_view->setColumnWidth(column,
-                               wanted <= room ? width : qMax(minimumColumnWidth, width * room / wanted));
+        const int shortened = qMax(qMin(headingWidth(column), width), width * room / wanted);
+        m_view->setColumnWidth(column, wanted <= room ? width : shortened);
     }
+}
+
+int KvDeskValueTable::headingWidth(int column) const
+{
+    const QString heading = m_model->headerData(column, Qt::Horizontal).toString();
+    return qMax(minimumColumnWidth,
+                m_view->horizontalHeader()->fontMetrics().horizontalAdvance(heading) + headingPadding);
 }
 
 void KvDeskValueTable::slotColumnResized(int aColumn, int aOldWidth, int aNewWidth)

@@ -69,6 +69,7 @@ private:
     QString note() const;
     void measureRow(int row);
     void makeRoomForValues();
+    int headingWidth(int column) const;
     bool filterKeyPressed(int key);
 
     KvDeskValueTableModel *m_model;

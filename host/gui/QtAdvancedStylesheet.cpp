@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "gui/QtAdvancedStylesheet.h"
 
+#include "gui/ApplicationStyle.h"
+
 #include <QApplication>
 #include <QFile>
 #include <QFont>
-#include <QProxyStyle>
+#include <QLocale>
 #include <QRegularExpression>
 
 namespace acss {
@@ -54,6 +56,7 @@ constexpr Token tokens[] = {
     {"danger-hover", opaque(0xa61d24), opaque(0xa61d24)},
     {"danger-pressed", opaque(0xe84749), opaque(0xe84749)},
     {"on-danger-pressed", opaque(0x141414), opaque(0x141414)},
+    {"error", opaque(0xf0b1b5), opaque(0xa61d24)},
     {"ok", opaque(0x60bd65), opaque(0x226a25)},
     {"warning", opaque(0xffc107), opaque(0x936600)},
 };
@@ -67,6 +70,27 @@ QString cssColor(const QColor &color)
              QString::number(color.alpha()));
 }
 
+QStringList freeFonts()
+{
+    return {QStringLiteral("Open Sans"), QStringLiteral("Noto Sans"), QStringLiteral("DejaVu Sans")};
+}
+
+/// One character of Chinese origin has several forms; a font of its own has those of each language.
+QString hanFont(const QLocale &language)
+{
+    switch (language.language()) {
+    case QLocale::Japanese:
+        return QStringLiteral("Noto Sans CJK JP");
+    case QLocale::Korean:
+        return QStringLiteral("Noto Sans CJK KR");
+    case QLocale::Chinese:
+        return language.script() == QLocale::TraditionalHanScript ? QStringLiteral("Noto Sans CJK TC")
+                                                                  : QStringLiteral("Noto Sans CJK SC");
+    default:
+        return QString();
+    }
+}
+
 QString templateText()
 {
     QFile file(QStringLiteral(":/acss/application.qss"));
@@ -77,6 +101,7 @@ QString templateText()
 
 QtAdvancedStylesheet::QtAdvancedStylesheet()
     : m_theme(darkTheme)
+    , m_bodyFamilies({bodyFont})
 {}
 
 QtAdvancedStylesheet *QtAdvancedStylesheet::getInstance()
@@ -100,6 +125,15 @@ bool QtAdvancedStylesheet::setCurrentTheme(const QString &theme)
     m_theme = theme;
     emit currentThemeChanged(m_theme);
     return true;
+}
+
+void QtAdvancedStylesheet::setLanguage(const QLocale &language)
+{
+    const QString han = hanFont(language);
+    m_bodyFamilies = QStringList(bodyFont);
+    // Behind all that Latin letters may come from.
+    if (!han.isEmpty())
+        m_bodyFamilies << freeFonts() << han;
 }
 
 QColor QtAdvancedStylesheet::color(const QString &token) const
@@ -152,24 +186,6 @@ QPalette QtAdvancedStylesheet::palette() const
 
 namespace {
 
-/**
- * Letters of shortcuts are underlined, but not where writing runs from right to left: Qt draws an underlined letter on
- * its own, which tears apart the joined letters of Arabic. The keys work all the same.
- */
-class JoinedLettersStyle : public QProxyStyle
-{
-public:
-    using QProxyStyle::QProxyStyle;
-
-    int styleHint(StyleHint hint, const QStyleOption *option, const QWidget *widget,
-                  QStyleHintReturn *returnData) const override
-    {
-        if (hint == SH_UnderlineShortcut && QGuiApplication::layoutDirection() == Qt::RightToLeft)
-            return 0;
-        return QProxyStyle::styleHint(hint, option, widget, returnData);
-    }
-};
-
 /// Setting a style polishes and lays out every widget anew, which a change of the theme does not need.
 void setStyleOnce(QApplication *application)
 {
@@ -178,7 +194,7 @@ void setStyleOnce(QApplication *application)
         return;
     // A style sheet wraps the style, so the style comes first.
     application->setStyleSheet(QString());
-    QApplication::setStyle(new JoinedLettersStyle(QStringLiteral("Fusion")));
+    QApplication::setStyle(new ApplicationStyle);
     application->setProperty(property, true);
 }
 
@@ -191,6 +207,12 @@ void QtAdvancedStylesheet::applyTo(QApplication *application) const
 
     substituteFonts();
     QFont font(bodyFont);
+    if (m_bodyFamilies.size() > 1) {
+        font.setFamilies(m_bodyFamilies);
+        // Fonts that differ only in what comes behind the first family share one in memory, and fonts of
+        // report pages must not share these.
+        font.setStyleStrategy(QFont::PreferQuality);
+    }
     font.setPixelSize(bodyPixelSize);
     setStyleOnce(application);
     QApplication::setPalette(palette());
@@ -200,14 +222,13 @@ void QtAdvancedStylesheet::applyTo(QApplication *application) const
 
 void QtAdvancedStylesheet::substituteFonts()
 {
-    QFont::insertSubstitutions(
-        bodyFont, {QStringLiteral("Open Sans"), QStringLiteral("Noto Sans"), QStringLiteral("DejaVu Sans")});
+    QFont::insertSubstitutions(bodyFont, freeFonts());
 }
 
 QString QtAdvancedStylesheet::placeholderText(const QString &name) const
 {
     if (name == QLatin1String("Font"))
-        return QLatin1Char('"') + bodyFont + QLatin1Char('"');
+        return QLatin1Char('"') + m_bodyFamilies.join(QLatin1String("\", \"")) + QLatin1Char('"');
     if (name == QLatin1String("Theme"))
         return m_theme.toLower();
     return cssColor(color(name));

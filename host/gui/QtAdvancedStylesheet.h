@@ -10,6 +10,7 @@
 #include <QStringList>
 
 class QApplication;
+class QLocale;
 
 namespace acss {
 
@@ -18,9 +19,9 @@ namespace acss {
  * only.
  *
  * Colours: "window", "panel", "raised" (fields and cards), "line", "text", "muted", "accent", "accent-hover",
- * "accent-pressed", "on-accent", "danger", "danger-hover", "danger-pressed", "on-danger-pressed", "ok",
- * "warning"; made of these for the states of controls: "raised-hover", "raised-pressed", "text-disabled",
- * "accent-disabled", "on-accent-disabled".
+ * "accent-pressed", "on-accent", "danger", "danger-hover", "danger-pressed", "on-danger-pressed", "error",
+ * "ok", "warning"; made of these for the states of controls: "raised-hover", "raised-pressed",
+ * "text-disabled", "accent-disabled", "on-accent-disabled".
  *
  * Widgets opt into a look of their own by dynamic properties set to true: "danger" (buttons that delete),
  * "iconOnly" (push buttons of 32 pixels), "link" (push buttons in lists), "groupTitle", "caption",
@@ -41,6 +42,12 @@ public:
      * Switches the theme; false when there is no theme of this name. The application calls applyTo() again.
      */
     bool setCurrentTheme(const QString &theme);
+
+    /**
+     * The language of the interface: texts in Chinese, Japanese or Korean are drawn in a font with its forms
+     * of the characters these share. The application calls applyTo() again.
+     */
+    void setLanguage(const QLocale &language);
 
     /** A colour of the current theme; invalid for a name that is none. */
     QColor color(const QString &token) const;
@@ -67,6 +74,7 @@ private:
     QString placeholderText(const QString &name) const;
 
     QString m_theme;
+    QStringList m_bodyFamilies;
 };
 
 } // namespace acss

@@ -38,9 +38,10 @@ QString cacheKey(const QString &svgPath, const QSize &size, const QColor &color)
 
 } // namespace
 
-ThemedIconEngine::ThemedIconEngine(const QString &svgPath, const QSize &size)
+ThemedIconEngine::ThemedIconEngine(const QString &svgPath, const QSize &size, const QString &colorToken)
     : m_svgPath(svgPath)
     , m_size(size)
+    , m_colorToken(colorToken)
 {}
 
 void ThemedIconEngine::paint(QPainter *painter, const QRect &rect, QIcon::Mode mode, QIcon::State state)
@@ -81,10 +82,11 @@ QIconEngine *ThemedIconEngine::clone() const
     return new ThemedIconEngine(*this);
 }
 
-QColor ThemedIconEngine::stateColor(QIcon::Mode mode, QIcon::State state)
+/// With the opacity of the state as its alpha.
+QColor ThemedIconEngine::stateColor(QIcon::Mode mode, QIcon::State state) const
 {
     const bool onAccent = state == QIcon::On || mode == QIcon::Selected;
-    const QString token = onAccent ? QStringLiteral("on-accent") : QStringLiteral("text");
+    const QString token = onAccent ? QStringLiteral("on-accent") : m_colorToken;
     QColor color = QtAdvancedStylesheet::getInstance()->color(token);
     if (mode == QIcon::Disabled)
         color.setAlphaF(disabledOpacity);

@@ -12,7 +12,10 @@ namespace acss {
 class ThemedIconEngine final : public QIconEngine
 {
 public:
-    ThemedIconEngine(const QString &svgPath, const QSize &size);
+    /** \a colorToken names the colour of the theme in which the icon is drawn while it is neither on nor
+     * selected. */
+    ThemedIconEngine(const QString &svgPath, const QSize &size,
+                     const QString &colorToken = QStringLiteral("text"));
 
     void paint(QPainter *painter, const QRect &rect, QIcon::Mode mode, QIcon::State state) override;
     QPixmap pixmap(const QSize &size, QIcon::Mode mode, QIcon::State state) override;
@@ -20,12 +23,12 @@ public:
     QString key() const override;
     QIconEngine *clone() const override;
 
-    /** The colour of an icon in a state, with the opacity of the state as its alpha. */
-    static QColor stateColor(QIcon::Mode mode, QIcon::State state);
-
 private:
+    QColor stateColor(QIcon::Mode mode, QIcon::State state) const;
+
     QString m_svgPath;
     QSize m_size;
+    QString m_colorToken;
 };
 
 } // namespace acss

@@ -18,6 +18,10 @@ inline QFont make(int pixelSize, QFont::Weight weight = QFont::Normal)
 {
     constexpr qreal kSmallestSpacing = 1.0 / 64; // pixels; the text layout's unit
     QFont font(QStringLiteral("Segoe UI"));
+    // All of them: what a font leaves open, widgets take from the application, whose fonts go by its
+    // language.
+    font.setFamilies({font.family()});
+    font.setStyleStrategy(QFont::PreferDefault);
     font.setPixelSize(pixelSize);
     font.setWeight(weight);
     font.setLetterSpacing(QFont::AbsoluteSpacing, kSmallestSpacing);

@@ -124,11 +124,7 @@ private:
         takeDialog(&settings, "dialog-settings");
         KvDeskExportDialog table({}, m_desk->window());
         takeDialog(&table, "dialog-export");
-        QMessageBox question(QMessageBox::Question, QStringLiteral("Unsaved changes"),
-                             QStringLiteral("Save the changes to \"plate.json\"?"),
-                             QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel,
-                             m_desk->window());
-        takeDialog(&question, "dialog-question");
+        takeMessages();
         action(KvDeskActions::Calibrate)->trigger();
         for (QWidget *const widget : QApplication::topLevelWidgets()) {
             if (!widget->inherits("KvDeskCalibrationDialog"))
@@ -139,6 +135,19 @@ private:
                 take(widget, QStringLiteral("dialog-calibration-%1").arg(++count));
             }
             widget->close();
+        }
+    }
+
+    void takeMessages() const
+    {
+        const char context[] = "KvDeskFileCommands";
+        const QString title = QCoreApplication::translate(context, "Unsaved changes");
+        const QString text = QCoreApplication::translate(context, "Save the changes to \"%1\"?");
+        for (const auto icon :
+             {QMessageBox::Question, QMessageBox::Information, QMessageBox::Warning, QMessageBox::Critical}) {
+            QMessageBox box(icon, title, text.arg(QStringLiteral("plate.json")),
+                            QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel, m_desk->window());
+            takeDialog(&box, qPrintable(QStringLiteral("dialog-message-%1").arg(icon)));
         }
     }
 
@@ -208,10 +217,12 @@ private:
 
 int main(int argc, char **argv)
 {
-    if (argc != 4 && argc != 5) {
-        std::fputs("Usage: Screenshots EXAMPLES Dark|Light FOLDER [LANGUAGE]\n", stderr);
+    if (argc < 4 || argc > 6) {
+        std::fputs("Usage: Screenshots EXAMPLES Dark|Light FOLDER [LANGUAGE [SCALE]]\n", stderr);
         return 2;
     }
+    if (argc == 6)
+        qputenv("QT_SCALE_FACTOR", argv[5]);
     QCoreApplication::setAttribute(Qt::AA_Use96Dpi);
     QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
     QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
@@ -220,7 +231,7 @@ int main(int argc, char **argv)
                                   QStringLiteral("StatReport"));
     const QString folder = QString::fromLocal8Bit(argv[3]);
     QDir().mkpath(folder);
-    const QString language = argc == 5 ? QString::fromLocal8Bit(argv[4]) : QStringLiteral("English");
+    const QString language = argc >= 5 ? QString::fromLocal8Bit(argv[4]) : QStringLiteral("English");
     Screenshots(QString::fromLocal8Bit(argv[1]), QString::fromLocal8Bit(argv[2]), folder, language).takeAll();
     return 0;
 }

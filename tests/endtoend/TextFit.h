@@ -164,7 +164,8 @@ private:
         // What somebody types may be longer than the field, what a field says by itself may not.
         if (qobject_cast<QAbstractSpinBox *>(edit->parentWidget()))
             need(edit, edit->text(), advance(edit, edit->text()), edit->contentsRect().width() - 2);
-        if (!edit->placeholderText().isEmpty())
+        // A field elides by itself; what is left out has to be readable somewhere.
+        if (!edit->toolTip().contains(edit->placeholderText()))
             need(edit, edit->placeholderText(), advance(edit, edit->placeholderText()),
                  edit->contentsRect().width());
     }

@@ -40,6 +40,19 @@ void fill(QWidget *window)
         layout->addWidget(control);
 }
 
+/// A character that looks different in each of the languages that have it.
+const QString han = QStringLiteral("\u76F4");
+
+QString drawnWith(const QFont &font, const QString &text)
+{
+    QTextLayout layout(text, font);
+    layout.beginLayout();
+    layout.createLine();
+    layout.endLayout();
+    // Substitutes are named in small letters.
+    return layout.glyphRuns().value(0).rawFont().familyName().toLower();
+}
+
 double relativeLuminance(const QColor &color)
 {
     const auto linear = [](double c) {
@@ -74,6 +87,12 @@ private slots:
     void unknownColorsAreInvalid();
     void textsAreReadable_data();
     void textsAreReadable();
+    void messageIconsAreOfTheTheme_data();
+    void messageIconsAreOfTheTheme();
+    void messageBoxesFollowTheTheme();
+    void charactersHaveTheLanguagesForms_data();
+    void charactersHaveTheLanguagesForms();
+    void latinLettersAreTheSameInEveryLanguage();
     void theStyleSheetIsFilledIn_data();
     void theStyleSheetIsFilledIn();
     void theStyleSheetSuitsItsParser_data();
@@ -212,6 +231,110 @@ void QtAdvancedStylesheetTest::textsAreReadable()
         const double ratio = contrast(m_style->color(text), m_style->color(background));
         QVERIFY2(ratio >= 4.5, qPrintable(QStringLiteral("%1: %2:1").arg(theme).arg(ratio)));
     }
+}
+
+void QtAdvancedStylesheetTest::messageIconsAreOfTheTheme_data()
+{
+    QTest::addColumn<int>("icon");
+    QTest::addColumn<QString>("token");
+    QTest::newRow("question") << int(QStyle::SP_MessageBoxQuestion) << "accent-hover";
+    QTest::newRow("information") << int(QStyle::SP_MessageBoxInformation) << "accent-hover";
+    QTest::newRow("warning") << int(QStyle::SP_MessageBoxWarning) << "warning";
+    QTest::newRow("critical") << int(QStyle::SP_MessageBoxCritical) << "error";
+}
+
+/// In the colour of their meaning, which stands out from the dialog; at any size of pixels.
+void QtAdvancedStylesheetTest::messageIconsAreOfTheTheme()
+{
+    QFETCH(int, icon);
+    QFETCH(QString, token);
+    auto *const service = QtAdvancedStylesheet::getInstance();
+    for (const QString &theme : service->themes()) {
+        service->setCurrentTheme(theme);
+        service->applyTo(qApp);
+        const QStyle *const style = QApplication::style();
+        QCOMPARE(style->pixelMetric(QStyle::PM_MessageBoxIconSize), 40);
+        const QImage image =
+            style->standardIcon(static_cast<QStyle::StandardPixmap>(icon)).pixmap(80, 80).toImage();
+        QCOMPARE(image.size(), QSize(80, 80));
+        int strokes = 0;
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x) {
+                if (image.pixelColor(x, y).alpha() != 255)
+                    continue;
+                QCOMPARE(image.pixelColor(x, y), service->color(token));
+                ++strokes;
+            }
+        }
+        QVERIFY(strokes > 200);
+        QVERIFY2(contrast(service->color(token), service->color(QStringLiteral("window"))) >= 3.0,
+                 qPrintable(theme));
+    }
+}
+
+void QtAdvancedStylesheetTest::messageBoxesFollowTheTheme()
+{
+    auto *const service = QtAdvancedStylesheet::getInstance();
+    service->setCurrentTheme(QStringLiteral("Dark"));
+    service->applyTo(qApp);
+    QMessageBox box(QMessageBox::Warning, QStringLiteral("Title"), QStringLiteral("Text"), QMessageBox::Ok);
+    box.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&box));
+    const QImage dark = box.iconPixmap().toImage();
+    QCOMPARE(dark.size(), QSize(40, 40));
+    service->setCurrentTheme(QStringLiteral("Light"));
+    service->applyTo(qApp);
+    QTRY_VERIFY(box.iconPixmap().toImage() != dark);
+}
+
+void QtAdvancedStylesheetTest::charactersHaveTheLanguagesForms_data()
+{
+    QTest::addColumn<QLocale>("language");
+    QTest::addColumn<QString>("family");
+    QTest::newRow("simplified") << QLocale(QLocale::Chinese, QLocale::China) << "Noto Sans CJK SC";
+    QTest::newRow("traditional") << QLocale(QLocale::Chinese, QLocale::Taiwan) << "Noto Sans CJK TC";
+    QTest::newRow("Japanese") << QLocale(QLocale::Japanese) << "Noto Sans CJK JP";
+    QTest::newRow("Korean") << QLocale(QLocale::Korean) << "Noto Sans CJK KR";
+}
+
+void QtAdvancedStylesheetTest::charactersHaveTheLanguagesForms()
+{
+    QFETCH(QLocale, language);
+    QFETCH(QString, family);
+    auto *const service = QtAdvancedStylesheet::getInstance();
+    service->setLanguage(language);
+    service->applyTo(qApp);
+    QFont font = QApplication::font();
+    // A program has one language: fonts of the same size would be those of the language before.
+    font.setPixelSize(30 + family.back().unicode() % 32 + family.at(family.size() - 2).unicode() % 32);
+    QCOMPARE(drawnWith(font, han), family.toLower());
+    // The style sheet names fonts of its own.
+    QWidget window;
+    auto *const layout = new QVBoxLayout(&window);
+    for (QWidget *const control :
+         std::initializer_list<QWidget *>{new QPushButton(han), new QLabel(han), new QLineEdit(han)}) {
+        layout->addWidget(control);
+        control->ensurePolished();
+        QVERIFY2(control->font().families().contains(family), control->metaObject()->className());
+    }
+    service->setLanguage(QLocale::c());
+}
+
+void QtAdvancedStylesheetTest::latinLettersAreTheSameInEveryLanguage()
+{
+    auto *const service = QtAdvancedStylesheet::getInstance();
+    const QString text = QStringLiteral("Length");
+    service->setLanguage(QLocale::c());
+    service->applyTo(qApp);
+    const QString family = drawnWith(QApplication::font(), text);
+    for (const QLocale::Language language : {QLocale::Chinese, QLocale::Japanese, QLocale::Korean}) {
+        service->setLanguage(language);
+        service->applyTo(qApp);
+        QCOMPARE(drawnWith(QApplication::font(), text), family);
+    }
+    service->setLanguage(QLocale::c());
+    service->applyTo(qApp);
+    QCOMPARE(QApplication::font().families(), QStringList());
 }
 
 void QtAdvancedStylesheetTest::theStyleSheetIsFilledIn_data()

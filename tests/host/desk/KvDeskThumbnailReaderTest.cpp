@@ -12,6 +12,7 @@ class KvDeskThumbnailReaderTest : public StatReportTest
 private slots:
     void sizes_data();
     void sizes();
+    void largerThumbnails();
     void keepsTheColours();
     void turnedPhotos();
     void brokenFiles_data();
@@ -42,6 +43,15 @@ void KvDeskThumbnailReaderTest::sizes()
     QCOMPARE(read.fault, QString());
     QCOMPARE(read.size, size);
     QCOMPARE(read.image.size(), thumbnail);
+}
+
+/// For screens with more pixels.
+void KvDeskThumbnailReaderTest::largerThumbnails()
+{
+    for (const char *const name : {"large.png", "large.jpg"}) {
+        const QString path = DeskFiles::image(QLatin1String(name), QSize(1024, 768));
+        QCOMPARE(KvDeskThumbnailReader::read(path, QSize(444, 333)).image.size(), QSize(444, 333));
+    }
 }
 
 void KvDeskThumbnailReaderTest::keepsTheColours()
