@@ -99,12 +99,12 @@ QVariant KvDeskValueTableModel::data(const QModelIndex &index, int role) const
 
 QVariant KvDeskValueTableModel::headerData(int section, Qt::Orientation orientation, int role) const
 {
-    // The tool tip has it where a narrow column cuts it.
     if (orientation != Qt::Horizontal || section < 0 || section >= ColumnCount)
         return QVariant();
     if (role == Qt::TextAlignmentRole)
         return alignmentOf(section);
-    if ((role != Qt::DisplayRole && role != Qt::ToolTipRole))
+    // The tool tip has it where a narrow column cuts it.
+    if (role != Qt::DisplayRole && role != Qt::ToolTipRole)
         return QVariant();
     const QString titles[ColumnCount] = {tr("Type"), tr("Object"), tr("Value name"), tr("Value")};
     return titles[section];
