@@ -254,16 +254,24 @@ void KvDeskValueTable::slotMeasureTexts()
     makeRoomForValues();
 }
 
-// A number that is cut short would be read as another one: rather the texts before it are shortened, as far
-// as their headings can be read.
+// A number that is cut short would be read as another one: rather the texts before it are shortened, and
+// their headings last.
 void KvDeskValueTable::makeRoomForValues()
 {
     const int room = m_view->viewport()->width() - m_valueWidth;
     const int wanted = std::accumulate(m_textWidths.begin(), m_textWidths.end(), 0);
+    QVector<int> least;
+    for (int column = 0; column < m_textWidths.size(); ++column)
+        least.append(qMin(headingWidth(column), m_textWidths.at(column)));
+    if (std::accumulate(least.begin(), least.end(), 0) > room)
+        least.fill(minimumColumnWidth);
+    const int spare = room - std::accumulate(least.begin(), least.end(), 0);
+    const int wish = wanted - std::accumulate(least.begin(), least.end(), 0);
     const QScopedValueRollback<bool> fitting(m_isFitting, true);
     for (int column = 0; column < m_textWidths.size(); ++column) {
         const int width = m_textWidths.at(column);
-        const int shortened = qMax(qMin(headingWidth(column), width), width * room / wanted);
+        const int shortened =
+            least.at(column) + (wish > 0 ? qMax(0, width - least.at(column)) * qMax(0, spare) / wish : 0);
         m_view->setColumnWidth(column, wanted <= room ? width : shortened);
     }
 }

@@ -148,7 +148,8 @@ QVariant KvDeskValueTableModel::headerData(int section, Qt::Orientation orientat
         return QVariant();
     if (role == Qt::TextAlignmentRole)
         return alignmentOf(section);
-    if (role != Qt::DisplayRole)
+    // The tool tip has it where a narrow column cuts it.
+    if (role != Qt::DisplayRole && role != Qt::ToolTipRole)
         return QVariant();
     const QString titles[ColumnCount] = {tr("Type"), tr("Object"), tr("Value name"), tr("Value")};
     return titles[section];

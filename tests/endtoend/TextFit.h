@@ -154,7 +154,9 @@ private:
             return;
         for (int i = 0; i < header->count(); ++i) {
             const QString text = header->model()->headerData(i, Qt::Horizontal).toString();
-            if (!header->isSectionHidden(i) && !text.isEmpty())
+            // Headings elide by themselves; what is left out has to be readable somewhere.
+            const QVariant toolTip = header->model()->headerData(i, Qt::Horizontal, Qt::ToolTipRole);
+            if (!header->isSectionHidden(i) && !text.isEmpty() && toolTip.toString() != text)
                 need(header, text, header->fontMetrics().size(0, text).width() + 4, header->sectionSize(i));
         }
     }
