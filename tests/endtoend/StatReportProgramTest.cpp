@@ -260,11 +260,11 @@ void StatReportProgramTest::speaksTheLanguage_data()
     const auto row = [](const char *variables, const char *line, const char *errors) {
         QTest::newRow(variables) << text(line) << text(errors);
     };
-    row("LC_ALL=de_DE.UTF-8", "check", "statreport: die Vorlage fehlt (mehr sagt statreport --help)\n");
+    row("LC_ALL=de_DE.UTF-8", "check", "statreport: die Vorlage fehlt (weitere Hilfe: statreport --help)\n");
     row("LC_ALL=|LANG=fr_FR.UTF-8", "check none.rtp --language es",
-        "statreport: none.rtp: no se puede abrir: No such file or directory\n");
+        "statreport: none.rtp: no se puede abrir: no existe el fichero o el directorio\n");
     row("LC_ALL=it_IT.UTF-8|LANGUAGE=de:fr", "stats --frob",
-        "statreport: Unbekannte Option \u201Efrob\u201C. (mehr sagt statreport --help)\n");
+        "statreport: Unbekannte Option \u201Efrob\u201C. (weitere Hilfe: statreport --help)\n");
     // A fault that the measuring library found.
     row("LANG=C", "stats --table none.csv --language de",
         "statreport: none.csv: Die Datei ist nicht vorhanden\n");
