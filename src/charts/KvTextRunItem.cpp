@@ -66,6 +66,8 @@ void KvTextRunItem::paint(QPainter *painter, const QStyleOptionGraphicsItem * /*
 {
     painter->setFont(fontForDevice(m_font, painter->device()));
     painter->setPen(m_color);
+    // A painter's own direction is the program's; charts look alike in every language.
+    painter->setLayoutDirection(Qt::LeftToRight);
     constexpr qreal margin = KvTextMeasure::Margin;
     for (const KvPlacedText &text : qAsConst(m_texts))
         painter->drawText(text.topLeft + QPointF(margin, margin + text.extent.ascent), text.text);

@@ -5,6 +5,7 @@
 #include "blocks/table/KvBaseTableItemDelegate.h"
 #include "blocks/table/KvTableContents.h"
 #include "blocks/table/KvTableFonts.h"
+#include "support/RightToLeft.h"
 #include "templates/KvStatisticsThemedNodeCfg.h"
 #include "templates/KvTemplateContext.h"
 
@@ -55,6 +56,7 @@ private slots:
     void theViewHasNoFrameOrScrollBars();
     void withoutAPageItScrolls();
     void readsFromLeftToRight();
+    void looksTheSameFromRightToLeft();
     void bothWaysOfPaintingAgree_data();
     void bothWaysOfPaintingAgree();
 
@@ -324,12 +326,31 @@ void KvStatisticSubTableTest::withoutAPageItScrolls()
 
 void KvStatisticSubTableTest::readsFromLeftToRight()
 {
-    QGuiApplication::setLayoutDirection(Qt::RightToLeft);
+    const RightToLeft program;
     KvStatisticSubTable piece(m_cfg.get(), m_delegate.get());
     piece.ensureView();
     QCOMPARE(piece.layoutDirection(), Qt::LeftToRight);
     QCOMPARE(piece.tableView()->layoutDirection(), Qt::LeftToRight);
-    QGuiApplication::setLayoutDirection(Qt::LeftToRight);
+}
+
+void KvStatisticSubTableTest::looksTheSameFromRightToLeft()
+{
+    const std::shared_ptr<KvTableContents> contents = makeContents(2);
+    contents->body.setCell(0, 0, QStringLiteral("11.421 mm"), QColor(), 2);
+    contents->body.setCell(1, 1, QStringLiteral("28.571 %"), QColor(), 2);
+    const auto picture = [&](bool withView) {
+        KvStatisticSubTable piece(m_cfg.get(), m_delegate.get());
+        piece.fill(contents, 0, 2);
+        if (withView)
+            piece.ensureView();
+        piece.setPlacement(724, 724, Qt::AlignLeft);
+        return TableProbe::pagePicture(&piece, withView);
+    };
+    for (const bool withView : {false, true}) {
+        const QImage expected = picture(withView);
+        const RightToLeft program;
+        QCOMPARE(picture(withView), expected);
+    }
 }
 
 void KvStatisticSubTableTest::bothWaysOfPaintingAgree_data()

@@ -4,8 +4,10 @@
 #include "ItemByItem.h"
 #include "SceneItems.h"
 #include "charts/KvTextRunItem.h"
+#include "support/RightToLeft.h"
 #include <QBuffer>
 #include <QGraphicsTextItem>
+#include <QGraphicsView>
 #include <QPainter>
 #include <QPdfWriter>
 
@@ -25,6 +27,7 @@ private slots:
     void sizeIsTheSameOnAnyDevice_data();
     void sizeIsTheSameOnAnyDevice();
     void staysTextInPdf();
+    void looksTheSameFromRightToLeft();
 };
 
 namespace {
@@ -153,6 +156,23 @@ void KvTextRunItemTest::staysTextInPdf()
     QVERIFY(buffer.data().contains("/ToUnicode"));
     QVERIFY(!buffer.data().contains("/Subtype /Image"));
     QVERIFY(buffer.data().contains("/FontFile"));
+}
+
+void KvTextRunItemTest::looksTheSameFromRightToLeft()
+{
+    QGraphicsScene scene;
+    KvTextRunItem::addTo(&scene, placed({QStringLiteral("11.421 mm"), QStringLiteral("Length (%)")}),
+                         ItemByItem::font(11.0), Qt::red);
+    const auto picture = [&scene]() {
+        QGraphicsView view(&scene);
+        view.setLayoutDirection(Qt::LeftToRight); // where the view itself has to begin
+        view.resize(200, 200);
+        return view.grab().toImage().convertToFormat(QImage::Format_ARGB32_Premultiplied);
+    };
+    const QImage expected = picture();
+    QVERIFY(ItemByItem::inkedPixels(expected) > 100);
+    const RightToLeft program;
+    QCOMPARE(picture(), expected);
 }
 
 STATREPORT_TEST_MAIN(KvTextRunItemTest)

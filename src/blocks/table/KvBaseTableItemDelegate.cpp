@@ -64,6 +64,8 @@ void KvBaseTableItemDelegate::paintText(QPainter *painter, const KvTextFit &fit,
     const qreal width = cell.width() - 2 * kTextPadding;
     if (text.isEmpty() || width <= 0)
         return;
+    // A painter's own direction is the program's; figures would stand behind their units.
+    painter->setLayoutDirection(Qt::LeftToRight);
     const qreal baseline = cell.top() + (cell.height() - fit.height()) / 2 + fit.ascent();
     painter->drawText(QPointF(cell.left() + kTextPadding, baseline), fit.fitted(text, width));
 }
