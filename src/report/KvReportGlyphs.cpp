@@ -12,17 +12,28 @@
 #include <QFont>
 #include <QJsonObject>
 #include <QStringList>
+#include <QTextDocument>
+#include <QTextDocumentFragment>
 
 namespace {
 
 constexpr int kMostNamed = 40;
 
+// What is read of a text: of HTML neither the tags, nor characters by their names instead of themselves.
+QString readable(const QString &text)
+{
+    if (!Qt::mightBeRichText(text))
+        return text;
+    // Pictures stand in it as this character.
+    return QTextDocumentFragment::fromHtml(text).toPlainText().remove(QChar::ObjectReplacementCharacter);
+}
+
+// Blocks without a text of their own have nothing under its key.
 void addTexts(ZtFontCoverage &coverage, const KvBaseEditorNodeCfg &cfg)
 {
     QJsonObject object;
     cfg.toJson(object);
-    for (const QJsonValue &value : qAsConst(object))
-        coverage.addText(value.toString());
+    coverage.addText(readable(object.value(QStringLiteral("text")).toString()));
 }
 
 void addTexts(ZtFontCoverage &coverage, const KvReportKernelData &data)
@@ -51,8 +62,8 @@ QString KvReportGlyphs::missingCharacters(const KvTemplateModel &model)
         addTexts(coverage, *data);
     for (const KvReportNode *node : model.nodes())
         addTexts(coverage, *node->config());
-    coverage.addText(model.header()->text());
-    coverage.addText(model.footer()->text());
+    coverage.addText(readable(model.header()->text()));
+    coverage.addText(readable(model.footer()->text()));
     return coverage.missingCharacters();
 }
 

@@ -46,6 +46,11 @@ void KvReportGlyphsTest::namesWhatIsMissing_data()
     QTest::newRow("nothing") << QStringLiteral("<p>Length</p>") << QString() << QStringList();
     QTest::newRow("header") << QStringLiteral("<p>\uF8F0</p>") << QString()
                             << QStringList(sentence + QStringLiteral("\uF8F0"));
+    QTest::newRow("named by its number") << QStringLiteral("<p>A &#xF8F0; B</p>") << QString()
+                                         << QStringList(sentence + QStringLiteral("\uF8F0"));
+    QTest::newRow("in a tag") << QStringLiteral("<p style=\"x:\uF8F0\">A</p>") << QString() << QStringList();
+    QTest::newRow("picture") << QStringLiteral("<p>A<img src=\"none.png\"/></p>") << QString()
+                             << QStringList();
     QTest::newRow("both") << QStringLiteral("\uF8F1") << QStringLiteral("\uF8F0\uF8F1")
                           << QStringList(sentence + QStringLiteral("\uF8F0\uF8F1"));
 }
