@@ -775,7 +775,7 @@ Do you want to replace it?</source>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>أدوات الإحصاء</translation>
+        <translation>التقارير والإحصاء</translation>
     </message>
     <message>
         <source>Select Template File</source>

@@ -775,7 +775,7 @@ Do you want to replace it?</source>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>统计工具</translation>
+        <translation>报告与统计</translation>
     </message>
     <message>
         <source>Select Template File</source>

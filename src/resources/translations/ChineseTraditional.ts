@@ -775,7 +775,7 @@ Do you want to replace it?</source>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>統計工具</translation>
+        <translation>報告與統計</translation>
     </message>
     <message>
         <source>Select Template File</source>

@@ -775,7 +775,7 @@ Sostituirlo?</translation>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>Strumenti statistici</translation>
+        <translation>Report e statistiche</translation>
     </message>
     <message>
         <source>Select Template File</source>

@@ -775,7 +775,7 @@ Do you want to replace it?</source>
     <name>StatReportingPlugin</name>
     <message>
         <source>Statistics tools</source>
-        <translation>Herramientas estadísticas</translation>
+        <translation>Informes y estadística</translation>
     </message>
     <message>
         <source>Select Template File</source>
