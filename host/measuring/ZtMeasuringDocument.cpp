@@ -192,6 +192,7 @@ void ZtMeasuringDocument::unregisterTypes(ZtTakenTables *taken)
 std::unique_ptr<ZtTakenTables> ZtMeasuringDocument::takeTables(const QVector<int> &types)
 {
     std::unique_ptr<ZtTakenTables> taken = takeObjects(types);
+    // As long as the types are known: receivers ask what went.
     for (const ZtTakenTables::Table &table : taken->tables) {
         if (!table.objects.isEmpty())
             emit ZtSignalCenter::getInstance()->signalObjectRemoved(table.typeId, table.objects.firstKey());

@@ -179,12 +179,19 @@ void KvDeskTableCommandTest::tablesOfSeveralTypes()
 
 void KvDeskTableCommandTest::everyTypeIsAnnouncedOnce()
 {
-    import(DeskFiles::table());
+    const int type = import(DeskFiles::table());
     const ZtSignalCenter *const center = ZtSignalCenter::getInstance();
+    // Who hears of it asks what kind of objects went.
+    bool isKnown = false;
+    connect(center, &ZtSignalCenter::signalObjectRemoved, this, [&](int removedType) {
+        isKnown = removedType == type && ZtKernelData::getInstance()->getGsManipulator(type);
+    });
     QSignalSpy created(center, SIGNAL(signalObjectCreated(int, int, const ZtKernelObjectData *)));
     QSignalSpy removed(center, SIGNAL(signalObjectRemoved(int, int)));
     m_desk->editor.slotUndo();
     QCOMPARE(removed.size(), 1);
+    QVERIFY(isKnown);
+    center->disconnect(this);
     m_desk->editor.slotRedo();
     QCOMPARE(created.size(), 1);
     QCOMPARE(removed.size(), 1);
