@@ -2,6 +2,7 @@
 #include "KvDeskFileCommands.h"
 
 #include "KvDeskFileKind.h"
+#include "KvDeskObjectEditor.h"
 #include "KvDeskProgress.h"
 #include "KvDeskRecentFiles.h"
 #include "KvDeskRecoveryFile.h"
@@ -98,10 +99,11 @@ struct LoadedTable
 
 } // namespace
 
-KvDeskFileCommands::KvDeskFileCommands(KvDeskSession *session, QWidget *window)
+KvDeskFileCommands::KvDeskFileCommands(KvDeskSession *session, QWidget *window, KvDeskObjectEditor *editor)
     : QObject(window)
     , m_session(session)
     , m_window(window)
+    , m_editor(editor)
     , m_progress(new KvDeskProgress(window))
 {}
 
@@ -301,10 +303,7 @@ bool KvDeskFileCommands::importTable(const QString &path)
         return tellFault(failure, fault, source);
     if (!reading->isRead)
         return tellFault(failure, reading->fault, source);
-    {
-        const KvDeskWaitCursor wait;
-        m_session->addTable(&reading->result.objects);
-    }
+    addTable(path, std::move(reading->result.objects));
     const ZtImportedTable &table = reading->result.table;
     for (const QString &note : table.notes)
         KvDeskStatus::log(ZtAppStatus::Warning, tr("%1: %2", "file, remark").arg(fileName(path), note),
@@ -313,6 +312,15 @@ bool KvDeskFileCommands::importTable(const QString &path)
                       tr("Table imported: %1 (%n object(s))", "", table.objectCount()).arg(fileName(path)),
                       source);
     return true;
+}
+
+void KvDeskFileCommands::addTable(const QString &path, std::vector<ZtReadyObjects> objects)
+{
+    const KvDeskWaitCursor wait;
+    if (m_editor)
+        m_editor->importTable(fileName(path), std::move(objects));
+    else
+        m_session->addTable(&objects);
 }
 
 bool KvDeskFileCommands::saveSession(const QString &path)

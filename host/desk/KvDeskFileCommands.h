@@ -5,12 +5,15 @@
 #include <QStringList>
 
 #include <functional>
+#include <vector>
 
 class KvDeskFileStamp;
+class KvDeskObjectEditor;
 class KvDeskProgress;
 class KvDeskSession;
 class QFileDialog;
 class ZtProgress;
+class ZtReadyObjects;
 struct KvDeskRecoveryFile;
 struct ZtFault;
 struct ZtLoadedSession;
@@ -26,8 +29,9 @@ class KvDeskFileCommands : public QObject
 {
     Q_OBJECT
 public:
-    /** \a window is the parent of the dialogs, \a session has to outlive this. */
-    KvDeskFileCommands(KvDeskSession *session, QWidget *window);
+    /** \a window is the parent of the dialogs. Tables that are imported become steps of the history of
+     * \a editor, if there is one. Session and editor have to outlive this. */
+    KvDeskFileCommands(KvDeskSession *session, QWidget *window, KvDeskObjectEditor *editor = nullptr);
 
     /** Asks about unsaved changes, if any. False when the user wants to go on with the present session. */
     bool maybeSave();
@@ -67,6 +71,7 @@ public slots:
 private:
     enum class OnConflict { Overwrite, SaveAs, Cancel };
 
+    void addTable(const QString &path, std::vector<ZtReadyObjects> objects);
     QString chooseFile(const QString &caption, const QString &filter);
     bool choose(QFileDialog *dialog, QString *path);
     /** False, with a fault, when the work was cancelled or ended by itself. */
@@ -82,6 +87,7 @@ private:
 
     KvDeskSession *m_session;
     QWidget *m_window;
+    KvDeskObjectEditor *m_editor;
     KvDeskProgress *m_progress;
     bool m_isCancelled = false;  ///< the work that run() did last
     bool m_isCollecting = false; ///< faults are told later, all together

@@ -4,6 +4,7 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QImageReader>
+#include <QRegularExpression>
 
 #include <algorithm>
 
@@ -21,10 +22,23 @@ bool isImageSuffix(const QString &suffix)
     return QImageReader::supportedImageFormats().contains(suffix.toLatin1());
 }
 
-bool startsLikeJson(const QString &path)
+// What JSON begins with, without what may stand before it; empty for anything else.
+QByteArray startOfJson(const QString &path)
 {
+    constexpr int enough = 4096;
     QFile file(path);
-    return file.open(QIODevice::ReadOnly) && file.peek(256).trimmed().startsWith('{');
+    QByteArray start = file.open(QIODevice::ReadOnly) ? file.read(enough) : QByteArray();
+    if (start.startsWith("\xEF\xBB\xBF"))
+        start.remove(0, 3);
+    start = start.trimmed();
+    return start.startsWith('{') || start.startsWith('[') ? start : QByteArray();
+}
+
+// Tables are lists of records, or say at once what they are.
+bool isTableJson(const QByteArray &start)
+{
+    static const QRegularExpression table(QStringLiteral(R"(^\[\s*\{|"format"\s*:\s*"statreport-values")"));
+    return table.match(QString::fromUtf8(start)).hasMatch();
 }
 
 // Tables are text; programs, archives and documents soon have a byte that no text has.
@@ -54,12 +68,13 @@ KvDeskFileKind::Kind KvDeskFileKind::of(const QString &path)
 {
     const QString suffix = QFileInfo(path).suffix().toLower();
     if (suffix == QLatin1String("json"))
-        return Session;
+        return isTableJson(startOfJson(path)) ? Table : Session;
     if (tableSuffixes().contains(suffix))
         return Table;
     if (isImageSuffix(suffix) || !QImageReader::imageFormat(path).isEmpty())
         return Image;
-    return startsLikeJson(path) ? Session : Table;
+    const QByteArray json = startOfJson(path);
+    return json.isEmpty() || isTableJson(json) ? Table : Session;
 }
 
 bool KvDeskFileKind::isKnown(const QString &path)
@@ -80,5 +95,5 @@ QStringList KvDeskFileKind::imagePatterns()
 
 QStringList KvDeskFileKind::tablePatterns()
 {
-    return patternsOf(tableSuffixes());
+    return patternsOf(tableSuffixes() + QStringList(QStringLiteral("json")));
 }

@@ -10,7 +10,7 @@ class KvDeskFileKind
 public:
     enum Kind { Session, Image, Table };
 
-    /** By the file's suffix; one that says nothing is told by the file's first bytes. */
+    /** By the file's suffix; one that says nothing, or not enough, is told by the file's first bytes. */
     static Kind of(const QString &path);
 
     /** Whether of() is more than a guess: for a file that is there, and no folder. */

@@ -109,7 +109,7 @@ KvDeskMainWindow::KvDeskMainWindow(ZtMeasuringDocument *document, QWidget *paren
     , m_session(new KvDeskSession(document, this))
     , m_selection(new KvDeskSelection(this))
     , m_objectEditor(new KvDeskObjectEditor(m_session, m_selection, this))
-    , m_files(new KvDeskFileCommands(m_session, this))
+    , m_files(new KvDeskFileCommands(m_session, this, m_objectEditor))
     , m_sources(new KvDeskSourceCommands(m_session, m_files, this))
     , m_snapshots(new KvDeskSnapshots(m_actions, document, this))
 {

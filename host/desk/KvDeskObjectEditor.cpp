@@ -7,11 +7,13 @@
 #include "KvDeskPlaceCommand.h"
 #include "KvDeskSelection.h"
 #include "KvDeskSession.h"
+#include "KvDeskTableCommand.h"
 #include "kernel/ZtGsManipulator.h"
 #include "kernel/ZtKernelData.h"
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtMeasuringDocument.h"
+#include "measuring/ZtReadyObjects.h"
 #include "measuring/ZtSession.h"
 
 #include <QClipboard>
@@ -21,6 +23,7 @@
 #include <QUndoStack>
 
 #include <limits>
+#include <utility>
 
 namespace {
 
@@ -235,6 +238,12 @@ void KvDeskObjectEditor::removePlace(KvDeskObjectId counter, int index)
                                 KvDeskPlaceCommand::Remove, counter, index, state.points.at(index)));
 }
 
+void KvDeskObjectEditor::importTable(const QString &name, std::vector<ZtReadyObjects> objects)
+{
+    if (!objects.empty())
+        push(new KvDeskTableCommand(tr("import of %1").arg(name), m_session->document(), std::move(objects)));
+}
+
 void KvDeskObjectEditor::copy(const QSet<KvDeskObjectId> &objects)
 {
     if (objects.isEmpty())
@@ -294,11 +303,15 @@ void KvDeskObjectEditor::slotUndo()
 
 void KvDeskObjectEditor::slotRedo()
 {
+    // One object would be announced for all of the table, which is not worth to be selected.
+    const bool isTable = dynamic_cast<const KvDeskTableCommand *>(m_stack->command(m_stack->index()));
     m_touched.clear();
     {
         const QScopedValueRollback<bool> applying(m_isApplying, true);
         m_stack->redo();
     }
+    if (isTable)
+        m_touched.clear();
     selectTouched();
 }
 
@@ -368,10 +381,11 @@ void KvDeskObjectEditor::slotObjectRemoved(int aType, int aId)
         objectCameOrWent(aType);
 }
 
-// Tables bring types of their own, whose objects cannot be meant by any step.
+// Tables bring types of their own, whose objects cannot be meant by any step that was done; but a type that
+// was taken out may get back its number.
 void KvDeskObjectEditor::objectCameOrWent(int type)
 {
-    if (ZtDrawnType::find(type))
+    if (ZtDrawnType::find(type) || m_stack->canRedo())
         m_stack->clear();
     slotOtherChange();
 }

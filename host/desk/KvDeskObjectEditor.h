@@ -6,12 +6,15 @@
 #include <QObject>
 #include <QSet>
 
+#include <vector>
+
 class KvDeskSelection;
 class KvDeskSession;
 class QUndoCommand;
 class QUndoStack;
 class ZtCalibration;
 class ZtKernelObjectData;
+class ZtReadyObjects;
 
 /**
  * Every change that the user makes to objects: each is one step that can be undone and redone, and objects
@@ -53,6 +56,10 @@ public:
     void addPlace(KvDeskObjectId counter, const QPointF &place);
     /** \a index is that of the place among the counter's points. */
     void removePlace(KvDeskObjectId counter, int index);
+
+    /** Adds the objects of a table that was read already; \a name is what the user calls the table. A table
+     * without objects is no step. */
+    void importTable(const QString &name, std::vector<ZtReadyObjects> objects);
 
     /** Objects that were drawn go to the clipboard, and the values of all of them as a table. */
     void copy(const QSet<KvDeskObjectId> &objects);

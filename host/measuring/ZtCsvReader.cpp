@@ -58,6 +58,11 @@ ZtCsvReader::ZtCsvReader(std::string_view text, char separator)
     , m_separator(separator)
 {}
 
+void ZtCsvReader::beginPass(double from, double to)
+{
+    ZtProgress::setPart(m_progress, from, to);
+}
+
 void ZtCsvReader::rewind()
 {
     m_position = 0;

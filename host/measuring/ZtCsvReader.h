@@ -3,6 +3,7 @@
 
 #include "measuring/ZtFault.h"
 #include "measuring/ZtMeasuringGlobal.h"
+#include "measuring/ZtTableRows.h"
 
 #include <deque>
 #include <string>
@@ -11,7 +12,8 @@
 
 class ZtProgress;
 
-/** One row of a table; its fields point into the reader's text and into the row itself. */
+/** One row of a table, as separated values or as another file has it; its fields point into the reader's text
+ * and into the row itself. */
 struct ZtCsvRow
 {
     int line = 0;                         ///< where the row begins, from 1
@@ -25,7 +27,7 @@ struct ZtCsvRow
  * Fields may be quoted with ", then they may hold separators, line ends and, doubled, quotes. Lines end with
  * LF, CR LF or CR. Lines of nothing but blanks and separators are no rows.
  */
-class ZT_MEASURING_EXPORT ZtCsvReader
+class ZT_MEASURING_EXPORT ZtCsvReader : public ZtTableRows
 {
 public:
     /** \a text has to outlive the reader. */
@@ -33,15 +35,10 @@ public:
 
     /** Rows are counted for \a progress from now on; reading ends with a fault when it is cancelled. */
     void setProgress(ZtProgress *progress) { m_progress = progress; }
-    ZtProgress *progress() const { return m_progress; }
-
-    /** Goes back to the first row. */
-    void rewind();
-
-    /** Reads the next row; false at the end of the text and after a fault, which fault() then holds. */
-    bool next(ZtCsvRow *row);
-
-    const ZtFault &fault() const { return m_fault; }
+    void beginPass(double from, double to) override;
+    void rewind() override;
+    bool next(ZtCsvRow *row) override;
+    const ZtFault &fault() const override { return m_fault; }
     char separator() const { return m_separator; }
 
 private:

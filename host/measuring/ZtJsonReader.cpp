@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "measuring/ZtJsonReader.h"
 
+#include "measuring/ZtFault.h"
+
+#include <QCoreApplication>
+
 #include <algorithm>
 #include <charconv>
 
@@ -98,6 +102,19 @@ bool ZtJsonReader::check(ZtProgress *progress)
     m_at = syntax.begin();
     m_largeParts = syntax.takeLargeParts();
     return isJson;
+}
+
+ZtFault ZtJsonReader::fault() const
+{
+    ZtFault fault;
+    if (m_error.error == QJsonParseError::NoError)
+        return fault;
+    fault.line = lineOf(m_error.offset);
+    fault.message = m_error.error == QJsonParseError::DeepNesting
+                        ? QCoreApplication::translate("ZtSession", "The file is nested too deeply")
+                        : QCoreApplication::translate("ZtSession", "The file is not valid JSON (%1)")
+                              .arg(m_error.errorString());
+    return fault;
 }
 
 int ZtJsonReader::lineOf(int offset) const

@@ -11,6 +11,7 @@
 #include <vector>
 
 class ZtProgress;
+struct ZtFault;
 
 /**
  * Takes one value after another from JSON, without building a tree of all of it.
@@ -33,6 +34,8 @@ public:
      */
     bool check(ZtProgress *progress = nullptr);
     const QJsonParseError &error() const { return m_error; }
+    /** The same for the user, with its line. */
+    ZtFault fault() const;
     /** Line of a byte, from 1. */
     int lineOf(int offset) const;
 

@@ -17,10 +17,11 @@
 #include "measuring/ZtSession.h"
 #include "measuring/ZtStillImageSource.h"
 #include "measuring/ZtTableImport.h"
+#include "measuring/ZtTakenTables.h"
 #include "measuring/ZtUnitSettings.h"
-#include "measuring/ZtWorkerThread.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace {
 
@@ -57,12 +58,17 @@ QVector<QPair<int, int>> firstObjects()
 }
 
 // One announcement per type stands for all of its objects: receivers refresh everything.
+void announceFirst(int type)
+{
+    const auto objects = kernel()->objects().constFind(type);
+    if (objects != kernel()->objects().constEnd() && !objects->isEmpty())
+        emit ZtSignalCenter::getInstance()->signalObjectCreated(type, objects->firstKey(), objects->first());
+}
+
 void announceTypes()
 {
-    for (const QPair<int, int> &object : firstObjects()) {
-        if (const ZtKernelObjectData *const data = kernel()->object(object.first, object.second))
-            emit ZtSignalCenter::getInstance()->signalObjectCreated(object.first, object.second, data);
-    }
+    for (const QPair<int, int> &object : firstObjects())
+        announceFirst(object.first);
 }
 
 ZtSessionRow toSessionRow(const ZtImportedManipulator &manipulator, int id, const ZtKernelObjectData *data)
@@ -85,32 +91,6 @@ ZtSessionObject toSessionObject(const ZtDrawnType &type, int id, const ZtKernelO
 }
 
 } // namespace
-
-/// What is left of imported tables, for another thread to free: with a million rows that takes a while.
-struct ZtMeasuringDocument::Remains
-{
-    QVector<ZtObjectMap> objects;
-    std::vector<std::unique_ptr<ZtGsManipulator>> manipulators;
-    QHash<int, ZtSessionTable> tables;
-
-    ~Remains() { free(); }
-
-    void free()
-    {
-        for (const ZtObjectMap &map : qAsConst(objects))
-            qDeleteAll(map);
-        objects.clear();
-        manipulators.clear();
-        tables.clear();
-    }
-
-    bool isLarge() const
-    {
-        constexpr int many = 10000;
-        return std::any_of(objects.begin(), objects.end(),
-                           [](const ZtObjectMap &map) { return map.size() >= many; });
-    }
-};
 
 ZtMeasuringDocument::ZtMeasuringDocument(QObject *parent)
     : QObject(parent)
@@ -142,8 +122,7 @@ ZtMeasuringDocument::~ZtMeasuringDocument()
         kernel()->setKernelImage(nullptr);
     if (kernel()->objectPainter() == m_objectsPainter.get())
         kernel()->setObjectPainter(nullptr);
-    Remains remains;
-    removeImportedTypes(&remains);
+    unregisterTypes(takeObjects(m_importedTypes).get());
     for (const ZtDrawnType &type : ZtDrawnType::all())
         kernel()->unregisterType(type.id);
 }
@@ -163,40 +142,81 @@ void ZtMeasuringDocument::retranslate()
 
 void ZtMeasuringDocument::clear()
 {
-    const auto remains = std::make_shared<Remains>();
-    removeObjects(remains.get());
-    removeImportedTypes(remains.get());
+    std::unique_ptr<ZtTakenTables> taken = removeObjects();
+    unregisterTypes(taken.get());
     setFrameSource(nullptr);
     setCalibration(ZtCalibration());
-    if (remains->isLarge())
-        ZtWorkerThread::retire(ZtWorkerThread::begin([remains]() { remains->free(); }));
+    ZtTakenTables::retire(std::move(taken));
 }
 
-void ZtMeasuringDocument::removeObjects(Remains *remains)
+std::unique_ptr<ZtTakenTables> ZtMeasuringDocument::removeObjects()
 {
     const QVector<QPair<int, int>> first = firstObjects();
+    std::unique_ptr<ZtTakenTables> taken = takeObjects(m_importedTypes);
     for (const QPair<int, int> &object : first) {
-        const ZtObjectMap objects = kernel()->takeObjects(object.first);
-        if (m_importedTypes.contains(object.first)) {
-            remains->objects.append(objects);
+        if (m_importedTypes.contains(object.first))
             continue;
-        }
-        qDeleteAll(objects);
+        qDeleteAll(kernel()->takeObjects(object.first));
         if (ZtGsManipulator *const manipulator = kernel()->getGsManipulator(object.first))
             manipulator->clearObjectNames();
     }
-    m_tables.swap(remains->tables);
     for (const QPair<int, int> &object : first)
         emit ZtSignalCenter::getInstance()->signalObjectRemoved(object.first, object.second);
+    return taken;
 }
 
-void ZtMeasuringDocument::removeImportedTypes(Remains *remains)
+std::unique_ptr<ZtTakenTables> ZtMeasuringDocument::takeObjects(const QVector<int> &types)
 {
-    for (const int id : qAsConst(m_importedTypes)) {
-        remains->objects.append(kernel()->takeObjects(id));
-        remains->manipulators.push_back(kernel()->unregisterType(id));
+    auto taken = std::make_unique<ZtTakenTables>();
+    for (const int id : types) {
+        if (!m_importedTypes.contains(id))
+            continue;
+        ZtTakenTables::Table table;
+        table.typeId = id;
+        table.objects = kernel()->takeObjects(id);
+        if (m_tables.contains(id))
+            table.rows = m_tables.take(id);
+        taken->tables.push_back(std::move(table));
     }
-    m_importedTypes.clear();
+    return taken;
+}
+
+void ZtMeasuringDocument::unregisterTypes(ZtTakenTables *taken)
+{
+    for (ZtTakenTables::Table &table : taken->tables) {
+        table.manipulator = kernel()->unregisterType(table.typeId);
+        m_importedTypes.removeAll(table.typeId);
+    }
+}
+
+std::unique_ptr<ZtTakenTables> ZtMeasuringDocument::takeTables(const QVector<int> &types)
+{
+    std::unique_ptr<ZtTakenTables> taken = takeObjects(types);
+    // As long as the types are known: receivers ask what went.
+    for (const ZtTakenTables::Table &table : taken->tables) {
+        if (!table.objects.isEmpty())
+            emit ZtSignalCenter::getInstance()->signalObjectRemoved(table.typeId, table.objects.firstKey());
+    }
+    unregisterTypes(taken.get());
+    return taken;
+}
+
+void ZtMeasuringDocument::restoreTables(std::unique_ptr<ZtTakenTables> taken)
+{
+    for (ZtTakenTables::Table &table : taken->tables) {
+        const int id = table.typeId;
+        const QString name = table.manipulator->objectTypeName(0);
+        kernel()->registerType(id, std::move(table.manipulator),
+                               std::make_unique<ZtKernelObjectDataDescr>(id, name));
+        ZtObjectMap objects;
+        objects.swap(table.objects);
+        kernel()->setObjects(id, std::move(objects));
+        if (table.rows)
+            m_tables.insert(id, *std::exchange(table.rows, std::nullopt));
+        m_importedTypes.insert(std::lower_bound(m_importedTypes.begin(), m_importedTypes.end(), id), id);
+    }
+    for (const ZtTakenTables::Table &table : taken->tables)
+        announceFirst(table.typeId);
 }
 
 void ZtMeasuringDocument::setCalibration(const ZtCalibration &calibration)
@@ -288,12 +308,13 @@ bool ZtMeasuringDocument::importTable(QIODevice *device, const QString &fileName
     return true;
 }
 
-void ZtMeasuringDocument::addTable(std::vector<ZtReadyObjects> *ready)
+QVector<int> ZtMeasuringDocument::addTable(std::vector<ZtReadyObjects> *ready)
 {
     const QVector<int> ids = ZtTableImport::apply(ready);
     for (int i = 0; i < ids.size(); ++i)
         m_tables.insert(ids.at(i), (*ready)[static_cast<std::size_t>(i)].table());
     m_importedTypes += ids;
+    return ids;
 }
 
 std::optional<ZtUnit> ZtMeasuringDocument::importedUnit(const QString &typeName,

@@ -25,6 +25,7 @@ class ZtObjectsPainter;
 class ZtReadyObjects;
 class ZtStillImageSource;
 struct ZtLoadedSession;
+struct ZtTakenTables;
 
 /**
  * What a measuring application works on: the image, its calibration, and the objects in ZtKernelData.
@@ -84,8 +85,15 @@ public:
                      QStringList *notes = nullptr);
     bool importTable(QIODevice *device, const QString &fileName, const ZtTableImportOptions &options,
                      ZtFault *fault, QStringList *notes = nullptr);
-    /** Adds the objects of a table that was read already, which costs the same for any number of rows. */
-    void addTable(std::vector<ZtReadyObjects> *ready);
+    /** Adds the objects of a table that was read already, which costs the same for any number of rows;
+     * returns the ids of its types. */
+    QVector<int> addTable(std::vector<ZtReadyObjects> *ready);
+    /** Takes types that tables brought out of the kernel, with their objects and names as they are: at the
+     * same cost for any number of rows, and announced as one removal per type. */
+    std::unique_ptr<ZtTakenTables> takeTables(const QVector<int> &types);
+    /** Puts them back under their ids, which no other types have got meanwhile. Costs and announces as
+     * addTable(). */
+    void restoreTables(std::unique_ptr<ZtTakenTables> taken);
     /** Ids of the types that tables brought, in ascending order. */
     const QVector<int> &importedTypes() const { return m_importedTypes; }
 
@@ -118,12 +126,11 @@ private slots:
     void slotObjectRemoved(int aType, int aId);
 
 private:
-    struct Remains;
-
     void connectSignals();
     void registerTypes();
-    void removeObjects(Remains *remains);
-    void removeImportedTypes(Remains *remains);
+    std::unique_ptr<ZtTakenTables> removeObjects();
+    std::unique_ptr<ZtTakenTables> takeObjects(const QVector<int> &types);
+    void unregisterTypes(ZtTakenTables *taken);
     void useSource(std::unique_ptr<ZtFrameSource> source, const QString &imagePath,
                    const ZtCalibration &offered);
     void apply(ZtLoadedSession *loaded);

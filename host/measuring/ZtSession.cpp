@@ -39,15 +39,6 @@ bool fail(const QString &message, ZtFault *fault)
     return false;
 }
 
-bool failParse(const ZtJsonReader &json, ZtFault *fault)
-{
-    const QJsonParseError &error = json.error();
-    fault->line = json.lineOf(error.offset);
-    if (error.error == QJsonParseError::DeepNesting)
-        return fail(Text::tr("The file is nested too deeply"), fault);
-    return fail(Text::tr("The file is not valid JSON (%1)").arg(error.errorString()), fault);
-}
-
 bool isBlank(std::string_view bytes)
 {
     return bytes.find_first_not_of(" \t\n\v\f\r") == std::string_view::npos;
@@ -112,8 +103,11 @@ bool ZtSession::parse(const QByteArray &bytes, const QString &path, ZtSession *s
     const bool isJson = json.check(progress);
     if (ZtProgress::isCancelled(progress))
         return failCancelled(fault);
-    if (!isJson)
-        return failParse(json, fault);
+    if (!isJson) {
+        *fault = json.fault();
+        fault->file = path;
+        return false;
+    }
     if (json.kind() != ZtJsonReader::Object)
         return fail(Text::tr("The file is not a session"), fault);
     ZtProgress::setPart(progress, checkShare, sessionShare);

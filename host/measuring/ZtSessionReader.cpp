@@ -6,6 +6,7 @@
 #include "measuring/ZtImportedTypeBuilder.h"
 #include "measuring/ZtJsonMembers.h"
 #include "measuring/ZtJsonReader.h"
+#include "measuring/ZtJsonValues.h"
 #include "measuring/ZtProgress.h"
 #include "measuring/ZtSessionFormat.h"
 #include "measuring/ZtTableNumber.h"
@@ -144,7 +145,10 @@ bool ZtSessionReader::read(ZtSession *session)
 bool ZtSessionReader::readVersion(const ZtJsonMembers &members)
 {
     const bool hasFormat = members.goTo(Format::format) && m_json->kind() == ZtJsonReader::Text;
-    if (!hasFormat || m_json->text() != Format::formatName)
+    const QString format = hasFormat ? m_json->text() : QString();
+    if (format == QLatin1String(ZtJsonValues::formatName))
+        return fail(Format::format, tr("This file is a table of values; import it"));
+    if (format != Format::formatName)
         return fail(Format::format, tr("The file is not a session"));
     if (!members.goTo(Format::versionKey) || m_json->kind() != ZtJsonReader::Number)
         return fail(Format::versionKey, tr("This must be a number"));

@@ -10,6 +10,7 @@
 #include "measuring/ZtFileFault.h"
 #include "measuring/ZtImportedManipulator.h"
 #include "measuring/ZtImportedTable.h"
+#include "measuring/ZtJsonRows.h"
 #include "measuring/ZtProgress.h"
 #include "measuring/ZtReadyObjects.h"
 #include "measuring/ZtTableDialect.h"
@@ -55,11 +56,9 @@ bool isColumnHeader(const ZtCsvRow &row)
     return false;
 }
 
-std::unique_ptr<ZtTableReader> makeReader(const ZtCsvRow &firstRow, ZtCsvReader *rows,
+std::unique_ptr<ZtTableReader> makeReader(const ZtCsvRow &firstRow, ZtTableRows *rows,
                                           const ZtTableImportOptions &options, bool decimalComma)
 {
-    if (ZtClassIndexTableReader::recognizes(firstRow))
-        return std::make_unique<ZtClassIndexTableReader>(rows, options, decimalComma);
     QVector<ZtTableHeader> headers;
     for (const std::string_view field : firstRow.fields)
         headers.append(ZtTableHeader::parse(QString::fromUtf8(field.data(), static_cast<int>(field.size()))));
@@ -68,8 +67,25 @@ std::unique_ptr<ZtTableReader> makeReader(const ZtCsvRow &firstRow, ZtCsvReader 
     return std::make_unique<ZtWideTableReader>(rows, options, decimalComma);
 }
 
-bool readText(std::string_view text, const ZtTableImportOptions &options, ZtImportedTable *table,
+// Numbers of JSON have a decimal point.
+bool readJson(std::string_view text, const ZtTableImportOptions &options, ZtImportedTable *table,
               ZtFault *fault, ZtProgress *progress)
+{
+    const std::unique_ptr<ZtJsonRows> rows = ZtJsonRows::open(text, progress, fault);
+    if (!rows)
+        return false;
+    rows->beginPass(0.1, 0.9);
+    ZtCsvRow columns;
+    rows->next(&columns);
+    const std::unique_ptr<ZtTableReader> reader = makeReader(columns, rows.get(), options, false);
+    if (reader->read(table))
+        return true;
+    *fault = rows->fault().isNull() ? rows->located(reader->fault()) : rows->fault();
+    return false;
+}
+
+bool readSeparated(std::string_view text, const ZtTableImportOptions &options, ZtImportedTable *table,
+                   ZtFault *fault, ZtProgress *progress)
 {
     const bool knownComma = options.decimalMark == ZtTableImportOptions::Comma;
     ZtCsvReader rows(text, ZtTableDialect::findSeparator(text, knownComma));
@@ -86,8 +102,10 @@ bool readText(std::string_view text, const ZtTableImportOptions &options, ZtImpo
     }
     const bool detected =
         options.decimalMark == ZtTableImportOptions::DetectMark && ZtTableDialect::hasDecimalComma(&rows);
+    const bool isClassIndex = ZtClassIndexTableReader::recognizes(firstRow);
     const std::unique_ptr<ZtTableReader> reader =
-        makeReader(firstRow, &rows, options, knownComma || detected);
+        isClassIndex ? std::make_unique<ZtClassIndexTableReader>(&rows, options, knownComma || detected)
+                     : makeReader(firstRow, &rows, options, knownComma || detected);
     if (reader->read(table))
         return true;
     *fault = reader->fault();
@@ -144,6 +162,7 @@ bool ZtTableImport::parse(const QByteArray &bytes, const QString &fileName,
     bool isRead = bytes.size() <= options.maximumBytes || failTooLarge(options.maximumBytes, fault);
     isRead = isRead && ZtTextDecoder::toUtf8(bytes, &utf8, fault);
     const std::string_view text(utf8.constData(), static_cast<std::size_t>(utf8.size()));
+    const auto readText = ZtJsonRows::recognizes(text) ? readJson : readSeparated;
     isRead = isRead && readText(text, options, table, fault, progress);
     if (!isRead)
         fault->file = fileName;

@@ -16,7 +16,8 @@ class ZtProgress;
 class ZtReadyObjects;
 
 /**
- * Reads tables of measurements: one value per row, one object per row, or results as ImageJ writes them.
+ * Reads tables of measurements: one value per row, one object per row, or results as ImageJ writes them, as
+ * separated values; and, as JSON, lists of such rows and what ZtTableExport writes.
  *
  * Layout, separator, decimal mark and encoding are found out. A table is taken as a whole: at the first fault
  * nothing of it is.

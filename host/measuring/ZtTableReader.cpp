@@ -19,7 +19,7 @@ QString toText(std::string_view field)
 
 } // namespace
 
-ZtTableReader::ZtTableReader(ZtCsvReader *rows, const ZtTableImportOptions &options, bool decimalComma)
+ZtTableReader::ZtTableReader(ZtTableRows *rows, const ZtTableImportOptions &options, bool decimalComma)
     : m_rows(rows)
     , m_options(options)
     , m_decimalComma(decimalComma)
@@ -130,11 +130,10 @@ bool ZtTableReader::addNumber(const ZtCsvRow &row, int column, const Target &tar
         number.kind == ZtTableNumber::Infinite || !std::isfinite(unit.toBase(number.value));
     if (number.kind != ZtTableNumber::Number || isInfinite)
         return failNumber(row, column, isInfinite);
-    const bool isAdded =
-        builder(target.type)
-            .addCell(target.object, target.valueIndex, number.value,
-                     ZtTableNumber::textOf(field, m_decimalComma, &m_numberText), unit,
-                     {row.line, column + 1});
+    const bool isAdded = builder(target.type)
+                             .addCell(target.object, target.valueIndex, number.value,
+                                      ZtTableNumber::textOf(field, m_decimalComma, &m_numberText), unit,
+                                      {row.line, column + 1});
     return isAdded || failUnit(row, column, target, unit);
 }
 

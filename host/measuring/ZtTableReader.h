@@ -4,9 +4,9 @@
 #include "measuring/ZtCsvReader.h"
 #include "measuring/ZtFault.h"
 #include "measuring/ZtImportedTable.h"
-#include "measuring/ZtProgress.h"
 #include "measuring/ZtTableHeader.h"
 #include "measuring/ZtTableImportOptions.h"
+#include "measuring/ZtTableRows.h"
 #include "measuring/ZtTableUnits.h"
 
 #include <QByteArray>
@@ -25,7 +25,7 @@ class ZtTableReader
     Q_DECLARE_TR_FUNCTIONS(ZtTableImport)
 public:
     /** All are borrowed. \a decimalComma as in ZtTableNumber. */
-    ZtTableReader(ZtCsvReader *rows, const ZtTableImportOptions &options, bool decimalComma);
+    ZtTableReader(ZtTableRows *rows, const ZtTableImportOptions &options, bool decimalComma);
     virtual ~ZtTableReader();
 
     /** Reads the whole table; false with a fault(). */
@@ -43,7 +43,7 @@ protected:
     /** Goes back to the row after the header. */
     void rewindToFirstRow();
     /** The rows from here to the end take this part of the time that the whole table takes, 0 to 1. */
-    void beginPass(double from, double to) { ZtProgress::setPart(m_rows->progress(), from, to); }
+    void beginPass(double from, double to) { m_rows->beginPass(from, to); }
     /** The next row; false at the end and after a fault, which hasFault() tells apart. */
     bool nextRow(ZtCsvRow *row);
     bool nextRowLikeHeader(ZtCsvRow *row);
@@ -86,7 +86,7 @@ private:
     bool checkUnits();
     bool build(ZtImportedTable *table);
 
-    ZtCsvReader *m_rows;
+    ZtTableRows *m_rows;
     const ZtTableImportOptions &m_options;
     bool m_decimalComma;
     ZtTableUnits m_units;

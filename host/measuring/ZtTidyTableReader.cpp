@@ -99,8 +99,15 @@ bool ZtTidyTableReader::readRow(const ZtCsvRow &row)
     m_types.resize(static_cast<std::size_t>(typeCount()));
     int valueIndex = 0;
     int object = 0;
+    if (m_objectColumn >= 0 && isWithoutValue(row))
+        return findObject(row, type, valueIndex, &object);
     return findValue(row, type, &valueIndex) && findObject(row, type, valueIndex, &object) &&
            readValue(row, type, object, valueIndex);
+}
+
+bool ZtTidyTableReader::isWithoutValue(const ZtCsvRow &row) const
+{
+    return field(row, m_nameColumn).empty() && field(row, m_valueColumn).empty();
 }
 
 bool ZtTidyTableReader::findValue(const ZtCsvRow &row, int type, int *valueIndex)

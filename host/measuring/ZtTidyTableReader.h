@@ -38,6 +38,8 @@ private:
     bool chooseColumns();
     void noteLeftOutColumns();
     bool readRow(const ZtCsvRow &row);
+    /** An object that has no values makes a row that names none. */
+    bool isWithoutValue(const ZtCsvRow &row) const;
     bool readValue(const ZtCsvRow &row, int type, int object, int valueIndex);
     bool findUnit(const ZtCsvRow &row, int type, int valueIndex, const ZtUnit **unit);
     bool readUnit(const ZtCsvRow &row, const QString &valueName, ZtUnit *unit);

@@ -24,7 +24,7 @@ _statreport()
 
     case $previous in
     --session) _statreport_files "json"; return ;;
-    --table) _statreport_files "csv|tsv|tab|txt|xls"; return ;;
+    --table) _statreport_files "csv|tsv|tab|txt|xls|json"; return ;;
     --image) _statreport_files "png|jpg|jpeg|tif|tiff|bmp"; return ;;
     -o | --output) _statreport_files "pdf"; return ;;
     --decimal) _statreport_words "point comma"; return ;;

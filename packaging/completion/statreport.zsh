@@ -12,7 +12,7 @@ _statreport() {
   )
   data=(
     '(--table)--session=[measurements\: a session of the Measuring Desk]:session:_files -g "*.json(-.)"'
-    '(--session)--table=[measurements\: a table]:table:_files -g "*.(csv|tsv|tab|txt|xls)(-.)"'
+    '(--session)--table=[measurements\: a table]:table:_files -g "*.(csv|tsv|tab|txt|xls|json)(-.)"'
     '*--unit=[unit of values that state none, or Name=unit]:unit:'
     '--type-column=[column with the object types]:column:'
     '--name-column=[column with the object names]:column:'

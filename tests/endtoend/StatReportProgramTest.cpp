@@ -39,6 +39,7 @@ private slots:
     void speaksTheLanguage();
     void writesNoMarksOfDirection();
     void programsReadEnglish();
+    void readsTablesAlike();
     void showsHelp_data();
     void showsHelp();
     void tellsWhenTheOutputIsFull_data();
@@ -103,6 +104,15 @@ void StatReportProgramTest::init()
           "1, \"points\": [[0, 0], \"x\"]}]}");
     write("truncated.json", "{\"format\": \"statreport-session\",\n\"version\":");
     write("word.csv", "name,length_mm\nA,1.5\nB,oops\n");
+    write("records.json", "[{\"name\":\"A\",\"length_mm\":1.5},\n{\"name\":\"B\",\"length_mm\":2.5}]");
+    write("word.json", "[{\"name\":\"A\",\"length_mm\":1.5},\n{\"name\":\"B\",\"length_mm\":\"oops\"},"
+                       "{\"name\":\"C\",\"length_mm\":2}]");
+    write("values.json",
+          "{\"format\":\"statreport-values\",\"version\":1,\"objects\":[\n"
+          "{\"type\":\"Object\",\"index\":1,\"name\":\"A\",\"values\":[{\"name\":\"length\",\"unit\":\"mm\","
+          "\"value\":1.5}]},\n"
+          "{\"type\":\"Object\",\"index\":2,\"name\":\"B\",\"values\":[{\"name\":\"length\",\"unit\":\"mm\","
+          "\"value\":2.5}]}\n]}\n");
     write("ragged.csv", "name,length_mm\nA,1.5\nB\n");
     write("out.pdf", oldContent);
     QVERIFY(QDir(m_folder->path()).mkdir(text("folder")));
@@ -153,6 +163,15 @@ void StatReportProgramTest::saysWhatIsWrong_data()
     add("stats --table good.csv --type-column Kind", 1,
         "good.csv:1: There is no column \"Kind\"; the columns are \"name\", \"length_mm\"");
     add("render good.rtp --table word.csv -o out.pdf", 1, "word.csv:3:2: \"oops\" is not a number");
+
+    add("stats --table list.json", 1, "list.json:1: The file is empty");
+    add("stats --table good.json", 1, "good.json: This file is a session, not a table; open it");
+    add("stats --table truncated.json", 1, "truncated.json:2: The file is not valid JSON (");
+    add("stats --table deep", 1, "deep:1: The file is nested too deeply");
+    add("stats --table word.json", 1, "word.json:2: [1].length_mm: \"oops\" is not a number");
+    add("render good.rtp --table word.json -o out.pdf", 1,
+        "word.json:2: [1].length_mm: \"oops\" is not a number");
+    add("stats --session values.json", 1, "values.json: format: This file is a table of values; import it");
 
     add("stats --session missing.json", 1, "missing.json: The file does not exist");
     add("stats --session folder", 1, "folder: This is a folder, not a file");
@@ -310,6 +329,22 @@ void StatReportProgramTest::programsReadEnglish()
         {text("LC_ALL=de_DE.UTF-8")}, words("stats --table none.csv --json-errors"), m_folder->path());
     QVERIFY2(fault.errors.startsWith(QLatin1String("{\"error\":{\"file\":\"none.csv\",\"message\":")),
              qPrintable(fault.errors));
+}
+
+void StatReportProgramTest::readsTablesAlike()
+{
+    const ProgramResult expected = run("stats --table good.csv --format json");
+    QCOMPARE(expected.exitCode, 0);
+    for (const char *line :
+         {"stats --table records.json --format json", "stats --table values.json --format json"}) {
+        const ProgramResult result = run(line);
+        QCOMPARE(result.errors, QString());
+        QCOMPARE(result.output, expected.output);
+    }
+    const ProgramResult piped = run("stats --table - --format json", TemplateFile::read(path("values.json")));
+    QCOMPARE(piped.output, expected.output);
+    QCOMPARE(run("render good.rtp --table values.json -o new.pdf").exitCode, 0);
+    QVERIFY(TemplateFile::read(path("new.pdf")).startsWith("%PDF"));
 }
 
 void StatReportProgramTest::showsHelp_data()

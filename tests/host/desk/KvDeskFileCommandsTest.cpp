@@ -77,6 +77,7 @@ private slots:
     void cutSessionsLoseNothing();
     void longWorkCanBeCancelled_data();
     void longWorkCanBeCancelled();
+    void millionRows_data();
     void millionRows();
     void largeSessionIsSavedAndRead();
     void largeSessionsHoldNothingUp();
@@ -604,15 +605,39 @@ void KvDeskFileCommandsTest::longWorkCanBeCancelled()
     QVERIFY(writer.open(QIODevice::WriteOnly));
 }
 
+void KvDeskFileCommandsTest::millionRows_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QByteArray>("start");
+    QTest::addColumn<QByteArray>("row");
+    QTest::addColumn<QByteArray>("end");
+    QTest::newRow("separated") << QStringLiteral("million.csv") << QByteArray("Name,Length [mm]\n")
+                               << QByteArray("A,1.5\n") << QByteArray();
+    const QByteArray record = R"({"Name":"A","Length [mm]":1.5})";
+    QTest::newRow("records") << QStringLiteral("million.json") << "[" + record << ",\n" + record
+                             << QByteArray("]");
+    const QByteArray object = R"({"type":"Line","index":1,"name":"A","values":[)"
+                              R"({"name":"Length","unit":"mm","value":1.5}]})";
+    QTest::newRow("exported values") << QStringLiteral("values.json")
+                                     << R"({"format":"statreport-values","version":1,"objects":[)" + object
+                                     << ",\n" + object << QByteArray("]}");
+}
+
 void KvDeskFileCommandsTest::millionRows()
 {
     constexpr int rows = 1000000;
-    const QString path = temporaryPath(QStringLiteral("million.csv"));
+    QFETCH(QString, name);
+    QFETCH(QByteArray, start);
+    QFETCH(QByteArray, row);
+    QFETCH(QByteArray, end);
+    const QString path = temporaryPath(name);
     QFile file(path);
     QVERIFY(file.open(QIODevice::WriteOnly));
-    file.write("Name,Length [mm]\n");
-    for (int i = 0; i < rows; ++i)
-        file.write("A,1.5\n");
+    file.write(start);
+    // What JSON starts with has the first row.
+    for (int i = end.isEmpty() ? 0 : 1; i < rows; ++i)
+        file.write(row);
+    file.write(end);
     file.close();
     // What happens while the thread works shows that the interface lives.
     int ticks = 0;

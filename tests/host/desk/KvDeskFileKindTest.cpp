@@ -35,6 +35,18 @@ void KvDeskFileKindTest::kinds_data()
     row("session without a suffix", DeskFiles::text(QStringLiteral("session"), " \n{}"),
         KvDeskFileKind::Session);
     row("table without a suffix", DeskFiles::text(QStringLiteral("data"), "a,b\n"), KvDeskFileKind::Table);
+    const auto json = [&row](const char *name, const QByteArray &bytes, KvDeskFileKind::Kind kind) {
+        row(name, DeskFiles::text(QString::fromLatin1(name) + QStringLiteral(".json"), bytes), kind);
+        const QByteArray bare = QByteArray(name) + " without a suffix";
+        row(bare.constData(), DeskFiles::text(QString::fromLatin1(bare), bytes), kind);
+    };
+    json("exported values", "\xEF\xBB\xBF {\n \"format\": \"statreport-values\",\"objects\":[]}",
+         KvDeskFileKind::Table);
+    json("records", "\n [{\"a\":1}]", KvDeskFileKind::Table);
+    json("empty list", "[ ]", KvDeskFileKind::Session);
+    json("saved session", DeskFiles::bytes(DeskFiles::demoSession()), KvDeskFileKind::Session);
+    json("session of a name", R"({"format":"statreport-session","name":"statreport-values"})",
+         KvDeskFileKind::Session);
 }
 
 void KvDeskFileKindTest::kinds()
@@ -53,6 +65,7 @@ void KvDeskFileKindTest::known_data()
     QTest::newRow("session") << DeskFiles::demoSession() << true;
     QTest::newRow("image") << DeskFiles::image(QStringLiteral("known.png")) << true;
     QTest::newRow("table") << DeskFiles::table(QStringLiteral("known.csv")) << true;
+    QTest::newRow("records") << DeskFiles::text(QStringLiteral("known.json"), "[{\"a\":1}]") << true;
     QTest::newRow("broken image") << DeskFiles::text(QStringLiteral("broken.png"), "") << true;
     QTest::newRow("text") << DeskFiles::text(QStringLiteral("values"), "a;b\r\n1\t2\n") << true;
     QTest::newRow("accents") << DeskFiles::text(QStringLiteral("values.dat"), "L\xC3\xA4nge\n1\n") << true;
@@ -78,6 +91,7 @@ void KvDeskFileKindTest::patterns()
     QVERIFY(KvDeskFileKind::imagePatterns().contains(QStringLiteral("*.png")));
     QVERIFY(KvDeskFileKind::imagePatterns().contains(QStringLiteral("*.jpg")));
     QVERIFY(KvDeskFileKind::tablePatterns().contains(QStringLiteral("*.csv")));
+    QVERIFY(KvDeskFileKind::tablePatterns().contains(QStringLiteral("*.json")));
 }
 
 STATREPORT_TEST_MAIN(KvDeskFileKindTest)

@@ -125,6 +125,8 @@ private slots:
     void dropsOpenFiles();
     void dropsOfOtherThingsAreRefused();
     void droppedFolderIsShownInTheGallery();
+    void droppedTablesCanBeUndone_data();
+    void droppedTablesCanBeUndone();
     void toolsOpenFilesOfTheirKinds();
     void unknownFileIsALineOfTheLog();
     void unsavedWorkIsOfferedAfterACrash();
@@ -329,6 +331,33 @@ void KvDeskMainWindowTest::dropsOfOtherThingsAreRefused()
 {
     QVERIFY(!drop(m_window.get(), {}));
     QVERIFY(!drop(m_window.get(), {QUrl(QStringLiteral("https://example.org/a.png"))}));
+}
+
+void KvDeskMainWindowTest::droppedTablesCanBeUndone_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QByteArray>("bytes");
+    QTest::newRow("separated") << QStringLiteral("two.csv") << QByteArray("name,Length\nA,1\nB,2\n");
+    QTest::newRow("records") << QStringLiteral("two.json") << QByteArray(R"([{"Length":1},{"Length":2}])");
+    QTest::newRow("exported values")
+        << QStringLiteral("values.json")
+        << QByteArray(R"({"format":"statreport-values","version":1,"objects":[)"
+                      R"({"type":"Line","index":1,"name":"A","values":[]},{"type":"Line","values":[]}]})");
+}
+
+void KvDeskMainWindowTest::droppedTablesCanBeUndone()
+{
+    QFETCH(QString, name);
+    QFETCH(QByteArray, bytes);
+    m_window->objectEditor()->create(ZtDrawnType::Line, polygon({{0, 0}, {3, 4}}));
+    QVERIFY(drop(m_window.get(), {QUrl::fromLocalFile(DeskFiles::text(name, bytes))}));
+    QTRY_COMPARE(m_window->session()->objectCount(), 3);
+    QVERIFY(action(KvDeskActions::Undo)->text().contains(name));
+    action(KvDeskActions::Undo)->trigger();
+    QCOMPARE(m_window->session()->objectCount(), 1);
+    QVERIFY(action(KvDeskActions::Redo)->text().contains(name));
+    action(KvDeskActions::Redo)->trigger();
+    QCOMPARE(m_window->session()->objectCount(), 3);
 }
 
 void KvDeskMainWindowTest::droppedFolderIsShownInTheGallery()

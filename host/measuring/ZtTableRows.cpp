@@ -1,0 +1,4 @@
+// SPDX-License-Identifier: MIT
+#include "measuring/ZtTableRows.h"
+
+ZtTableRows::~ZtTableRows() = default;
