@@ -351,8 +351,7 @@ KvDeskImageView::Snap KvDeskImageView::snap(const KvDeskPointer &pointer, const 
 
 QPointF KvDeskImageView::steppedPoint(const QPointF &point, const QPointF &step)
 {
-    // Whole pixels of the image, or of the screen where those are larger.
-    const QPointF moved = point + step * qMax(1.0, std::round(pixel()));
+    const QPointF moved = point + step;
     const QPointF result(std::round(moved.x()), std::round(moved.y()));
     bringIntoView(QRectF(result, QSizeF()));
     reportPosition(result);

@@ -87,7 +87,8 @@ public:
      */
     Snap snap(const KvDeskPointer &pointer, const QPointF *origin, bool isSquare,
               const KvDeskObjectId &except) const;
-    /** Where a crosshair comes that steps over the image by keys; it is kept in view. */
+    /** Where a crosshair comes that steps over the image by keys: at whole pixels of the image, however small
+     * they are shown. It is kept in view. */
     QPointF steppedPoint(const QPointF &point, const QPointF &step);
     void bringIntoView(const QRectF &rect);
     void refresh() { viewport()->update(); }
