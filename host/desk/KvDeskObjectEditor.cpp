@@ -284,22 +284,25 @@ QSet<KvDeskObjectId> KvDeskObjectEditor::paste(const QPointF &offset)
 
 void KvDeskObjectEditor::slotUndo()
 {
-    m_touched.clear();
-    {
-        const QScopedValueRollback<bool> applying(m_isApplying, true);
-        m_stack->undo();
-    }
-    selectTouched();
+    walkHistory(&QUndoStack::undo);
 }
 
 void KvDeskObjectEditor::slotRedo()
 {
+    walkHistory(&QUndoStack::redo);
+}
+
+void KvDeskObjectEditor::walkHistory(void (QUndoStack::*way)())
+{
     m_touched.clear();
+    const ZtCalibration before = m_session->document()->calibration();
     {
         const QScopedValueRollback<bool> applying(m_isApplying, true);
-        m_stack->redo();
+        (m_stack->*way)();
     }
     selectTouched();
+    if (m_session->document()->calibration() != before)
+        emit signalCalibrationRestored();
 }
 
 void KvDeskObjectEditor::selectTouched()
