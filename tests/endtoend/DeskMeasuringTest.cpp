@@ -253,7 +253,7 @@ void DeskMeasuringTest::calibrate()
     m_user.activate(dialog);
     m_user.click(dialog->objectiveBox()->lineEdit());
     m_user.type(QStringLiteral("10x"));
-    m_user.click(dialog->knownDistance()->lengthBox()->findChild<QLineEdit *>());
+    m_user.click(dialog->knownDistance()->lengthBox());
     m_user.type(QStringLiteral("2"));
     QTRY_COMPARE(dialog->resultText(), QStringLiteral("New pixel size: 10 μm"));
     m_user.click(dialog->calibrateButton());
