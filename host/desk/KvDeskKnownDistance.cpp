@@ -91,14 +91,14 @@ void KvDeskKnownDistance::connectSignals()
     connect(center, SIGNAL(signalObjectRemoved(int,int)), this, SLOT(slotObjectRemoved(int,int)));
 }
 
-// As if every pixel was a micrometre until there is a line.
+// Until there is a line, any length may be right.
 double KvDeskKnownDistance::pixelSize() const
 {
     const double pixels = lengthInPlane(m_reference, m_calibrator->current());
     const double micrometres = m_length->value() * m_unit->currentData().toDouble();
     if (pixels > 0.0)
         return micrometres / pixels;
-    return micrometres > 0.0 ? 1.0 : 0.0;
+    return micrometres > 0.0 && qIsFinite(micrometres) ? 1.0 : 0.0;
 }
 
 QString KvDeskKnownDistance::fault() const
