@@ -155,6 +155,7 @@ void KvDeskCalibrationDialog::addDescription(QVBoxLayout *layout)
     m_note = createField(form, tr("Note"));
     layout->addLayout(form);
     m_result = new QLabel(this);
+    m_result->setWordWrap(true);
     m_calibrate = new QPushButton(tr("Calibrate"), this);
     m_calibrate->setDefault(true);
     auto *const row = new QHBoxLayout;
@@ -298,12 +299,15 @@ void KvDeskCalibrationDialog::slotWayChanged()
 void KvDeskCalibrationDialog::slotResultChanged()
 {
     const ZtCalibration result = page()->calibration();
-    m_result->setText(result.isCalibrated()
-                          ? tr("New pixel size: %1").arg(KvDeskCalibrationText::pixelSize(result))
-                          : tr("No pixel size yet"));
+    const QString fault = page()->fault();
     m_calibrate->setEnabled(result.isCalibrated());
-    m_calibrate->setToolTip(result.isCalibrated() ? tr("Measure with this pixel size and remember it")
-                                                  : tr("Complete the fields above first"));
+    if (result.isCalibrated()) {
+        m_result->setText(tr("New pixel size: %1").arg(KvDeskCalibrationText::pixelSize(result)));
+        m_calibrate->setToolTip(tr("Measure with this pixel size and remember it"));
+    } else {
+        m_result->setText(fault.isEmpty() ? tr("No pixel size yet") : fault);
+        m_calibrate->setToolTip(fault.isEmpty() ? tr("Complete the fields above first") : fault);
+    }
 }
 
 void KvDeskCalibrationDialog::slotSelectionChanged()

@@ -22,6 +22,7 @@ void KvDeskCalibrator::connectSignals()
     connect(m_session, SIGNAL(signalImageOpened()), this, SLOT(slotImageOpened()));
     connect(m_session->document(), SIGNAL(signalImageChanged()), this, SLOT(slotImageChanged()));
     connect(m_session->document(), SIGNAL(signalCalibrationChanged()), this, SLOT(slotCalibrationChanged()));
+    connect(m_editor, SIGNAL(signalCalibrationRestored()), this, SLOT(slotCalibrationRestored()));
     connect(&m_store, SIGNAL(signalChanged()), this, SIGNAL(signalChanged()));
 }
 
@@ -49,6 +50,11 @@ void KvDeskCalibrator::measureWith(const ZtCalibration &calibration)
 
 void KvDeskCalibrator::logCalibrated(const ZtCalibration &calibration)
 {
+    const QString place = QStringLiteral("KvDeskCalibrator::logCalibrated");
+    if (!calibration.isCalibrated()) {
+        KvDeskStatus::log(ZtAppStatus::Information, KvDeskCalibrationText::summary(calibration), place);
+        return;
+    }
     QString name = calibration.objective().isEmpty() ? calibration.name() : calibration.objective();
     if (name.isEmpty())
         name = KvDeskCalibrationText::origin(calibration.origin());
@@ -56,7 +62,7 @@ void KvDeskCalibrator::logCalibrated(const ZtCalibration &calibration)
     const QString text =
         tr("Calibrated: %1, %2 per pixel")
             .arg(ZtLeftToRight::isolated(name), KvDeskCalibrationText::pixelSize(calibration));
-    KvDeskStatus::log(ZtAppStatus::Information, text, QStringLiteral("KvDeskCalibrator::logCalibrated"));
+    KvDeskStatus::log(ZtAppStatus::Information, text, place);
 }
 
 void KvDeskCalibrator::calibrate(ZtCalibration calibration)
@@ -124,4 +130,10 @@ void KvDeskCalibrator::slotCalibrationChanged()
     if (!isOtherOffered())
         emit signalOfferWithdrawn();
     emit signalChanged();
+}
+
+// What was last said about the calibration is no longer true.
+void KvDeskCalibrator::slotCalibrationRestored()
+{
+    logCalibrated(current());
 }

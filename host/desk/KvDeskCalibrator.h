@@ -48,6 +48,7 @@ private slots:
     void slotImageOpened();
     void slotImageChanged();
     void slotCalibrationChanged();
+    void slotCalibrationRestored();
 
 private:
     void connectSignals();

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskCounterBar.h"
 
+#include "KvDeskActions.h"
 #include "KvDeskCounterTool.h"
 #include "KvDeskElidedLabel.h"
 #include "KvDeskImageView.h"
@@ -12,6 +13,7 @@
 #include "measuring/ZtDrawnObjectPainter.h"
 #include "measuring/ZtMeasureFormat.h"
 
+#include <QAction>
 #include <QComboBox>
 #include <QEvent>
 #include <QHBoxLayout>
@@ -57,7 +59,7 @@ KvDeskCounterBar::KvDeskCounterBar(KvDeskToolBox *toolBox, KvDeskImageView *view
     connect(toolBox, SIGNAL(signalToolChanged()), this, SLOT(slotToolChanged()));
     connect(&m_changes, SIGNAL(signalChanged()), this, SLOT(slotUpdate()));
     connect(m_classes, SIGNAL(activated(int)), this, SLOT(slotChosen(int)));
-    connect(m_newClass, SIGNAL(clicked()), this, SLOT(slotNewClass()));
+    connect(m_newClassAction, SIGNAL(triggered()), this, SLOT(slotNewClass()));
     view->viewport()->installEventFilter(this);
     slotToolChanged();
 }
@@ -75,13 +77,7 @@ void KvDeskCounterBar::createWidgets()
     m_classes->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
     m_classes->setAccessibleName(label->text());
     m_classes->setToolTip(tr("The counter that gets the clicks (1 to 9)"));
-    m_newClass = new QToolButton(this);
-    m_newClass->setIcon(acss::createIcon(6, QStringLiteral("Icons/counter-new"), iconSize));
-    m_newClass->setIconSize(iconSize);
-    m_newClass->setFixedSize(buttonSize);
-    m_newClass->setAutoRaise(true);
-    m_newClass->setToolTip(tr("Count another class"));
-    m_newClass->setAccessibleName(m_newClass->toolTip());
+    createNewClass();
     m_hint = new KvDeskElidedLabel(tr("A right click takes a place away"), this);
     m_hint->setProperty("caption", true);
     auto *const layout = new QHBoxLayout(this);
@@ -93,12 +89,31 @@ void KvDeskCounterBar::createWidgets()
     layout->addWidget(m_hint);
 }
 
+// The key is that of the tool with Shift; it works on the image while the user counts.
+void KvDeskCounterBar::createNewClass()
+{
+    m_newClassAction = new QAction(tr("Count another class"), this);
+    m_newClassAction->setIcon(acss::createIcon(6, QStringLiteral("Icons/counter-new"), iconSize));
+    m_newClassAction->setShortcut(QKeySequence(static_cast<int>(Qt::SHIFT) | Qt::Key_N));
+    m_newClassAction->setShortcutContext(Qt::WidgetWithChildrenShortcut);
+    m_newClassAction->setToolTip(
+        KvDeskActions::withShortcut(m_newClassAction->text(), m_newClassAction->shortcut()));
+    m_view->addAction(m_newClassAction);
+    m_newClass = new QToolButton(this);
+    m_newClass->setDefaultAction(m_newClassAction);
+    m_newClass->setIconSize(iconSize);
+    m_newClass->setFixedSize(buttonSize);
+    m_newClass->setAutoRaise(true);
+    m_newClass->setAccessibleName(m_newClassAction->text());
+}
+
 void KvDeskCounterBar::slotToolChanged()
 {
     const bool isCounting = m_view->tool() == m_toolBox->counterTool();
     if (isCounting)
         connect(m_view->selection(), SIGNAL(signalSelectionChanged()), this,
                                             SLOT(slotUpdate()), Qt::UniqueConnection);
+    m_newClassAction->setEnabled(isCounting);
     setVisible(isCounting);
     slotUpdate();
 }

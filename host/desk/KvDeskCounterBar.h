@@ -10,6 +10,7 @@
 
 class KvDeskImageView;
 class KvDeskToolBox;
+class QAction;
 class QComboBox;
 class QToolButton;
 
@@ -36,6 +37,7 @@ private slots:
 
 private:
     void createWidgets();
+    void createNewClass();
     void place();
     void showColors();
     QString classText(const KvDeskObjectId &counter) const;
@@ -47,5 +49,6 @@ private:
     QComboBox *m_classes = nullptr;
     QVector<QIcon> m_swatches; ///< in the order of the counters' colours
     QToolButton *m_newClass = nullptr;
+    QAction *m_newClassAction = nullptr;
     QWidget *m_hint = nullptr;
 };

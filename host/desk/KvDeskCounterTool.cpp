@@ -61,9 +61,16 @@ void KvDeskCounterTool::press(const KvDeskPointer &pointer)
         add(pointer.scene);
 }
 
+// What lies beside the image is nothing to count; without an image there are tables and objects only.
+bool KvDeskCounterTool::isCountable(const QPointF &place) const
+{
+    const KvDeskImageFrame &frame = view()->frame();
+    return frame.isNull() || frame.sceneRect().contains(place);
+}
+
 void KvDeskCounterTool::add(const QPointF &place)
 {
-    if (!view()->editor())
+    if (!view()->editor() || !isCountable(place))
         return;
     const KvDeskObjectId chosen = counter();
     if (chosen.isNull()) {
@@ -109,9 +116,8 @@ bool KvDeskCounterTool::key(QKeyEvent *event)
     const int digit = event->key() - Qt::Key_1;
     const bool isSetting =
         event->key() == Qt::Key_Space || event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;
-    const QVector<KvDeskObjectId> all = counters();
-    if (digit >= 0 && digit <= 8 && digit < all.size())
-        choose(all.at(digit));
+    if (digit >= 0 && digit <= 8)
+        chooseByDigit(digit);
     else if (m_isByKeys && isSetting)
         add(m_target);
     else if (m_isByKeys && event->key() == Qt::Key_Backspace)
@@ -121,6 +127,16 @@ bool KvDeskCounterTool::key(QKeyEvent *event)
     else
         return moveCrosshair(*event);
     return true;
+}
+
+// The digit after the last counter's means one that is still to come.
+void KvDeskCounterTool::chooseByDigit(int index)
+{
+    const QVector<KvDeskObjectId> all = counters();
+    if (index < all.size())
+        choose(all.at(index));
+    else if (index == all.size())
+        addClass();
 }
 
 bool KvDeskCounterTool::moveCrosshair(const QKeyEvent &event)

@@ -8,7 +8,8 @@
 
 /**
  * Counts by clicks: each adds a place to the chosen counter; a click with the right button or with Alt takes
- * the nearest place away again. Every counter is a class of its own; digits choose one.
+ * the nearest place away again. Every counter is a class of its own; digits choose one, and the
+ * digit after the last begins another. Nothing beside the image is counted.
  *
  * The chosen counter is the one that is selected, so that table, image and tool agree.
  */
@@ -34,8 +35,10 @@ public:
     Qt::CursorShape cursor() const override { return Qt::CrossCursor; }
 
 private:
+    bool isCountable(const QPointF &place) const;
     void add(const QPointF &place);
     void removeNear(const QPointF &place);
+    void chooseByDigit(int index);
     bool moveCrosshair(const QKeyEvent &event);
 
     QPointF m_target;

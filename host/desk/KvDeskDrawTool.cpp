@@ -101,10 +101,12 @@ void KvDeskDrawTool::finish()
     view()->refresh();
 }
 
-void KvDeskDrawTool::removeLastPoint()
+void KvDeskDrawTool::takeBack()
 {
     if (!m_points.isEmpty())
         m_points.removeLast();
+    // The end of a drag from the point that is gone sets none.
+    m_isDown = false;
     view()->refresh();
 }
 
@@ -123,7 +125,7 @@ bool KvDeskDrawTool::key(QKeyEvent *event)
     if (event->key() == Qt::Key_Escape && isBusy())
         cancel();
     else if (event->key() == Qt::Key_Backspace && !m_points.isEmpty())
-        removeLastPoint();
+        takeBack();
     else if (m_isByKeys && event->key() == Qt::Key_Space)
         addPoint(m_target);
     else if (isEnter && isOpenEnded() && !m_points.isEmpty() && (!m_isByKeys || m_points.last() == m_target))

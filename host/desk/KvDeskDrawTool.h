@@ -10,9 +10,9 @@ struct ZtDrawnType;
 /**
  * Draws objects of one type point by point: by clicks, by dragging from one point to the next, or by keys.
  *
- * Shift keeps the direction straight, Ctrl takes the pointer's very place, Backspace takes back the last
- * point, Escape all of them; Enter or a double click ends objects of any number of points. Arrow keys bring
- * up a crosshair and move it; the space bar or Enter then sets a point.
+ * Shift keeps the direction straight, Ctrl takes the pointer's very place, Backspace and undo take back the
+ * last point, Escape all of them; Enter or a double click ends objects of any number of points. Arrow keys
+ * bring up a crosshair and move it; the space bar or Enter then sets a point.
  */
 class KvDeskDrawTool : public KvDeskTool
 {
@@ -31,6 +31,8 @@ public:
     void doubleClick(const KvDeskPointer &pointer) override;
     bool key(QKeyEvent *event) override;
     void cancel() override;
+    bool canTakeBack() const override { return !m_points.isEmpty(); }
+    void takeBack() override;
     bool isBusy() const override { return !m_points.isEmpty() || m_isByKeys; }
     void draw(QPainter *painter) const override;
     Qt::CursorShape cursor() const override { return Qt::CrossCursor; }
@@ -40,7 +42,6 @@ private:
     void pointAt(const KvDeskPointer &pointer);
     void addPoint(const QPointF &point);
     void finish();
-    void removeLastPoint();
     bool moveCrosshair(const QKeyEvent &event);
     QPolygonF draft() const;
 

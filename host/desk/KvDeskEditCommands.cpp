@@ -50,7 +50,7 @@ void KvDeskEditCommands::connectSignals()
     const auto onTrigger = [this](A::Id id, QObject *receiver, const char *slot) {
         connect(m_actions->action(id), SIGNAL(triggered()), receiver, slot);
     };
-    onTrigger(A::Undo, m_editor, SLOT(slotUndo()));
+    onTrigger(A::Undo, this, SLOT(slotUndo()));
     onTrigger(A::Redo, m_editor, SLOT(slotRedo()));
     onTrigger(A::Cut, this, SLOT(slotCut()));
     onTrigger(A::Copy, this, SLOT(slotCopy()));
@@ -59,6 +59,7 @@ void KvDeskEditCommands::connectSignals()
     onTrigger(A::SelectAll, this, SLOT(slotSelectAll()));
     onTrigger(A::Rename, this, SLOT(slotRename()));
     connect(m_editor->undoStack(), SIGNAL(indexChanged(int)), this, SLOT(slotUpdateHistory()));
+    connect(m_view, SIGNAL(signalDraftChanged()), this, SLOT(slotUpdateHistory()));
     connect(m_editor->selection(), SIGNAL(signalSelectionChanged()), this, SLOT(slotUpdateSelection()));
     connect(QGuiApplication::clipboard(), SIGNAL(dataChanged()), this, SLOT(slotUpdateClipboard()));
 }
@@ -71,13 +72,24 @@ void KvDeskEditCommands::setPossible(int id, bool isPossible, const QString &rea
 void KvDeskEditCommands::slotUpdateHistory()
 {
     const QUndoStack *const stack = m_editor->undoStack();
+    const bool isDrafting = m_view->isDrafting();
+    const bool isStep = stack->canUndo() && !isDrafting;
     //: %1 is what is undone or redone, such as "move of Line 3"
-    m_actions->action(A::Undo)->setText(stack->canUndo() ? tr("&Undo %1").arg(inMenu(stack->undoText()))
-                                                         : tr("&Undo"));
+    m_actions->action(A::Undo)->setText(isStep ? tr("&Undo %1").arg(inMenu(stack->undoText())) : tr("&Undo"));
     m_actions->action(A::Redo)->setText(stack->canRedo() ? tr("&Redo %1").arg(inMenu(stack->redoText()))
                                                          : tr("&Redo"));
-    setPossible(A::Undo, stack->canUndo(), tr("Nothing was done yet"));
-    setPossible(A::Redo, stack->canRedo(), tr("Nothing was undone"));
+    setPossible(A::Undo, isStep || m_view->canTakeBack(), tr("Nothing was done yet"));
+    setPossible(A::Redo, stack->canRedo() && !isDrafting,
+                stack->canRedo() ? tr("Finish or cancel what you have begun first")
+                                 : tr("Nothing was undone"));
+}
+
+void KvDeskEditCommands::slotUndo()
+{
+    if (m_view->isDrafting())
+        m_view->takeBack();
+    else
+        m_editor->slotUndo();
 }
 
 void KvDeskEditCommands::slotUpdateSelection()

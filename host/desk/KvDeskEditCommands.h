@@ -18,6 +18,8 @@ public:
                        QObject *parent = nullptr);
 
 public slots:
+    /** Takes back what is half done on the image, part by part, and steps of the history only then. */
+    void slotUndo();
     void slotCut();
     void slotCopy();
     void slotPaste();

@@ -81,6 +81,8 @@ void KvDeskImageView::connectSignals()
     connect(acss::QtAdvancedStylesheet::getInstance(), SIGNAL(currentThemeChanged(QString)), this,
                                                               SLOT(slotThemeChanged()));
     connect(m_overlay, SIGNAL(signalUpdated()), this, SLOT(slotUpdate()));
+    connect(m_inlineEditor, SIGNAL(signalEditingChanged()), this, SLOT(slotUpdateDraft()));
+    connect(m_inlineEditor, SIGNAL(textChanged(QString)), this, SLOT(slotUpdateDraft()));
     connect(this, SIGNAL(signalZoomChanged(double)), this, SLOT(slotUpdateRulers()));
     const ZtSignalCenter *const center = ZtSignalCenter::getInstance();
     connect(center, SIGNAL(signalLengthUnitChanged()), this, SLOT(slotUpdateRulers()));
@@ -120,6 +122,36 @@ void KvDeskImageView::setTool(KvDeskTool *tool)
     m_tool = next;
     updateCursor();
     refresh();
+    slotUpdateDraft();
+}
+
+bool KvDeskImageView::isDrafting() const
+{
+    return m_inlineEditor->isEditing() || m_tool->canTakeBack();
+}
+
+bool KvDeskImageView::canTakeBack() const
+{
+    return m_inlineEditor->isEditing() ? m_inlineEditor->isUndoAvailable() : m_tool->canTakeBack();
+}
+
+void KvDeskImageView::takeBack()
+{
+    if (m_inlineEditor->isEditing())
+        m_inlineEditor->undo();
+    else
+        m_tool->takeBack();
+    slotUpdateDraft();
+}
+
+// After everything that mouse and keys do.
+void KvDeskImageView::slotUpdateDraft()
+{
+    if (isDrafting() == m_isDrafting && canTakeBack() == m_canTakeBack)
+        return;
+    m_isDrafting = isDrafting();
+    m_canTakeBack = canTakeBack();
+    emit signalDraftChanged();
 }
 
 void KvDeskImageView::slotSelectionChanged()
@@ -351,8 +383,7 @@ KvDeskImageView::Snap KvDeskImageView::snap(const KvDeskPointer &pointer, const 
 
 QPointF KvDeskImageView::steppedPoint(const QPointF &point, const QPointF &step)
 {
-    // Whole pixels of the image, or of the screen where those are larger.
-    const QPointF moved = point + step * qMax(1.0, std::round(pixel()));
+    const QPointF moved = point + step;
     const QPointF result(std::round(moved.x()), std::round(moved.y()));
     bringIntoView(QRectF(result, QSizeF()));
     reportPosition(result);
@@ -422,6 +453,7 @@ void KvDeskImageView::mousePressEvent(QMouseEvent *event)
         return;
     }
     m_tool->press(pointerOf(*event));
+    slotUpdateDraft();
     refresh();
 }
 
@@ -432,6 +464,7 @@ void KvDeskImageView::mouseMoveEvent(QMouseEvent *event)
         pan(event->pos());
     else
         m_tool->move(pointerOf(*event));
+    slotUpdateDraft();
     const QPointF position = event->localPos();
     setRulerPointer(&position);
     reportPosition(toScene(position));
@@ -444,6 +477,7 @@ void KvDeskImageView::mouseReleaseEvent(QMouseEvent *event)
         m_tool->release(pointerOf(*event));
     else if (!(event->buttons() & (Qt::LeftButton | Qt::MiddleButton)))
         setPanning(false);
+    slotUpdateDraft();
 }
 
 void KvDeskImageView::mouseDoubleClickEvent(QMouseEvent *event)
@@ -454,6 +488,7 @@ void KvDeskImageView::mouseDoubleClickEvent(QMouseEvent *event)
     }
     event->accept();
     m_tool->doubleClick(pointerOf(*event));
+    slotUpdateDraft();
     refresh();
 }
 
@@ -475,6 +510,7 @@ void KvDeskImageView::keyPressEvent(QKeyEvent *event)
 {
     event->accept();
     if (m_tool->key(event)) {
+        slotUpdateDraft();
         refresh();
         return;
     }

@@ -59,6 +59,12 @@ public:
     void setTool(KvDeskTool *tool);
     KvDeskTool *tool() const { return m_tool; }
 
+    /** Whether an object, a drag or a text on the image is begun: steps of the history wait for its end. */
+    bool isDrafting() const;
+    /** Whether there is a part of it that takeBack() takes back. */
+    bool canTakeBack() const;
+    void takeBack();
+
     const KvDeskImageFrame &frame() const { return m_frame; }
     KvDeskEmptyState *emptyState() const { return m_emptyState; }
     bool isAnythingOpen() const;
@@ -87,7 +93,8 @@ public:
      */
     Snap snap(const KvDeskPointer &pointer, const QPointF *origin, bool isSquare,
               const KvDeskObjectId &except) const;
-    /** Where a crosshair comes that steps over the image by keys; it is kept in view. */
+    /** Where a crosshair comes that steps over the image by keys: at whole pixels of the image, however small
+     * they are shown. It is kept in view. */
     QPointF steppedPoint(const QPointF &point, const QPointF &step);
     void bringIntoView(const QRectF &rect);
     void refresh() { viewport()->update(); }
@@ -115,8 +122,9 @@ signals:
     void signalContentChanged(); ///< there is another image, or other objects are on it
     /** The pointer is over this point of the image, in its pixels. */
     void signalPointerMoved(QPointF aPosition);
-    void signalPointerLeft(); ///< the pointer is not over the image
-    void signalToolLeft();    ///< the user is done with the tool, by Escape
+    void signalPointerLeft();  ///< the pointer is not over the image
+    void signalDraftChanged(); ///< isDrafting() or canTakeBack()
+    void signalToolLeft();     ///< the user is done with the tool, by Escape
     /** The user wants the menu of what is selected, at this place of the screen. Drawing has none. */
     void signalMenuRequested(QPoint aPosition);
 
@@ -140,6 +148,7 @@ protected:
 private slots:
     void slotSelectionChanged();
     void slotUpdate();
+    void slotUpdateDraft();
     void slotUpdateRulers();
     void slotImageChanged();
     void slotImageCompleted(FrameData aFrameData, bool &aHandled);
@@ -188,6 +197,8 @@ private:
     KvDeskTool *m_tool = nullptr;
     QRectF m_content; ///< the image and all objects, in scene coordinates
     QPoint m_lastPan;
+    bool m_isDrafting = false;    ///< when signalDraftChanged() was last sent
+    bool m_canTakeBack = false;   ///< as above
     bool m_isStartWanted = false; ///< though something is open
     bool m_isFitted = true;
     bool m_isPanning = false;

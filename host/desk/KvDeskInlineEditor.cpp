@@ -73,6 +73,7 @@ void KvDeskInlineEditor::start(Purpose purpose, const QPointF &place, const QStr
     show();
     raise();
     setFocus();
+    emit signalEditingChanged();
 }
 
 void KvDeskInlineEditor::slotAccept()
@@ -104,6 +105,7 @@ void KvDeskInlineEditor::finish()
     hide();
     if (hadFocus)
         m_view->setFocus();
+    emit signalEditingChanged();
 }
 
 void KvDeskInlineEditor::keyPressEvent(QKeyEvent *event)

@@ -24,9 +24,14 @@ public:
     /** A new text note at a point of the image; without a text there will be none. */
     void writeNote(const QPointF &place);
 
+    bool isEditing() const { return m_purpose != Nothing; }
+
 public slots:
     void slotAccept();
     void slotCancel();
+
+signals:
+    void signalEditingChanged(); ///< isEditing()
 
 protected:
     void keyPressEvent(QKeyEvent *event) override;

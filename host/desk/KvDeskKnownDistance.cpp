@@ -82,8 +82,8 @@ void KvDeskKnownDistance::createFields()
 void KvDeskKnownDistance::connectSignals()
 {
     connect(m_use, SIGNAL(clicked()), this, SLOT(slotUseSelected()));
-    connect(m_length, SIGNAL(valueChanged(double)), this, SIGNAL(signalChanged()));
-    connect(m_unit, SIGNAL(currentIndexChanged(int)), this, SIGNAL(signalChanged()));
+    connect(m_length, SIGNAL(valueChanged(double)), this, SLOT(slotUpdate()));
+    connect(m_unit, SIGNAL(currentIndexChanged(int)), this, SLOT(slotUpdate()));
     connect(m_calibrator->selection(), SIGNAL(signalSelectionChanged()), this, SLOT(slotSelectionChanged()));
     const ZtSignalCenter *const center = ZtSignalCenter::getInstance();
     connect(center, SIGNAL(signalObjectChanged(int,int,const ZtKernelObjectData*)), this,
@@ -91,15 +91,27 @@ void KvDeskKnownDistance::connectSignals()
     connect(center, SIGNAL(signalObjectRemoved(int,int)), this, SLOT(slotObjectRemoved(int,int)));
 }
 
+// Until there is a line, any length may be right.
+double KvDeskKnownDistance::pixelSize() const
+{
+    const double pixels = lengthInPlane(m_reference, m_calibrator->current());
+    const double micrometres = m_length->value() * m_unit->currentData().toDouble();
+    if (pixels > 0.0)
+        return micrometres / pixels;
+    return micrometres > 0.0 && qIsFinite(micrometres) ? 1.0 : 0.0;
+}
+
+QString KvDeskKnownDistance::fault() const
+{
+    return faultOf(*m_length, pixelSize());
+}
+
 ZtCalibration KvDeskKnownDistance::calibration() const
 {
     const ZtCalibration shape = m_calibrator->current();
-    const double pixels = lengthInPlane(m_reference, shape);
-    const double micrometres = m_length->value() * m_unit->currentData().toDouble();
-    if (pixels <= 0.0)
+    if (!fault().isEmpty() || lengthInPlane(m_reference, shape) <= 0.0)
         return ZtCalibration();
-    const double pixelSize = micrometres / pixels;
-    ZtCalibration result(pixelSize, pixelSize * shape.aspect());
+    ZtCalibration result(pixelSize(), pixelSize() * shape.aspect());
     result.setOrigin(ZtCalibration::Origin::KnownDistance);
     return result;
 }
@@ -115,8 +127,15 @@ QString KvDeskKnownDistance::referenceText() const
     return m_text->text();
 }
 
+void KvDeskKnownDistance::slotUpdate()
+{
+    refresh();
+    emit signalChanged();
+}
+
 void KvDeskKnownDistance::refresh()
 {
+    m_length->setFault(fault());
     const double pixels = lengthInPlane(m_reference, m_calibrator->current());
     if (m_reference.isNull())
         m_text->setText(tr("No line yet"));
@@ -131,8 +150,7 @@ void KvDeskKnownDistance::slotUseSelected()
     if (!canUseSelected())
         return;
     m_reference = m_calibrator->selection()->current();
-    refresh();
-    emit signalChanged();
+    slotUpdate();
 }
 
 void KvDeskKnownDistance::slotSelectionChanged()
@@ -148,8 +166,7 @@ void KvDeskKnownDistance::slotObjectChanged(int aType, int aId, const ZtKernelOb
     slotSelectionChanged();
     if (m_reference != KvDeskObjectId{aType, aId})
         return;
-    refresh();
-    emit signalChanged();
+    slotUpdate();
 }
 
 void KvDeskKnownDistance::slotObjectRemoved(int aType, int aId)
@@ -158,6 +175,5 @@ void KvDeskKnownDistance::slotObjectRemoved(int aType, int aId)
     if (!isOfMany && m_reference != KvDeskObjectId{aType, aId})
         return;
     m_reference = KvDeskObjectId();
-    refresh();
-    emit signalChanged();
+    slotUpdate();
 }

@@ -25,6 +25,7 @@ public:
     explicit KvDeskKnownDistance(KvDeskCalibrator *calibrator, QWidget *parent = nullptr);
 
     ZtCalibration calibration() const override;
+    QString fault() const override;
     void refresh() override;
 
     KvDeskObjectId reference() const { return m_reference; }
@@ -38,6 +39,7 @@ public slots:
     void slotUseSelected();
 
 private slots:
+    void slotUpdate();
     void slotSelectionChanged();
     void slotObjectChanged(int aType, int aId, const ZtKernelObjectData *aObject);
     void slotObjectRemoved(int aType, int aId);
@@ -46,6 +48,7 @@ private:
     void createFields();
     void connectSignals();
     bool canUseSelected() const;
+    double pixelSize() const;
 
     KvDeskCalibrator *m_calibrator;
     KvDeskObjectId m_reference;

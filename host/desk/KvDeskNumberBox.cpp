@@ -1,51 +1,75 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskNumberBox.h"
 
+#include <QRegularExpression>
+#include <QSignalBlocker>
+#include <QStyle>
+#include <QVariant>
+
+#include <limits>
+
 namespace {
 
-constexpr int mostDecimals = 12;
 constexpr int shownDigits = 10;
+const char invalidProperty[] = "invalid";
 
-QString plainText(const QString &text)
+// 0 for an empty text. There are no separators of thousands: nobody can tell which of both "1.234,5" has.
+bool toNumber(const QString &text, double *number)
 {
-    return QString(text).trimmed().replace(QLatin1Char(','), QLatin1Char('.'));
+    static const QRegularExpression pattern(
+        QStringLiteral("^[+-]?([0-9]+[.,]?[0-9]*|[.,][0-9]+)([eE][+-]?[0-9]+)?$"));
+    QString plain = text.trimmed();
+    *number = 0.0;
+    if (plain.isEmpty())
+        return true;
+    if (!pattern.match(plain).hasMatch())
+        return false;
+    bool isInRange = false;
+    *number = plain.replace(QLatin1Char(','), QLatin1Char('.')).toDouble(&isInRange);
+    if (!isInRange)
+        *number = std::numeric_limits<double>::infinity();
+    return true;
 }
 
 } // namespace
 
 KvDeskNumberBox::KvDeskNumberBox(QWidget *parent)
-    : QDoubleSpinBox(parent)
+    : QLineEdit(parent)
 {
-    setDecimals(mostDecimals);
-    setRange(0.0, largest);
-    setButtonSymbols(NoButtons);
-    setStepType(AdaptiveDecimalStepType);
     // Numbers read from left to right in every language.
     setLayoutDirection(Qt::LeftToRight);
+    connect(this, SIGNAL(textChanged(QString)), this, SLOT(slotTextChanged(QString)));
 }
 
-QString KvDeskNumberBox::textFromValue(double value) const
+void KvDeskNumberBox::setValue(double value)
 {
-    return value > 0.0 ? QString::number(value, 'g', shownDigits) : QString();
+    {
+        const QSignalBlocker blocker(this);
+        setText(value > 0.0 ? QString::number(value, 'g', shownDigits) : QString());
+    }
+    // All of its digits, of which not all are shown.
+    m_value = value;
+    m_isNumber = true;
+    emit valueChanged(m_value);
 }
 
-double KvDeskNumberBox::valueFromText(const QString &text) const
+void KvDeskNumberBox::slotTextChanged(const QString &aText)
 {
-    return plainText(text).toDouble();
+    m_isNumber = toNumber(aText, &m_value);
+    emit valueChanged(m_value);
 }
 
-QValidator::State KvDeskNumberBox::validate(QString &text, int &position) const
+void KvDeskNumberBox::setFault(const QString &reason)
 {
-    Q_UNUSED(position)
-    const QString plain = plainText(text);
-    bool isNumber = false;
-    const double number = plain.toDouble(&isNumber);
-    if (plain.isEmpty() || (isNumber && number >= 0.0 && number <= largest))
-        return QValidator::Acceptable;
-    // Numbers that are not written to their end, such as ".", "1e" and "1e-".
-    const bool isBeginning =
-        QString(plain + QLatin1Char('0')).toDouble() >= 0.0 && !isNumber &&
-        plain.indexOf(QLatin1Char('-')) != 0 &&
-        (plain == QLatin1String(".") || plain.contains(QLatin1Char('e'), Qt::CaseInsensitive));
-    return isBeginning ? QValidator::Intermediate : QValidator::Invalid;
+    if (reason == m_fault)
+        return;
+    if (m_fault.isEmpty())
+        m_ownToolTip = toolTip();
+    m_fault = reason;
+    setToolTip(reason.isEmpty() ? m_ownToolTip : reason);
+    setAccessibleDescription(reason);
+    setProperty(invalidProperty, !reason.isEmpty());
+    // The style sheet looks at the property only now.
+    style()->unpolish(this);
+    style()->polish(this);
 }

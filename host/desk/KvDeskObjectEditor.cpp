@@ -293,11 +293,7 @@ QSet<KvDeskObjectId> KvDeskObjectEditor::paste(const QPointF &offset)
 
 void KvDeskObjectEditor::slotUndo()
 {
-    m_touched.clear();
-    {
-        const QScopedValueRollback<bool> applying(m_isApplying, true);
-        m_stack->undo();
-    }
+    walkHistory(&QUndoStack::undo);
     selectTouched();
 }
 
@@ -305,14 +301,22 @@ void KvDeskObjectEditor::slotRedo()
 {
     // One object would be announced for all of the table, which is not worth to be selected.
     const bool isTable = dynamic_cast<const KvDeskTableCommand *>(m_stack->command(m_stack->index()));
-    m_touched.clear();
-    {
-        const QScopedValueRollback<bool> applying(m_isApplying, true);
-        m_stack->redo();
-    }
+    walkHistory(&QUndoStack::redo);
     if (isTable)
         m_touched.clear();
     selectTouched();
+}
+
+void KvDeskObjectEditor::walkHistory(void (QUndoStack::*way)())
+{
+    m_touched.clear();
+    const ZtCalibration before = m_session->document()->calibration();
+    {
+        const QScopedValueRollback<bool> applying(m_isApplying, true);
+        (m_stack->*way)();
+    }
+    if (m_session->document()->calibration() != before)
+        emit signalCalibrationRestored();
 }
 
 void KvDeskObjectEditor::selectTouched()

@@ -78,6 +78,9 @@ public slots:
     /** The next move or change of points is a step of its own; so it is when another object gets selected. */
     void slotFinishGesture();
 
+signals:
+    void signalCalibrationRestored(); ///< by undo or redo
+
 private slots:
     void slotSessionReplaced();
     void slotSessionStateChanged();
@@ -94,6 +97,7 @@ private:
     void change(const QString &text, const QVector<KvDeskObjectState> &after, int gesture = 0);
     void objectCameOrWent(int type);
     void selectTouched();
+    void walkHistory(void (QUndoStack::*way)());
 
     KvDeskSession *m_session;
     KvDeskSelection *m_selection;

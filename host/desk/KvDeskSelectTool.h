@@ -24,6 +24,8 @@ public:
     bool key(QKeyEvent *event) override;
     void cancel() override;
     bool isBusy() const override { return m_action != Nothing; }
+    bool canTakeBack() const override { return m_action != Nothing && m_action != Click; }
+    void takeBack() override { cancel(); }
     void draw(QPainter *painter) const override;
     Qt::CursorShape cursor() const override { return Qt::ArrowCursor; }
 

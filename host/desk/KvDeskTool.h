@@ -37,6 +37,10 @@ public:
     virtual void cancel() = 0;
     /** Whether something is half done. */
     virtual bool isBusy() const = 0;
+    /** Whether a part of what is half done can be taken back. Steps of the history wait for that. */
+    virtual bool canTakeBack() const { return false; }
+    /** Takes back the last part of what is half done; nothing is left of it with the first one. */
+    virtual void takeBack() {}
 
     /** Draws above the objects; \a painter carries the transform from the scene. */
     virtual void draw(QPainter *painter) const = 0;

@@ -56,16 +56,23 @@ KvDeskNumberBox *KvDeskTypedPixelSize::createBox(const QString &name)
 
 void KvDeskTypedPixelSize::connectSignals()
 {
-    connect(m_x, SIGNAL(valueChanged(double)), this, SLOT(slotXChanged(double)));
-    connect(m_y, SIGNAL(valueChanged(double)), this, SIGNAL(signalChanged()));
+    connect(m_x, SIGNAL(valueChanged(double)), this, SLOT(slotXChanged()));
+    connect(m_y, SIGNAL(valueChanged(double)), this, SLOT(slotYChanged()));
     connect(m_link, SIGNAL(toggled(bool)), this, SLOT(slotLinkToggled(bool)));
 }
 
 ZtCalibration KvDeskTypedPixelSize::calibration() const
 {
+    if (!fault().isEmpty())
+        return ZtCalibration();
     ZtCalibration result(m_x->value(), m_y->value());
     result.setOrigin(ZtCalibration::Origin::Typed);
     return result;
+}
+
+QString KvDeskTypedPixelSize::fault() const
+{
+    return m_x->fault().isEmpty() ? m_y->fault() : m_x->fault();
 }
 
 void KvDeskTypedPixelSize::setPixelSize(const ZtCalibration &calibration)
@@ -75,16 +82,30 @@ void KvDeskTypedPixelSize::setPixelSize(const ZtCalibration &calibration)
     m_y->setValue(calibration.micrometresPerPixelY());
 }
 
-void KvDeskTypedPixelSize::slotXChanged(double aValue)
+void KvDeskTypedPixelSize::slotXChanged()
 {
+    m_x->setFault(faultOf(*m_x, m_x->value()));
     if (m_link->isChecked())
-        m_y->setValue(aValue);
+        followX();
     emit signalChanged();
+}
+
+void KvDeskTypedPixelSize::slotYChanged()
+{
+    m_y->setFault(faultOf(*m_y, m_y->value()));
+    emit signalChanged();
+}
+
+// What is wrong is said once, where it can be mended.
+void KvDeskTypedPixelSize::followX()
+{
+    m_y->setValue(m_x->fault().isEmpty() ? m_x->value() : 0.0);
 }
 
 void KvDeskTypedPixelSize::slotLinkToggled(bool aLinked)
 {
-    KvDeskReason::setPossible(m_y, !aLinked, m_link->toolTip());
+    // First: what it says of itself makes room for the reason.
     if (aLinked)
-        m_y->setValue(m_x->value());
+        followX();
+    KvDeskReason::setPossible(m_y, !aLinked, m_link->toolTip());
 }

@@ -14,6 +14,7 @@ public:
     explicit KvDeskTypedPixelSize(QWidget *parent = nullptr);
 
     ZtCalibration calibration() const override;
+    QString fault() const override;
     /** Shows a pixel size; linked when it is that of square pixels. */
     void setPixelSize(const ZtCalibration &calibration);
 
@@ -22,12 +23,14 @@ public:
     QToolButton *linkButton() const { return m_link; }
 
 private slots:
-    void slotXChanged(double aValue);
+    void slotXChanged();
+    void slotYChanged();
     void slotLinkToggled(bool aLinked);
 
 private:
     KvDeskNumberBox *createBox(const QString &name);
     void connectSignals();
+    void followX();
 
     KvDeskNumberBox *m_x = nullptr;
     KvDeskNumberBox *m_y = nullptr;

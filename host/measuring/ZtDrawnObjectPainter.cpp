@@ -29,11 +29,11 @@ int distance(const QColor &a, const QColor &b)
     return std::abs(a.red() - b.red()) + std::abs(a.green() - b.green()) + std::abs(a.blue() - b.blue());
 }
 
-// They differ in brightness as well as in hue; neighbours differ most.
+// They differ in brightness as well as in hue; neighbours differ most, and the first are bright on dark stains.
 QVector<QColor> makeCounterColors()
 {
-    const QColor palette[] = {{86, 180, 233}, {240, 110, 50},  {255, 255, 255}, {40, 190, 140},
-                              {240, 228, 66}, {235, 150, 205}, {120, 95, 255},  {160, 235, 235}};
+    const QColor palette[] = {{160, 235, 235}, {240, 110, 50},  {255, 255, 255}, {40, 190, 140},
+                              {240, 228, 66},  {235, 150, 205}, {120, 95, 255},  {86, 180, 233}};
     const QColor own = ZtDrawnObjectPainter::lineColor();
     QVector<QColor> colors{own};
     for (const QColor &color : palette) {

@@ -13,6 +13,7 @@
 #include "KvDeskObjectState.h"
 #include "KvDeskSelection.h"
 #include "KvDeskSession.h"
+#include "KvDeskStatusBar.h"
 #include "KvDeskTableView.h"
 #include "KvDeskValueTable.h"
 #include "KvDeskValueTableModel.h"
@@ -104,6 +105,7 @@ private slots:
 
     void calibratesByAKnownDistance();
     void drawsAndGoesBack();
+    void undoTakesTheDraftBackFirst();
     void changesByMouseAndKeys();
     void countsClasses();
     void tableAndImageSelectTheSame();
@@ -253,7 +255,7 @@ void DeskMeasuringTest::calibrate()
     m_user.activate(dialog);
     m_user.click(dialog->objectiveBox()->lineEdit());
     m_user.type(QStringLiteral("10x"));
-    m_user.click(dialog->knownDistance()->lengthBox()->findChild<QLineEdit *>());
+    m_user.click(dialog->knownDistance()->lengthBox());
     m_user.type(QStringLiteral("2"));
     QTRY_COMPARE(dialog->resultText(), QStringLiteral("New pixel size: 10 μm"));
     m_user.click(dialog->calibrateButton());
@@ -276,10 +278,36 @@ void DeskMeasuringTest::calibratesByAKnownDistance()
     QTRY_VERIFY(!window()->calibrationCommands()->dialog());
 
     m_user.activate(window());
+    const auto *const statusBar = window()->findChild<KvDeskStatusBar *>();
     undo();
     QTRY_COMPARE(value("Line 1", "Length"), QStringLiteral("200.0 px"));
+    QCOMPARE(statusBar->message(), QStringLiteral("Not calibrated"));
     redo();
     QTRY_COMPARE(value("Line 1", "Length"), QStringLiteral("2.000 mm"));
+    QCOMPARE(statusBar->message(), QStringLiteral("Calibrated: 10x, 10 μm per pixel"));
+}
+
+void DeskMeasuringTest::undoTakesTheDraftBackFirst()
+{
+    const QAction *const undoAction = window()->actions()->action(A::Undo);
+    QVERIFY(!undoAction->isEnabled());
+    drawLine();
+    choose(Qt::Key_P, A::PolylineTool);
+    for (const QPoint &place : {QPoint(100, 150), QPoint(150, 150), QPoint(150, 200)})
+        click(place.x(), place.y());
+    QTRY_COMPARE(undoAction->text(), QStringLiteral("&Undo"));
+    undo();
+    undo();
+    QVERIFY(exists(line1));
+    QVERIFY(!window()->actions()->action(A::Redo)->isEnabled());
+    undo();
+    QTRY_COMPARE(undoAction->text(), QStringLiteral("&Undo drawing of Line 1"));
+    QVERIFY(exists(line1));
+    undo();
+    QTRY_VERIFY(!exists(line1));
+    QVERIFY(!undoAction->isEnabled());
+    redo();
+    QTRY_VERIFY(exists(line1));
 }
 
 void DeskMeasuringTest::drawsAndGoesBack()

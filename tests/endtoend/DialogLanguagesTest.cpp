@@ -85,6 +85,11 @@ void DialogLanguagesTest::calibrationHasRoom()
         dialog->wayButton(way)->click();
         m_walk.look(dialog, QStringLiteral("calibration"));
     }
+    for (const char *const text : {"1.234,5", "1e400"}) {
+        dialog->typed()->xBox()->setText(QLatin1String(text));
+        QVERIFY(!dialog->typed()->fault().isEmpty());
+        m_walk.look(dialog, QStringLiteral("faulty size"));
+    }
     dialog->objectiveBox()->setEditText(QStringLiteral("50x"));
     dialog->nameEdit()->setText(QStringLiteral("Stage micrometer"));
     dialog->typed()->xBox()->setValue(0.5);

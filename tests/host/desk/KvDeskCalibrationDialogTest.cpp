@@ -11,6 +11,9 @@
 #include "KvDeskTypedPixelSize.h"
 #include "kernel/ZtAppSettings.h"
 
+#include <QClipboard>
+#include <QComboBox>
+#include <QGuiApplication>
 #include <QHeaderView>
 
 namespace {
@@ -36,6 +39,11 @@ private slots:
     void calibratesByTheFile();
     void calibratesByTypedNumbers();
     void cannotCalibrateByNothing();
+    void typedNumbersStayWhatTheyAre_data();
+    void typedNumbersStayWhatTheyAre();
+    void knownDistancesStayWhatTheyAre_data();
+    void knownDistancesStayWhatTheyAre();
+    void pastedTextStays();
     void newObjectivesAreAdded();
     void showsTheHistoryOfTheObjective();
     void usesAnOldOneAgain();
@@ -150,6 +158,112 @@ void KvDeskCalibrationDialogTest::cannotCalibrateByNothing()
         QVERIFY(!dialog.calibrateButton()->isEnabled());
         QCOMPARE(dialog.calibrateButton()->toolTip(), QStringLiteral("Complete the fields above first"));
     }
+}
+
+void KvDeskCalibrationDialogTest::typedNumbersStayWhatTheyAre_data()
+{
+    const QString noNumber = QStringLiteral("Type a number such as 5.3 or 5,3");
+    const QString outside = QStringLiteral("A pixel measures between 0.000001 μm and 1000000 μm");
+    QTest::addColumn<QString>("typed");
+    QTest::addColumn<QString>("result");
+    QTest::addColumn<QString>("fault");
+    const auto good = [](const char *typed, const char *size) {
+        QTest::newRow(typed) << QString::fromLatin1(typed)
+                             << QStringLiteral("New pixel size: %1 μm").arg(QLatin1String(size)) << QString();
+    };
+    const auto bad = [](const char *typed, const QString &fault) {
+        QTest::newRow(typed) << QString::fromLatin1(typed) << fault << fault;
+    };
+    good("5.3", "5.3");
+    good("5,3", "5.3");
+    good("1,234", "1.234");
+    good("2.5e-3", "0.0025");
+    good("1E+2", "100");
+    good("0.000001", "1e-06");
+    good("1000000", "1e+06");
+    bad("1.234,5", noNumber);
+    bad("1,234.5", noNumber);
+    bad("1 000", noNumber);
+    bad("1.2.3", noNumber);
+    bad("1a2", noNumber);
+    bad("1e", noNumber);
+    bad("nan", noNumber);
+    bad("-1", outside);
+    bad("0", outside);
+    bad("1e400", outside);
+    bad("1e-400", outside);
+    bad("0.0000009", outside);
+    bad("1000001", outside);
+}
+
+void KvDeskCalibrationDialogTest::typedNumbersStayWhatTheyAre()
+{
+    QFETCH(QString, typed);
+    QFETCH(QString, fault);
+    CalibratedDesk desk;
+    Dialog dialog(&desk.calibrator);
+    dialog.setWay(Dialog::Typed);
+    dialog.show();
+    KvDeskNumberBox *const field = dialog.typed()->xBox();
+    QTest::keyClicks(field, typed);
+    QTest::keyClick(field, Qt::Key_Tab);
+    QCOMPARE(field->text(), typed);
+    QTEST(dialog.resultText(), "result");
+    QCOMPARE(dialog.calibrateButton()->isEnabled(), fault.isEmpty());
+    QCOMPARE(field->toolTip(), fault);
+    QTest::keyClick(field, Qt::Key_Return);
+    QCOMPARE(desk.document.calibration().isCalibrated(), fault.isEmpty());
+    if (fault.isEmpty())
+        return;
+    QCOMPARE(dialog.calibrateButton()->toolTip(), fault);
+    // Mended, there is nothing left to say.
+    field->clear();
+    QTest::keyClicks(field, QStringLiteral("2"));
+    QCOMPARE(field->toolTip(), QString());
+    QCOMPARE(dialog.resultText(), QStringLiteral("New pixel size: 2 μm"));
+}
+
+void KvDeskCalibrationDialogTest::knownDistancesStayWhatTheyAre_data()
+{
+    QTest::addColumn<QString>("typed");
+    QTest::addColumn<QString>("result");
+    QTest::newRow("comma") << QStringLiteral("0,1") << QStringLiteral("New pixel size: 0.5 μm");
+    QTest::newRow("several numbers") << QStringLiteral("1.234,5")
+                                     << QStringLiteral("Type a number such as 5.3 or 5,3");
+    QTest::newRow("negative") << QStringLiteral("-1")
+                              << QStringLiteral("A pixel measures between 0.000001 μm and 1000000 μm");
+    QTest::newRow("too large") << QStringLiteral("1e7")
+                               << QStringLiteral("A pixel measures between 0.000001 μm and 1000000 μm");
+}
+
+void KvDeskCalibrationDialogTest::knownDistancesStayWhatTheyAre()
+{
+    QFETCH(QString, typed);
+    QFETCH(QString, result);
+    CalibratedDesk desk;
+    desk.selection.select(desk.line({0, 0}, {200, 0}));
+    const Dialog dialog(&desk.calibrator);
+    KvDeskNumberBox *const field = dialog.knownDistance()->lengthBox();
+    QTest::keyClicks(field, typed);
+    QCOMPARE(field->text(), typed);
+    QCOMPARE(dialog.resultText(), result);
+    const bool isPossible = result.startsWith(QStringLiteral("New"));
+    QCOMPARE(dialog.calibrateButton()->isEnabled(), isPossible);
+    QCOMPARE(field->toolTip(), isPossible ? QString() : result);
+    // Another unit may make it possible.
+    dialog.knownDistance()->unitBox()->setCurrentText(QStringLiteral("μm"));
+    QCOMPARE(dialog.calibrateButton()->isEnabled(), isPossible || typed == QStringLiteral("1e7"));
+}
+
+void KvDeskCalibrationDialogTest::pastedTextStays()
+{
+    CalibratedDesk desk;
+    Dialog dialog(&desk.calibrator);
+    dialog.setWay(Dialog::Typed);
+    QGuiApplication::clipboard()->setText(QStringLiteral("12 345,6"));
+    QTest::keyClick(dialog.typed()->xBox(), Qt::Key_V, Qt::ControlModifier);
+    QCOMPARE(dialog.typed()->xBox()->text(), QStringLiteral("12 345,6"));
+    QVERIFY(!dialog.calibrateButton()->isEnabled());
 }
 
 void KvDeskCalibrationDialogTest::newObjectivesAreAdded()

@@ -3,6 +3,7 @@
 
 #include "CalibratedDesk.h"
 #include "DeskLog.h"
+#include "KvDeskObjectState.h"
 #include "kernel/ZtAppSettings.h"
 
 namespace {
@@ -38,6 +39,7 @@ private slots:
     void openedSessionsAreNotQuestioned();
     void firstImageCalibratesAnEmptySession();
     void theLogTellsOfIt();
+    void theLogTellsWhatIsInForceAgain();
 };
 
 void KvDeskCalibratorTest::init()
@@ -251,6 +253,27 @@ void KvDeskCalibratorTest::theLogTellsOfIt()
     // An image that says the same changes nothing.
     QVERIFY(desk.open(CalibratedDesk::picture(QStringLiteral("g.png"), 10.0, 20.0)));
     QCOMPARE(DeskLog::messages(ZtAppStatus::Information).size(), expected.size());
+}
+
+void KvDeskCalibratorTest::theLogTellsWhatIsInForceAgain()
+{
+    CalibratedDesk desk;
+    desk.calibrator.calibrate(typed("10x", 0.5));
+    desk.calibrator.calibrate(typed("", 2.35));
+    const KvDeskObjectId line = desk.editor.create(ZtDrawnType::Line, polygon({{0, 0}, {9, 9}}));
+    ZtStatusLog::getInstance()->clear();
+    desk.editor.slotUndo();
+    QVERIFY(!KvDeskObjectState::of(line).exists);
+    QCOMPARE(DeskLog::messages(ZtAppStatus::Information), QStringList());
+    desk.editor.slotUndo();
+    desk.editor.slotUndo();
+    desk.editor.slotRedo();
+    desk.editor.slotRedo();
+    QCOMPARE(
+        DeskLog::messages(ZtAppStatus::Information),
+        QStringList({QStringLiteral("Calibrated: 10x, 0.5 μm per pixel"), QStringLiteral("Not calibrated"),
+                     QStringLiteral("Calibrated: 10x, 0.5 μm per pixel"),
+                     QStringLiteral("Calibrated: Typed, 2.35 μm per pixel")}));
 }
 
 STATREPORT_TEST_MAIN(KvDeskCalibratorTest)

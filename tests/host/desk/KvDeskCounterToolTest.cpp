@@ -28,12 +28,18 @@ private slots:
     void cleanup();
 
     void clicksCount();
+    void placesAreOnTheImage_data();
+    void placesAreOnTheImage();
+    void crosshairBesideTheImageCountsNothing();
+    void withoutAnImageEveryPlaceCounts();
     void everyClickIsOneStep();
     void quickClicksCountTwice();
     void rightClickTakesAway_data();
     void rightClickTakesAway();
     void classes();
     void digitsChooseAClass();
+    void nextDigitBeginsAClass();
+    void keyBeginsAClass();
     void countsByKeys();
     void barFollows();
     void barChooses();
@@ -78,6 +84,55 @@ void KvDeskCounterToolTest::clicksCount()
     QCOMPARE(m_desk->points(counter1).size(), 3);
     QVERIFY(isNear(m_desk->points(counter1).last(), {140, 100}));
     QCOMPARE(m_desk->selection.current(), counter1);
+}
+
+void KvDeskCounterToolTest::placesAreOnTheImage_data()
+{
+    QTest::addColumn<QPointF>("place");
+    QTest::addColumn<bool>("counts");
+    QTest::newRow("first corner") << QPointF(0, 0) << true;
+    QTest::newRow("last corner") << QPointF(400, 300) << true;
+    QTest::newRow("inside") << QPointF(399, 1) << true;
+    QTest::newRow("left") << QPointF(-3, 100) << false;
+    QTest::newRow("right") << QPointF(403, 100) << false;
+    QTest::newRow("above") << QPointF(100, -3) << false;
+    QTest::newRow("below") << QPointF(100, 303) << false;
+}
+
+void KvDeskCounterToolTest::placesAreOnTheImage()
+{
+    QFETCH(QPointF, place);
+    QFETCH(bool, counts);
+    m_desk->view.resize(641, 481); // so that the image's corner is at a whole pixel of the screen
+    m_desk->view.slotZoomActual();
+    m_desk->click(place);
+    QCOMPARE(m_desk->count(ZtDrawnType::Counter), counts ? 1 : 0);
+    m_desk->click({200, 150});
+    m_desk->click(place);
+    QCOMPARE(m_desk->points(counter1).size(), counts ? 3 : 1);
+    QCOMPARE(m_desk->steps(), counts ? 3 : 1);
+}
+
+void KvDeskCounterToolTest::crosshairBesideTheImageCountsNothing()
+{
+    m_desk->move({-3, 100});
+    m_desk->key(Qt::Key_Left);
+    m_desk->key(Qt::Key_Space);
+    QCOMPARE(m_desk->count(ZtDrawnType::Counter), 0);
+    m_desk->key(Qt::Key_Right, Qt::ShiftModifier);
+    m_desk->key(Qt::Key_Space);
+    QCOMPARE(m_desk->points(counter1).size(), 1);
+}
+
+void KvDeskCounterToolTest::withoutAnImageEveryPlaceCounts()
+{
+    m_desk->line({0, 0}, {100, 100});
+    m_desk->session.clear();
+    m_desk->line({0, 0}, {100, 100});
+    m_desk->view.flush();
+    QVERIFY(m_desk->view.frame().isNull());
+    m_desk->click({-10, 50});
+    QCOMPARE(m_desk->points(counter1).size(), 1);
 }
 
 void KvDeskCounterToolTest::everyClickIsOneStep()
@@ -148,8 +203,40 @@ void KvDeskCounterToolTest::digitsChooseAClass()
     QCOMPARE(m_toolBox->counterTool()->counter(), counter1);
     m_desk->key(Qt::Key_2);
     QCOMPARE(m_toolBox->counterTool()->counter(), counter2);
-    m_desk->key(Qt::Key_3);
+    m_desk->key(Qt::Key_4);
     QCOMPARE(m_toolBox->counterTool()->counter(), counter2);
+    QCOMPARE(m_desk->count(ZtDrawnType::Counter), 2);
+}
+
+void KvDeskCounterToolTest::nextDigitBeginsAClass()
+{
+    m_desk->key(Qt::Key_2);
+    QCOMPARE(m_desk->count(ZtDrawnType::Counter), 0);
+    m_desk->key(Qt::Key_1);
+    m_desk->click({100, 100});
+    m_desk->key(Qt::Key_2);
+    QCOMPARE(m_toolBox->counterTool()->counter(), counter2);
+    m_desk->click({120, 100});
+    QCOMPARE(m_desk->points(counter1).size(), 1);
+    QCOMPARE(m_desk->points(counter2).size(), 1);
+    m_desk->editor.slotUndo();
+    m_desk->editor.slotUndo();
+    QCOMPARE(m_desk->count(ZtDrawnType::Counter), 1);
+}
+
+void KvDeskCounterToolTest::keyBeginsAClass()
+{
+    m_desk->view.activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(&m_desk->view));
+    QCOMPARE(m_bar->newClassButton()->toolTip(), QStringLiteral("Count another class (Shift+N)"));
+    QCOMPARE(m_bar->newClassButton()->accessibleName(), QStringLiteral("Count another class"));
+    m_desk->click({100, 100});
+    m_desk->key(Qt::Key_N, Qt::ShiftModifier);
+    QCOMPARE(m_toolBox->counterTool()->counter(), counter2);
+    // It means nothing while nobody counts.
+    action(KvDeskActions::LineTool)->trigger();
+    m_desk->key(Qt::Key_N, Qt::ShiftModifier);
+    QCOMPARE(m_desk->count(ZtDrawnType::Counter), 2);
 }
 
 void KvDeskCounterToolTest::countsByKeys()

@@ -33,6 +33,8 @@ private slots:
     void noteIsWrittenInPlace();
     void everythingByKeys();
     void polygonByKeys();
+    void arrowsStepOverPixelsAtAnyZoom_data();
+    void arrowsStepOverPixelsAtAnyZoom();
 
 private:
     KvDeskDrawTool *use(int type);
@@ -330,6 +332,39 @@ void KvDeskDrawToolTest::polygonByKeys()
     // Where the last point is already, Enter ends.
     m_desk->key(Qt::Key_Return);
     QCOMPARE(m_desk->points({ZtDrawnType::Polygon, 1}).size(), 3);
+}
+
+void KvDeskDrawToolTest::arrowsStepOverPixelsAtAnyZoom_data()
+{
+    QTest::addColumn<int>("zoomSteps");
+    QTest::newRow("actual size") << 0;
+    QTest::newRow("61 percent and less") << -3;
+    QTest::newRow("tiny") << -12;
+    QTest::newRow("large") << 6;
+}
+
+void KvDeskDrawToolTest::arrowsStepOverPixelsAtAnyZoom()
+{
+    QFETCH(int, zoomSteps);
+    for (int i = 0; i < qAbs(zoomSteps); ++i) {
+        if (zoomSteps < 0)
+            m_desk->view.slotZoomOut();
+        else
+            m_desk->view.slotZoomIn();
+    }
+    use(ZtDrawnType::Polyline);
+    m_desk->key(Qt::Key_Right);
+    m_desk->key(Qt::Key_Space);
+    m_desk->key(Qt::Key_Right);
+    m_desk->key(Qt::Key_Space);
+    for (int i = 0; i < 3; ++i)
+        m_desk->key(Qt::Key_Down, Qt::ShiftModifier);
+    m_desk->key(Qt::Key_Space);
+    const QPolygonF points = m_tool->points();
+    QCOMPARE(points.size(), 3);
+    QCOMPARE(points.at(0), QPointF(points.at(0).toPoint()));
+    QCOMPARE(points.at(1) - points.at(0), QPointF(1, 0));
+    QCOMPARE(points.at(2) - points.at(1), QPointF(0, 30));
 }
 
 STATREPORT_TEST_MAIN(KvDeskDrawToolTest)

@@ -3,6 +3,7 @@
 
 #include "DeskView.h"
 #include "KvDeskActions.h"
+#include "KvDeskDrawTool.h"
 #include "KvDeskInlineEditor.h"
 #include "KvDeskResources.h"
 
@@ -24,6 +25,14 @@ private slots:
     void keysDoNotWorkInFields();
     void copiesAndPastes();
     void pastesBesideAtAnyZoom();
+    void undoTakesPointsOfTheDraftFirst();
+    void draftCanBeUndoneWithoutSteps();
+    void undoDuringADragDrawsNothing();
+    void undoDuringADragOfObjectsCancelsIt();
+    void undoDuringADragOfAPointCancelsIt();
+    void undoDuringABandCancelsIt();
+    void nothingIsRedoneDuringADraft();
+    void undoBelongsToTheTextThatIsWritten();
 
 private:
     QAction *action(KvDeskActions::Id id) const { return m_actions->action(id); }
@@ -32,7 +41,12 @@ private:
         QTest::keyClick(&m_desk->view, key, modifiers);
     }
 
+    void use(int type);
+    void undoByKey() const { key(Qt::Key_Z, Qt::ControlModifier); }
+    bool canUndo() const { return action(KvDeskActions::Undo)->isEnabled(); }
+
     std::unique_ptr<DeskView> m_desk;
+    std::unique_ptr<KvDeskDrawTool> m_tool;
     std::unique_ptr<KvDeskActions> m_actions;
     std::unique_ptr<KvDeskEditCommands> m_commands;
     KvDeskObjectId m_line;
@@ -55,10 +69,19 @@ void KvDeskEditCommandsTest::init()
 
 void KvDeskEditCommandsTest::cleanup()
 {
+    m_desk->view.setTool(nullptr);
+    m_tool.reset();
     m_commands.reset();
     m_actions.reset();
     m_desk.reset();
     StatReportTest::cleanup();
+}
+
+void KvDeskEditCommandsTest::use(int type)
+{
+    m_desk->view.setTool(nullptr);
+    m_tool = std::make_unique<KvDeskDrawTool>(&m_desk->view, type);
+    m_desk->view.setTool(m_tool.get());
 }
 
 void KvDeskEditCommandsTest::undoNamesTheStep()
@@ -144,6 +167,152 @@ void KvDeskEditCommandsTest::pastesBesideAtAnyZoom()
     action(KvDeskActions::Paste)->trigger();
     const QPointF moved = m_desk->points({ZtDrawnType::Line, 2}).first() - QPointF(50, 50);
     QCOMPARE(moved, QPointF(16.0 / 1.25, 16.0 / 1.25));
+}
+
+void KvDeskEditCommandsTest::undoTakesPointsOfTheDraftFirst()
+{
+    use(ZtDrawnType::Line);
+    m_desk->drag({20, 200}, {120, 200});
+    QCOMPARE(m_desk->count(ZtDrawnType::Line), 2);
+    QCOMPARE(action(KvDeskActions::Undo)->text(), QStringLiteral("&Undo drawing of Line 2"));
+    use(ZtDrawnType::Polyline);
+    m_desk->click({200, 100});
+    m_desk->click({240, 100});
+    m_desk->click({280, 140});
+    QCOMPARE(action(KvDeskActions::Undo)->text(), QStringLiteral("&Undo"));
+    for (int left = 2; left >= 0; --left) {
+        QVERIFY(canUndo());
+        undoByKey();
+        QCOMPARE(m_tool->points().size(), left);
+        QCOMPARE(m_desk->count(ZtDrawnType::Line), 2);
+    }
+    QCOMPARE(action(KvDeskActions::Undo)->text(), QStringLiteral("&Undo drawing of Line 2"));
+    undoByKey();
+    QCOMPARE(m_desk->count(ZtDrawnType::Line), 1);
+}
+
+void KvDeskEditCommandsTest::draftCanBeUndoneWithoutSteps()
+{
+    using A = KvDeskActions;
+    QVERIFY(!canUndo());
+    use(ZtDrawnType::Polyline);
+    m_desk->click({200, 100});
+    QVERIFY(canUndo());
+    QCOMPARE(action(A::Undo)->toolTip(), QStringLiteral("Undo the last step (Ctrl+Z)"));
+    undoByKey();
+    QVERIFY(m_tool->points().isEmpty());
+    QVERIFY(!canUndo());
+    for (const Qt::Key end : {Qt::Key_Escape, Qt::Key_Backspace}) {
+        m_desk->click({200, 100});
+        QVERIFY(canUndo());
+        m_desk->key(end);
+        QVERIFY(!canUndo());
+    }
+    m_desk->click({200, 100});
+    m_desk->view.setTool(nullptr);
+    QVERIFY(!canUndo());
+}
+
+void KvDeskEditCommandsTest::undoDuringADragDrawsNothing()
+{
+    use(ZtDrawnType::Polyline);
+    m_desk->click({200, 100});
+    m_desk->press({240, 100});
+    m_desk->move({280, 140}, Qt::LeftButton);
+    undoByKey();
+    QCOMPARE(m_tool->points().size(), 1);
+    m_desk->move({290, 140}, Qt::LeftButton);
+    m_desk->release({290, 140});
+    QCOMPARE(m_tool->points().size(), 1);
+}
+
+void KvDeskEditCommandsTest::undoDuringADragOfObjectsCancelsIt()
+{
+    m_desk->editor.rename(m_line, QStringLiteral("Width"));
+    const QPolygonF before = m_desk->points(m_line);
+    m_desk->press({100, 50});
+    m_desk->move({100, 70}, Qt::LeftButton);
+    m_desk->move({100, 90}, Qt::LeftButton);
+    QVERIFY(m_desk->points(m_line) != before);
+    undoByKey();
+    QCOMPARE(m_desk->points(m_line), before);
+    m_desk->move({100, 120}, Qt::LeftButton);
+    m_desk->release({100, 120});
+    QCOMPARE(m_desk->points(m_line), before);
+    QCOMPARE(m_desk->name(m_line), QStringLiteral("Width"));
+    undoByKey();
+    QCOMPARE(m_desk->name(m_line), QStringLiteral("Line 1"));
+}
+
+void KvDeskEditCommandsTest::undoDuringADragOfAPointCancelsIt()
+{
+    m_desk->editor.rename(m_line, QStringLiteral("Width"));
+    m_desk->selection.select(m_line);
+    const QPolygonF before = m_desk->points(m_line);
+    m_desk->press({150, 50});
+    m_desk->move({150, 90}, Qt::LeftButton);
+    QVERIFY(m_desk->points(m_line) != before);
+    undoByKey();
+    m_desk->move({150, 120}, Qt::LeftButton);
+    m_desk->release({150, 120});
+    QCOMPARE(m_desk->points(m_line), before);
+    QCOMPARE(m_desk->name(m_line), QStringLiteral("Width"));
+}
+
+void KvDeskEditCommandsTest::undoDuringABandCancelsIt()
+{
+    m_desk->editor.rename(m_line, QStringLiteral("Width"));
+    m_desk->selection.clear();
+    m_desk->press({20, 20});
+    m_desk->move({200, 100}, Qt::LeftButton);
+    undoByKey();
+    m_desk->release({200, 100});
+    QVERIFY(m_desk->selection.isEmpty());
+    QCOMPARE(m_desk->name(m_line), QStringLiteral("Width"));
+}
+
+void KvDeskEditCommandsTest::nothingIsRedoneDuringADraft()
+{
+    using A = KvDeskActions;
+    m_desk->editor.rename(m_line, QStringLiteral("Width"));
+    undoByKey();
+    QVERIFY(action(A::Redo)->isEnabled());
+    use(ZtDrawnType::Polyline);
+    m_desk->click({200, 100});
+    QVERIFY(!action(A::Redo)->isEnabled());
+    QCOMPARE(action(A::Redo)->toolTip(),
+             QStringLiteral("Redo what was undone (Ctrl+Shift+Z)\nFinish or cancel "
+                            "what you have begun first"));
+    key(Qt::Key_Z, Qt::ControlModifier | Qt::ShiftModifier);
+    QCOMPARE(m_desk->name(m_line), QStringLiteral("Line 1"));
+    undoByKey();
+    QVERIFY(action(A::Redo)->isEnabled());
+    key(Qt::Key_Z, Qt::ControlModifier | Qt::ShiftModifier);
+    QCOMPARE(m_desk->name(m_line), QStringLiteral("Width"));
+}
+
+// As from the tool bar, which does not take the keyboard.
+void KvDeskEditCommandsTest::undoBelongsToTheTextThatIsWritten()
+{
+    using A = KvDeskActions;
+    m_desk->editor.rename(m_line, QStringLiteral("Width"));
+    use(ZtDrawnType::TextNote);
+    m_desk->click({200, 100});
+    KvDeskInlineEditor *const field = m_desk->view.inlineEditor();
+    QVERIFY(field->isVisible());
+    QVERIFY(!canUndo());
+    QVERIFY(!action(A::Redo)->isEnabled());
+    QTest::keyClicks(field, QStringLiteral("pore"));
+    QVERIFY(canUndo());
+    action(A::Undo)->trigger();
+    QCOMPARE(field->text(), QString());
+    QVERIFY(!canUndo());
+    undoByKey();
+    QCOMPARE(m_desk->name(m_line), QStringLiteral("Width"));
+    QTest::keyClick(field, Qt::Key_Escape);
+    QVERIFY(canUndo());
+    undoByKey();
+    QCOMPARE(m_desk->name(m_line), QStringLiteral("Line 1"));
 }
 
 STATREPORT_TEST_MAIN(KvDeskEditCommandsTest)

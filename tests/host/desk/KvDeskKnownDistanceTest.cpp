@@ -17,6 +17,7 @@ private slots:
     void followsTheLine();
     void pixelsKeepTheirShape();
     void lengthIsMissing();
+    void lengthIsJudgedWithoutALine();
     void offersTheUsualUnits();
 };
 
@@ -136,6 +137,27 @@ void KvDeskKnownDistanceTest::lengthIsMissing()
     CalibratedDesk desk;
     desk.selection.select(desk.line({0, 0}, {0, 100}));
     const KvDeskKnownDistance way(&desk.calibrator);
+    QVERIFY(!way.calibration().isCalibrated());
+}
+
+void KvDeskKnownDistanceTest::lengthIsJudgedWithoutALine()
+{
+    CalibratedDesk desk;
+    const KvDeskKnownDistance way(&desk.calibrator);
+    QCOMPARE(way.fault(), QString());
+    for (const char *const text : {"-1", "0", "1e400", "1 000"}) {
+        way.lengthBox()->clear();
+        QTest::keyClicks(way.lengthBox(), QLatin1String(text));
+        QVERIFY2(!way.fault().isEmpty(), text);
+        QCOMPARE(way.lengthBox()->fault(), way.fault());
+    }
+    way.lengthBox()->clear();
+    QTest::keyClicks(way.lengthBox(), QStringLiteral("1e9"));
+    QCOMPARE(way.fault(), QString());
+    // Too long for the line that is there now.
+    desk.selection.select(desk.line({0, 0}, {30, 40}));
+    way.useButton()->click();
+    QVERIFY(!way.fault().isEmpty());
     QVERIFY(!way.calibration().isCalibrated());
 }
 

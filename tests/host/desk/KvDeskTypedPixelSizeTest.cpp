@@ -17,6 +17,8 @@ private slots:
     void linkingAgainMakesThemEqual();
     void missingNumbersCalibrateNothing();
     void showsAPixelSize();
+    void fieldsSayWhatIsWrong();
+    void linkedSizeSaysNothingOfItsOwn();
     void fieldsHaveNames();
 };
 
@@ -73,6 +75,38 @@ void KvDeskTypedPixelSizeTest::showsAPixelSize()
     way.setPixelSize(ZtCalibration(3.0));
     QVERIFY(way.linkButton()->isChecked());
     QCOMPARE(way.yBox()->text(), QStringLiteral("3"));
+}
+
+void KvDeskTypedPixelSizeTest::fieldsSayWhatIsWrong()
+{
+    KvDeskTypedPixelSize way;
+    way.linkButton()->click();
+    QTest::keyClicks(way.xBox(), QStringLiteral("2"));
+    QTest::keyClicks(way.yBox(), QStringLiteral("1.234,5"));
+    QVERIFY(!way.calibration().isCalibrated());
+    QCOMPARE(way.fault(), QStringLiteral("Type a number such as 5.3 or 5,3"));
+    QCOMPARE(way.xBox()->fault(), QString());
+    QCOMPARE(way.yBox()->fault(), way.fault());
+    way.yBox()->setValue(3.0);
+    QCOMPARE(way.fault(), QString());
+    QVERIFY(way.calibration() == ZtCalibration(2.0, 3.0));
+}
+
+void KvDeskTypedPixelSizeTest::linkedSizeSaysNothingOfItsOwn()
+{
+    KvDeskTypedPixelSize way;
+    QTest::keyClicks(way.xBox(), QStringLiteral("5"));
+    QTest::keyClicks(way.xBox(), QStringLiteral("e9"));
+    QVERIFY(!way.fault().isEmpty());
+    QCOMPARE(way.yBox()->text(), QString());
+    QCOMPARE(way.yBox()->fault(), QString());
+    way.linkButton()->click();
+    QTest::keyClicks(way.yBox(), QStringLiteral("x"));
+    QVERIFY(!way.yBox()->fault().isEmpty());
+    way.linkButton()->click();
+    QCOMPARE(way.yBox()->fault(), QString());
+    QVERIFY(!way.yBox()->isEnabled());
+    QCOMPARE(way.yBox()->toolTip(), QStringLiteral("Same size in both directions"));
 }
 
 void KvDeskTypedPixelSizeTest::fieldsHaveNames()

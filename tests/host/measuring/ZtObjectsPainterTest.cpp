@@ -11,6 +11,7 @@
 
 #include <QPainter>
 
+#include <cmath>
 #include <random>
 
 namespace {
@@ -39,6 +40,7 @@ private slots:
     void drawsEveryObjectHoweverMany();
     void countersHaveTheirColours();
     void counterColoursDiffer();
+    void firstCountersAreSeenOnStainedCells();
     void scaleBarNeedsACalibration();
     void scaleBarBelongsToAllTypes();
 
@@ -255,6 +257,20 @@ void ZtObjectsPainterTest::counterColoursDiffer()
             QVERIFY(qAbs(a.red() - b.red()) + qAbs(a.green() - b.green()) + qAbs(a.blue() - b.blue()) >= 120);
         }
     }
+}
+
+// Stains are dark blue, and most people count two classes.
+void ZtObjectsPainterTest::firstCountersAreSeenOnStainedCells()
+{
+    const auto part = [](double value) {
+        return value <= 0.04045 ? value / 12.92 : std::pow((value + 0.055) / 1.055, 2.4);
+    };
+    const auto brightness = [&part](const QColor &color) {
+        return 0.2126 * part(color.redF()) + 0.7152 * part(color.greenF()) + 0.0722 * part(color.blueF());
+    };
+    const double stain = brightness(QColor(75, 105, 180));
+    for (int id = 1; id <= 2; ++id)
+        QVERIFY((brightness(ZtDrawnObjectPainter::counterColor(id)) + 0.05) / (stain + 0.05) >= 3.0);
 }
 
 void ZtObjectsPainterTest::scaleBarNeedsACalibration()
