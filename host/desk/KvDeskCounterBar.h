@@ -11,6 +11,7 @@
 class KvDeskImageView;
 class KvDeskToolBox;
 class QComboBox;
+class QLabel;
 class QToolButton;
 
 /** A bar over the image while the user counts: which counter gets the clicks, and a button for another one.
@@ -37,6 +38,8 @@ private slots:
 private:
     void createWidgets();
     void place();
+    void showWhatFits();
+    int widthOf(const QList<QWidget *> &parts, int classesWidth) const;
     void showColors();
     QString classText(const KvDeskObjectId &counter) const;
 
@@ -47,5 +50,6 @@ private:
     QComboBox *m_classes = nullptr;
     QVector<QIcon> m_swatches; ///< in the order of the counters' colours
     QToolButton *m_newClass = nullptr;
-    QWidget *m_hint = nullptr;
+    QLabel *m_label = nullptr;
+    QLabel *m_hint = nullptr;
 };
