@@ -16,6 +16,7 @@ QString plainText(const QString &text)
 KvDeskNumberBox::KvDeskNumberBox(QWidget *parent)
     : QDoubleSpinBox(parent)
 {
+    setLocale(QLocale::c());
     setDecimals(mostDecimals);
     setRange(0.0, largest);
     setButtonSymbols(NoButtons);
