@@ -21,7 +21,8 @@ int beginOfNumber(const QString &text)
 
 } // namespace
 
-QString KvDeskCellDelegate::shortened(const QString &text, const QFontMetrics &metrics, int width)
+QString KvDeskCellDelegate::shortened(const QString &text, const QFontMetrics &metrics, int width,
+                                      Qt::TextElideMode mode)
 {
     if (metrics.horizontalAdvance(text) <= width)
         return text;
@@ -30,7 +31,7 @@ QString KvDeskCellDelegate::shortened(const QString &text, const QFontMetrics &m
     const int room = width - metrics.horizontalAdvance(number);
     // A number that leaves no room for what it numbers is shortened like any text.
     if (number.isEmpty() || room < metrics.horizontalAdvance(QChar(0x2026)))
-        return metrics.elidedText(text, Qt::ElideMiddle, width);
+        return metrics.elidedText(text, number.isEmpty() ? mode : Qt::ElideMiddle, width);
     return metrics.elidedText(text.left(begin), Qt::ElideRight, room) + number;
 }
 
@@ -51,7 +52,7 @@ void KvDeskCellDelegate::initStyleOption(QStyleOptionViewItem *option, const QMo
     const int margin = style->pixelMetric(QStyle::PM_FocusFrameHMargin, option, option->widget) + 1;
     const int width =
         style->subElementRect(QStyle::SE_ItemViewItemText, option, option->widget).width() - 2 * margin;
-    option->text = shortened(option->text, option->fontMetrics, width);
+    option->text = shortened(option->text, option->fontMetrics, width, m_elideMode);
 }
 
 bool KvDeskCellDelegate::isCut(const QStyleOptionViewItem &option, const QModelIndex &index) const

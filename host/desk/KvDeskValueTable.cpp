@@ -77,6 +77,10 @@ void KvDeskValueTable::createView()
     m_view->setModel(m_sorted);
     m_view->setCopiesHeadings(true);
     m_view->setItemDelegate(new KvDeskCellDelegate(m_view));
+    // Both ends of a name that somebody gave may tell it from others.
+    auto *const names = new KvDeskCellDelegate(m_view);
+    names->setElideMode(Qt::ElideMiddle);
+    m_view->setItemDelegateForColumn(KvDeskValueTableModel::ObjectColumn, names);
     m_delegate = new KvDeskValueDelegate(m_view);
     m_view->setItemDelegateForColumn(KvDeskValueTableModel::ValueColumn, m_delegate);
     m_selection = new KvDeskValueSelection(m_view, m_sorted, m_model, this);

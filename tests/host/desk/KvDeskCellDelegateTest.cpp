@@ -15,6 +15,7 @@ class KvDeskCellDelegateTest : public StatReportTest
 private slots:
     void shortens_data();
     void shortens();
+    void endsOfNamesStayWhereWanted();
     void numbersStayApart();
     void toolTipHasTheWholeText();
 };
@@ -28,13 +29,13 @@ void KvDeskCellDelegateTest::shortens_data()
         << QStringLiteral("Rectangle 12") << QStringLiteral("R") << QStringLiteral("… 12");
     QTest::newRow("number without a blank")
         << QStringLiteral("Rectangle12") << QStringLiteral("R") << QStringLiteral("…12");
-    QTest::newRow("no number") << QStringLiteral("Rectangular") << QStringLiteral("R") << QStringLiteral("r");
+    QTest::newRow("no number") << QStringLiteral("Rectangular") << QStringLiteral("R") << QStringLiteral("…");
     QTest::newRow("number too long") << QStringLiteral("R 123456789012345") << QStringLiteral("R")
                                      << QStringLiteral("5");
     QTest::newRow("number alone") << QStringLiteral("123456789012345") << QStringLiteral("1")
                                   << QStringLiteral("5");
     QTest::newRow("number before") << QStringLiteral("12 Rectangles") << QStringLiteral("1")
-                                   << QStringLiteral("s");
+                                   << QStringLiteral("…");
 }
 
 void KvDeskCellDelegateTest::shortens()
@@ -49,6 +50,15 @@ void KvDeskCellDelegateTest::shortens()
     QFETCH(QString, begin);
     QFETCH(QString, end);
     QVERIFY2(shown.startsWith(begin) && shown.endsWith(end), qPrintable(shown));
+}
+
+void KvDeskCellDelegateTest::endsOfNamesStayWhereWanted()
+{
+    const QFontMetrics metrics(QApplication::font());
+    const QString shown = KvDeskCellDelegate::shortened(
+        QStringLiteral("Rectangle on the left"), metrics,
+        metrics.horizontalAdvance(QStringLiteral("Rect…left")), Qt::ElideMiddle);
+    QVERIFY2(shown.startsWith(QLatin1Char('R')) && shown.endsWith(QLatin1Char('t')), qPrintable(shown));
 }
 
 // What a narrow column of the table shows of numbered objects differs.
