@@ -3,7 +3,6 @@
 
 #include "KvDeskActions.h"
 #include "KvDeskCounterTool.h"
-#include "KvDeskElidedLabel.h"
 #include "KvDeskImageView.h"
 #include "KvDeskSelection.h"
 #include "KvDeskToolBox.h"
@@ -27,7 +26,6 @@ namespace {
 constexpr int margin = 8;
 constexpr int classesWidth = 240;
 constexpr int leastClassesWidth = 96;
-constexpr int leastWidthWithHint = 400;
 constexpr QSize iconSize(24, 24);
 constexpr QSize buttonSize(32, 28);
 
@@ -66,7 +64,7 @@ KvDeskCounterBar::KvDeskCounterBar(KvDeskToolBox *toolBox, KvDeskImageView *view
 
 void KvDeskCounterBar::createWidgets()
 {
-    auto *const label = new KvDeskElidedLabel(tr("Clicks count for"), this);
+    m_label = new QLabel(tr("Clicks count for"), this);
     m_classes = new QComboBox(this);
     // As wide as may be whatever it lists, which changes with every click; narrower only where there is no
     // room.
@@ -75,15 +73,14 @@ void KvDeskCounterBar::createWidgets()
     m_classes->setMinimumWidth(leastClassesWidth);
     m_classes->setMaximumWidth(classesWidth);
     m_classes->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
-    m_classes->setAccessibleName(label->text());
-    m_classes->setToolTip(tr("The counter that gets the clicks (1 to 9)"));
+    m_classes->setAccessibleName(m_label->text());
     createNewClass();
-    m_hint = new KvDeskElidedLabel(tr("A right click takes a place away"), this);
+    m_hint = new QLabel(tr("A right click takes a place away"), this);
     m_hint->setProperty("caption", true);
     auto *const layout = new QHBoxLayout(this);
     layout->setContentsMargins(margin, margin, margin, margin);
     layout->setSpacing(margin);
-    layout->addWidget(label);
+    layout->addWidget(m_label);
     layout->addWidget(m_classes);
     layout->addWidget(m_newClass);
     layout->addWidget(m_hint);
@@ -177,10 +174,35 @@ void KvDeskCounterBar::slotNewClass()
     m_view->setFocus();
 }
 
+// Width of the bar with the box for the classes and other parts.
+int KvDeskCounterBar::widthOf(const QList<QWidget *> &parts, int classesWidth) const
+{
+    int width = 2 * margin + classesWidth;
+    for (const QWidget *const part : parts)
+        width += margin + qBound(part->minimumWidth(), part->sizeHint().width(), part->maximumWidth());
+    return width;
+}
+
+// In a narrow view the hint goes first, then the names of the classes are cut, and the label goes last. What
+// is not there is said by the tool tip.
+void KvDeskCounterBar::showWhatFits()
+{
+    const int room = parentWidget()->width();
+    const bool hasHint = widthOf({m_label, m_newClass, m_hint}, classesWidth) <= room;
+    const bool hasLabel = widthOf({m_label, m_newClass}, leastClassesWidth) <= room;
+    m_hint->setVisible(hasHint);
+    m_label->setVisible(hasLabel);
+    QStringList lines(tr("The counter that gets the clicks (1 to 9)"));
+    if (!hasLabel)
+        lines.prepend(m_label->text());
+    if (!hasHint)
+        lines.append(m_hint->text());
+    m_classes->setToolTip(lines.join(QLatin1Char('\n')));
+}
+
 void KvDeskCounterBar::place()
 {
-    // In a narrow view the hint goes first, then the names are cut.
-    m_hint->setVisible(parentWidget()->width() >= leastWidthWithHint);
+    showWhatFits();
     const QSize wanted = sizeHint();
     resize(qMin(wanted.width(), parentWidget()->width()), wanted.height());
     move((parentWidget()->width() - width()) / 2, margin);

@@ -12,6 +12,7 @@ class KvDeskImageView;
 class KvDeskToolBox;
 class QAction;
 class QComboBox;
+class QLabel;
 class QToolButton;
 
 /** A bar over the image while the user counts: which counter gets the clicks, and a button for another one.
@@ -39,6 +40,8 @@ private:
     void createWidgets();
     void createNewClass();
     void place();
+    void showWhatFits();
+    int widthOf(const QList<QWidget *> &parts, int classesWidth) const;
     void showColors();
     QString classText(const KvDeskObjectId &counter) const;
 
@@ -50,5 +53,6 @@ private:
     QVector<QIcon> m_swatches; ///< in the order of the counters' colours
     QToolButton *m_newClass = nullptr;
     QAction *m_newClassAction = nullptr;
-    QWidget *m_hint = nullptr;
+    QLabel *m_label = nullptr;
+    QLabel *m_hint = nullptr;
 };

@@ -26,5 +26,17 @@ void KvDeskElidedLabel::paintEvent(QPaintEvent *event)
 void KvDeskElidedLabel::resizeEvent(QResizeEvent *event)
 {
     QLabel::resizeEvent(event);
-    setToolTip(shownText() == text() ? QString() : text());
+    updateToolTip();
+}
+
+void KvDeskElidedLabel::setDetails(const QString &details)
+{
+    m_details = details;
+    updateToolTip();
+}
+
+void KvDeskElidedLabel::updateToolTip()
+{
+    const QString whole = shownText() == text() ? QString() : text();
+    setToolTip(m_details.isEmpty() ? whole : m_details);
 }

@@ -10,6 +10,9 @@ class KvDeskElidedLabel : public QLabel
 public:
     using QLabel::QLabel;
 
+    /** What the tool tip says in any case, instead of the whole text where that is shortened. */
+    void setDetails(const QString &details);
+
     QSize minimumSizeHint() const override;
 
 protected:
@@ -18,4 +21,7 @@ protected:
 
 private:
     QString shownText() const;
+    void updateToolTip();
+
+    QString m_details;
 };

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskExposureControl.h"
 
-#include <QDoubleSpinBox>
+#include "KvDeskDecimalBox.h"
+
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QLineEdit>
@@ -26,7 +27,7 @@ KvDeskExposureControl::KvDeskExposureControl(QWidget *parent)
     : QWidget(parent)
     , m_label(new QLabel(tr("E&xposure"), this))
     , m_slider(new QSlider(Qt::Horizontal, this))
-    , m_field(new QDoubleSpinBox(this))
+    , m_field(new KvDeskDecimalBox(this))
 {
     m_label->setBuddy(m_field);
     m_slider->setRange(0, steps);

@@ -20,7 +20,6 @@
 #include <QDir>
 #include <QFileDialog>
 #include <QGuiApplication>
-#include <QLocale>
 #include <QMenu>
 #include <QMessageBox>
 #include <QPushButton>
@@ -198,7 +197,7 @@ void KvDeskGallery::slotShowFile(const QString &aPath)
 void KvDeskGallery::slotFolderRead()
 {
     const int count = m_model->rowCount();
-    header()->setNote(count > 0 ? QLocale().toString(count) : QString());
+    header()->setNote(count > 0 ? QString::number(count) : QString());
     m_emptyState->setText(emptyText());
     m_emptyState->setVisible(count == 0);
     selectPendingFile();

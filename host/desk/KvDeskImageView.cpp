@@ -10,11 +10,15 @@
 #include "KvDeskSelection.h"
 #include "KvDeskSnapping.h"
 #include "gui/QtAdvancedStylesheet.h"
+#include "kernel/ZtGsManipulator.h"
 #include "kernel/ZtSignalCenter.h"
 #include "measuring/ZtFrameSource.h"
 #include "measuring/ZtKernelImage.h"
+#include "measuring/ZtMeasureFormat.h"
 #include "measuring/ZtMeasuringDocument.h"
 #include "measuring/ZtObjectsPainter.h"
+#include "measuring/ZtUnit.h"
+#include "measuring/ZtUnitSettings.h"
 
 #include <QGraphicsScene>
 #include <QGuiApplication>
@@ -33,6 +37,13 @@ constexpr double largestFitZoom = 8.0; ///< tiny images are not blown up further
 constexpr double clickTolerance = 6.0; ///< pixels beside an object that still hit it
 constexpr double snapDistance = 8.0;   ///< pixels beside a point that still mean it
 constexpr double straightStep = 15.0;  ///< degrees between directions that Shift keeps
+
+// The user's unit, or the one in which so many micrometres read best.
+ZtUnit rulerUnit(double extent)
+{
+    const ZtUnit chosen = ZtUnitSettings::getInstance()->chosenUnit(ZtGsManipulator::Length);
+    return chosen.isEmpty() ? ZtMeasureFormat::readableUnit(extent, ZtGsManipulator::Length) : chosen;
+}
 
 } // namespace
 
@@ -692,8 +703,13 @@ void KvDeskImageView::slotUpdateRulers()
         return;
     const ZtCalibration calibration = m_document ? m_document->calibration() : ZtCalibration();
     const QPointF origin = viewportTransform().map(QPointF());
-    m_topRuler->setScale(origin.x(), transform().m11(), calibration.micrometresPerPixelX());
-    m_leftRuler->setScale(origin.y(), transform().m22(), calibration.micrometresPerPixelY());
+    const double pixelWidth = calibration.micrometresPerPixelX();
+    const double pixelHeight = calibration.micrometresPerPixelY();
+    // One unit for both, which the corner names.
+    const ZtUnit unit = rulerUnit(qMax(m_topRuler->extent(transform().m11(), pixelWidth),
+                                       m_leftRuler->extent(transform().m22(), pixelHeight)));
+    m_topRuler->setScale(origin.x(), transform().m11(), pixelWidth, unit);
+    m_leftRuler->setScale(origin.y(), transform().m22(), pixelHeight, unit);
     m_rulerCorner->setText(m_topRuler->unitText());
     m_rulerCorner->setToolTip(m_topRuler->toolTip());
 }

@@ -14,7 +14,6 @@
 #include <QAction>
 #include <QHBoxLayout>
 #include <QLabel>
-#include <QLocale>
 #include <QPushButton>
 #include <QToolButton>
 #include <QVariant>
@@ -206,9 +205,9 @@ void KvDeskLiveBar::slotUpdateRate()
     // The first picture is not announced as a change of state.
     m_status->setText(statusText(*source));
     //: frames per second
-    m_frameRate->setText(tr("%1 fps").arg(QLocale().toString(source->frameRate(), 'f', 1)));
-    m_frameRate->setToolTip(tr("Frames per second\nDropped, because newer ones came first: %1")
-                                .arg(QLocale().toString(source->droppedFrames())));
+    m_frameRate->setText(tr("%1 fps").arg(QString::number(source->frameRate(), 'f', 1)));
+    m_frameRate->setToolTip(
+        tr("Frames per second\nDropped, because newer ones came first: %1").arg(source->droppedFrames()));
 }
 
 void KvDeskLiveBar::slotFreeze(bool aFrozen)

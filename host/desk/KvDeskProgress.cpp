@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskProgress.h"
 
+#include "KvDeskReason.h"
 #include "gui/QtAdvancedStylesheet.h"
 #include "measuring/ZtProgress.h"
 #include "measuring/ZtWorkerThread.h"
@@ -155,7 +156,7 @@ void KvDeskProgress::wait(ZtWorkerThread *thread)
 void KvDeskProgress::beginWaiting()
 {
     m_isCloseWanted = false;
-    m_cancel->setEnabled(true);
+    KvDeskReason::setPossible(m_cancel, true, QString());
     m_delay.start(delayMs - quickMs);
     QApplication::setOverrideCursor(Qt::BusyCursor);
     qApp->installEventFilter(this);
@@ -198,7 +199,7 @@ void KvDeskProgress::slotCancel()
     if (m_job && m_job->progress.cancel())
         emit signalCancelled();
     else
-        m_cancel->setEnabled(false);
+        KvDeskReason::setPossible(m_cancel, false, tr("This can no longer be cancelled"));
 }
 
 void KvDeskProgress::place()

@@ -2,10 +2,7 @@
 #include "KvDeskRuler.h"
 
 #include "gui/QtAdvancedStylesheet.h"
-#include "kernel/ZtGsManipulator.h"
-#include "measuring/ZtMeasureFormat.h"
 #include "measuring/ZtUnit.h"
-#include "measuring/ZtUnitSettings.h"
 
 #include <QPainter>
 
@@ -61,16 +58,17 @@ double KvDeskRuler::length() const
     return m_orientation == Qt::Horizontal ? width() : height();
 }
 
-void KvDeskRuler::setScale(double origin, double scale, double pixelSize)
+double KvDeskRuler::extent(double scale, double pixelSize) const
+{
+    return scale > 0.0 ? length() / scale * pixelSize : 0.0;
+}
+
+void KvDeskRuler::setScale(double origin, double scale, double pixelSize, const ZtUnit &unit)
 {
     m_origin = origin;
     m_pixelsPerUnit = scale;
     m_unitText = QStringLiteral("px");
     if (pixelSize > 0.0 && scale > 0.0) {
-        const ZtUnit chosen = ZtUnitSettings::getInstance()->chosenUnit(ZtGsManipulator::Length);
-        const double visible = length() / scale * pixelSize;
-        const ZtUnit unit =
-            chosen.isEmpty() ? ZtMeasureFormat::readableUnit(visible, ZtGsManipulator::Length) : chosen;
         m_pixelsPerUnit = scale / pixelSize * unit.factor();
         m_unitText = unit.text();
     }

@@ -6,6 +6,8 @@
 
 #include <optional>
 
+class ZtUnit;
+
 /** A ruler along an edge of the image: in pixels, or in a unit of length once the image is calibrated. */
 class KvDeskRuler : public QWidget
 {
@@ -26,8 +28,11 @@ public:
      * \param origin    where the image begins, in pixels of the ruler
      * \param scale     pixels of the ruler per pixel of the image
      * \param pixelSize micrometres per pixel of the image; 0 for none
+     * \param unit      of length, in which the ruler counts where there is a pixel size; not empty then
      */
-    void setScale(double origin, double scale, double pixelSize);
+    void setScale(double origin, double scale, double pixelSize, const ZtUnit &unit);
+    /** How many micrometres the ruler shows at a scale and a pixel size as those of setScale(). */
+    double extent(double scale, double pixelSize) const;
     /** The place of the pointer in pixels of the ruler, or none. */
     void setPointer(std::optional<double> position);
 

@@ -62,5 +62,5 @@ double KvDeskRunningStatistics::maximum() const
 
 double KvDeskRunningStatistics::standardDeviation() const
 {
-    return m_count > 1 ? std::sqrt(m_squares / (m_count - 1)) : none;
+    return m_count > 1 ? std::sqrt(m_squares / m_count) : none;
 }

@@ -21,7 +21,8 @@ public:
     double mean() const;
     double minimum() const;
     double maximum() const;
-    /** Of the population from which the numbers are a sample; NaN for less than two numbers. */
+    /** Of the numbers as a whole population (divided by their count), as reports state it; NaN for less than
+     * two numbers. */
     double standardDeviation() const;
 
 private:

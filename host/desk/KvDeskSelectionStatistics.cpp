@@ -112,9 +112,18 @@ QString KvDeskSelectionStatistics::line(const Group &sum) const
                            format(all.minimum()), format(all.maximum()));
 }
 
+QString KvDeskSelectionStatistics::countText() const
+{
+    return tr("Selected values: %1").arg(count());
+}
+
 QString KvDeskSelectionStatistics::text() const
 {
-    return m_groups.isEmpty() ? QString() : line(sums().first());
+    if (m_groups.isEmpty())
+        return QString();
+    const QString first = line(sums().first());
+    // Otherwise the figures of the first name would seem to be those of everything.
+    return isMixed() && !first.isEmpty() ? countText() + QStringLiteral("; ") + first : first;
 }
 
 QString KvDeskSelectionStatistics::details() const
@@ -122,7 +131,7 @@ QString KvDeskSelectionStatistics::details() const
     if (m_groups.isEmpty() || numbers().count() == 0)
         return QString();
     const QStringList figures = isMixed() ? lines() : preciseFigures();
-    return (QStringList(tr("Selected values: %1").arg(count())) + figures).join(QLatin1Char('\n'));
+    return (QStringList(countText()) + figures).join(QLatin1Char('\n'));
 }
 
 QStringList KvDeskSelectionStatistics::lines() const

@@ -35,13 +35,14 @@ public:
     /** Of all values; of a mixture those that have the name of the first. */
     KvDeskRunningStatistics numbers() const;
 
-    /** numbers() in one line; empty without values. */
+    /** numbers() in one line, of a mixture behind the count of all values; empty without values. */
     QString text() const;
     /** Several lines: more digits, or a line for each name of a mixture. */
     QString details() const;
 
 private:
     QVector<Group> sums() const;
+    QString countText() const;
     QString line(const Group &sum) const;
     QStringList lines() const;
     QStringList preciseFigures() const;

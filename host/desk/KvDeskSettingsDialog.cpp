@@ -82,6 +82,7 @@ void KvDeskSettingsDialog::addMeasuredValues(QFormLayout *form)
 {
     addTitle(form, tr("Measured values"), groupSpacing);
     m_digits = new QSpinBox;
+    m_digits->setLocale(QLocale::c());
     m_digits->setRange(0, maximumDigits);
     m_digits->setSpecialValueText(tr("Automatic"));
     m_digits->setFixedWidth(fieldWidth);

@@ -17,9 +17,10 @@ namespace {
 constexpr int toolIconStyle = 6;
 constexpr QSize iconSize(16, 16);
 
-QLabel *caption(QWidget *parent)
+template <typename Label>
+Label *caption(QWidget *parent)
 {
-    auto *const label = new QLabel(parent);
+    auto *const label = new Label(parent);
     label->setProperty("caption", true);
     // Numbers and units read from left to right in every language.
     label->setLayoutDirection(Qt::LeftToRight);
@@ -33,10 +34,10 @@ KvDeskStatusBar::KvDeskStatusBar(QWidget *parent)
     , m_icon(new QLabel(this))
     , m_category(new QLabel(this))
     , m_message(new KvDeskElidedLabel(this))
-    , m_statistics(caption(this))
-    , m_position(caption(this))
-    , m_image(caption(this))
-    , m_zoom(caption(this))
+    , m_statistics(caption<KvDeskElidedLabel>(this))
+    , m_position(caption<QLabel>(this))
+    , m_image(caption<QLabel>(this))
+    , m_zoom(caption<QLabel>(this))
 {
     setProperty("panel", true);
     setSizeGripEnabled(false);
@@ -49,7 +50,8 @@ KvDeskStatusBar::KvDeskStatusBar(QWidget *parent)
     layout->addWidget(m_category);
     layout->addWidget(m_message, 1);
     addWidget(messageRow, 1);
-    for (QLabel *const label : {m_statistics, m_position, m_image, m_zoom}) {
+    const QList<QLabel *> labels{m_statistics, m_position, m_image, m_zoom};
+    for (QLabel *const label : labels) {
         label->setContentsMargins(8, 0, 8, 0);
         addPermanentWidget(label);
     }
@@ -144,7 +146,7 @@ QString KvDeskStatusBar::statisticsText() const
 void KvDeskStatusBar::slotSetStatistics(const QString &aText, const QString &aDetails)
 {
     m_statistics->setText(aText);
-    m_statistics->setToolTip(aDetails);
+    m_statistics->setDetails(aDetails);
     m_statistics->setVisible(!aText.isEmpty());
 }
 

@@ -45,7 +45,7 @@ private:
     QLabel *m_icon;
     QLabel *m_category;
     KvDeskElidedLabel *m_message;
-    QLabel *m_statistics;
+    KvDeskElidedLabel *m_statistics;
     QLabel *m_position;
     QLabel *m_image;
     QLabel *m_zoom;

@@ -19,11 +19,36 @@ void KvDeskValueDelegate::paint(QPainter *painter, const QStyleOptionViewItem &o
 {
     QStyleOptionViewItem cell = option;
     initStyleOption(&cell, index);
-    const QString text = cell.text;
+    const QString text = index.data().toString();
     cell.text.clear();
     const QStyle *const style = cell.widget ? cell.widget->style() : QApplication::style();
     style->drawControl(QStyle::CE_ItemViewItem, &cell, painter, cell.widget);
     drawTexts(painter, cell, text);
+}
+
+QRect KvDeskValueDelegate::unitRect(const QRect &cell) const
+{
+    QRect unit = cell.adjusted(padding, 0, -padding, 0);
+    unit.setLeft(unit.right() + 1 - m_unitWidth);
+    return unit;
+}
+
+QRect KvDeskValueDelegate::numberRect(const QRect &cell) const
+{
+    QRect number = cell.adjusted(padding, 0, -padding, 0);
+    number.setRight(unitRect(cell).left() - 1 - (m_unitWidth > 0 ? unitSpacing : 0));
+    return number;
+}
+
+bool KvDeskValueDelegate::isCut(const QStyleOptionViewItem &option, const QModelIndex &index) const
+{
+    const QString text = index.data().toString();
+    const QFontMetrics metrics(option.font);
+    const auto isWider = [&metrics](const QString &part, const QRect &place) {
+        return metrics.horizontalAdvance(part) > place.width();
+    };
+    return isWider(KvDeskValueTableModel::numberOf(text), numberRect(option.rect)) ||
+           isWider(KvDeskValueTableModel::unitOf(text), unitRect(option.rect));
 }
 
 void KvDeskValueDelegate::drawTexts(QPainter *painter, const QStyleOptionViewItem &option,
@@ -33,10 +58,8 @@ void KvDeskValueDelegate::drawTexts(QPainter *painter, const QStyleOptionViewIte
     const QColor normal = option.palette.color(isSelected ? QPalette::HighlightedText : QPalette::Text);
     const QColor muted = acss::QtAdvancedStylesheet::getInstance()->color(QStringLiteral("muted"));
     // Number and unit read from left to right in every language.
-    QRect unit = option.rect.adjusted(padding, 0, -padding, 0);
-    unit.setLeft(unit.right() + 1 - m_unitWidth);
-    QRect number = option.rect.adjusted(padding, 0, -padding, 0);
-    number.setRight(unit.left() - 1 - (m_unitWidth > 0 ? unitSpacing : 0));
+    const QRect unit = unitRect(option.rect);
+    const QRect number = numberRect(option.rect);
     const QFontMetrics metrics(option.font);
     painter->save();
     painter->setFont(option.font);

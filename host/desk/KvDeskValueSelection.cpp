@@ -162,7 +162,7 @@ KvDeskSelectionStatistics KvDeskValueSelection::statistics() const
     QHash<QPair<QPair<int, int>, int>, int> places; ///< by type, position and kind
     for (const Value &value : m_values) {
         const int row = m_model->rowOf(value.object, value.position);
-        if (row < 0)
+        if (row < 0 || m_sorted->rowOf(row) < 0)
             continue;
         const KvDeskValueRow shown = m_model->row(row);
         const QPair<QPair<int, int>, int> key({value.object.type, value.position}, shown.kind);

@@ -43,6 +43,7 @@ public:
     };
     /** The selected values, of which some may be filtered out or gone. */
     const QVector<Value> &values() const { return m_values; }
+    /** Of those selected values that the filter lets through. */
     KvDeskSelectionStatistics statistics() const;
 
 signals:

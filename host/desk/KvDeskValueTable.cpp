@@ -2,6 +2,7 @@
 #include "KvDeskValueTable.h"
 
 #include "KvDeskActions.h"
+#include "KvDeskCellDelegate.h"
 #include "KvDeskEmptyState.h"
 #include "KvDeskObjectEditor.h"
 #include "KvDeskPanelHeader.h"
@@ -29,7 +30,10 @@
 namespace {
 
 constexpr int minimumColumnWidth = 48;
+constexpr int minimumObjectWidth = 72; ///< with its number, which tells it from others
+constexpr int largestTextWidth = 200;
 constexpr int headingPadding = 8;
+constexpr int cellPadding = 8; ///< pixels at both ends of a text
 constexpr int largestUnitWidth = 80;
 constexpr int rounding = 2;       ///< pixels by which a text may be wider than its whole pixels
 constexpr int sampledRows = 1000; ///< whose texts are measured at first, spread over the table
@@ -72,6 +76,11 @@ void KvDeskValueTable::createView()
     m_view->setAccessibleName(tr("Measured values"));
     m_view->setModel(m_sorted);
     m_view->setCopiesHeadings(true);
+    m_view->setItemDelegate(new KvDeskCellDelegate(m_view));
+    // Both ends of a name that somebody gave may tell it from others.
+    auto *const names = new KvDeskCellDelegate(m_view);
+    names->setElideMode(Qt::ElideMiddle);
+    m_view->setItemDelegateForColumn(KvDeskValueTableModel::ObjectColumn, names);
     m_delegate = new KvDeskValueDelegate(m_view);
     m_view->setItemDelegateForColumn(KvDeskValueTableModel::ValueColumn, m_delegate);
     m_selection = new KvDeskValueSelection(m_view, m_sorted, m_model, this);
@@ -109,7 +118,8 @@ void KvDeskValueTable::setUpColumns()
     header->setMinimumSectionSize(minimumColumnWidth);
     header->setSectionResizeMode(QHeaderView::Interactive);
     header->setSectionResizeMode(KvDeskValueTableModel::ValueColumn, QHeaderView::Stretch);
-    m_textWidths = {96, 104, 88};
+    m_textWidths.fill(0, KvDeskValueTableModel::ValueColumn);
+    m_userWidths = m_textWidths;
     // At first the rows come in the order of types and objects, which no column has.
     header->setSortIndicator(-1, Qt::AscendingOrder);
     m_view->setSortingEnabled(true);
@@ -216,6 +226,9 @@ void KvDeskValueTable::slotRowsReset()
 {
     m_numberWidth = 0;
     m_unitWidth = 0;
+    // Columns do not jump while a filter is typed.
+    if (!m_sorted->isFiltered())
+        m_textWidths.fill(0);
     const int step = qMax(1, m_sorted->rowCount() / sampledRows);
     for (int row = 0; row < m_sorted->rowCount(); row += step)
         measureRow(row);
@@ -238,6 +251,10 @@ void KvDeskValueTable::measureRow(int row)
     const QString unit = KvDeskValueTableModel::unitOf(text);
     if (!unit.isEmpty())
         m_unitWidth = qMax(m_unitWidth, metrics.horizontalAdvance(unit) + rounding);
+    for (int column = 0; column < m_textWidths.size(); ++column) {
+        const QString cell = m_model->text(m_sorted->sourceRow(row), column);
+        m_textWidths[column] = qMax(m_textWidths.at(column), metrics.horizontalAdvance(cell) + rounding);
+    }
 }
 
 // The texts of all rows would take long to make: those that are seen decide.
@@ -259,21 +276,36 @@ void KvDeskValueTable::slotMeasureTexts()
 void KvDeskValueTable::makeRoomForValues()
 {
     const int room = m_view->viewport()->width() - m_valueWidth;
-    const int wanted = std::accumulate(m_textWidths.begin(), m_textWidths.end(), 0);
+    QVector<int> widths;
     QVector<int> least;
-    for (int column = 0; column < m_textWidths.size(); ++column)
-        least.append(qMin(headingWidth(column), m_textWidths.at(column)));
+    for (int column = 0; column < m_textWidths.size(); ++column) {
+        widths.append(wantedWidth(column));
+        const int number = column == KvDeskValueTableModel::ObjectColumn ? minimumObjectWidth : 0;
+        least.append(qMin(qMax(headingWidth(column), number), widths.last()));
+    }
+    const int wanted = std::accumulate(widths.begin(), widths.end(), 0);
+    if (std::accumulate(least.begin(), least.end(), 0) > room) {
+        least.fill(minimumColumnWidth);
+        least[KvDeskValueTableModel::ObjectColumn] = minimumObjectWidth;
+    }
     if (std::accumulate(least.begin(), least.end(), 0) > room)
         least.fill(minimumColumnWidth);
     const int spare = room - std::accumulate(least.begin(), least.end(), 0);
     const int wish = wanted - std::accumulate(least.begin(), least.end(), 0);
     const QScopedValueRollback<bool> fitting(m_isFitting, true);
     for (int column = 0; column < m_textWidths.size(); ++column) {
-        const int width = m_textWidths.at(column);
+        const int width = widths.at(column);
         const int shortened =
             least.at(column) + (wish > 0 ? qMax(0, width - least.at(column)) * qMax(0, spare) / wish : 0);
         m_view->setColumnWidth(column, wanted <= room ? width : shortened);
     }
+}
+
+int KvDeskValueTable::wantedWidth(int column) const
+{
+    if (m_userWidths.at(column) > 0)
+        return m_userWidths.at(column);
+    return qMax(headingWidth(column), qMin(m_textWidths.at(column), largestTextWidth) + 2 * cellPadding);
 }
 
 int KvDeskValueTable::headingWidth(int column) const
@@ -287,7 +319,7 @@ void KvDeskValueTable::slotColumnResized(int aColumn, int aOldWidth, int aNewWid
 {
     Q_UNUSED(aOldWidth)
     if (!m_isFitting && aColumn < m_textWidths.size())
-        m_textWidths[aColumn] = aNewWidth;
+        m_userWidths[aColumn] = aNewWidth;
 }
 
 void KvDeskValueTable::slotUpdateStatistics()

@@ -70,6 +70,7 @@ private:
     void measureRow(int row);
     void makeRoomForValues();
     int headingWidth(int column) const;
+    int wantedWidth(int column) const;
     bool filterKeyPressed(int key);
 
     KvDeskValueTableModel *m_model;
@@ -86,6 +87,7 @@ private:
     int m_numberWidth = 0;     ///< pixels of the longest number seen so far
     int m_unitWidth = 0;       ///< pixels of the longest unit seen so far
     int m_valueWidth = 0;      ///< pixels that both take
-    QVector<int> m_textWidths; ///< of the columns before the values, as the user wants them
+    QVector<int> m_textWidths; ///< pixels of the longest text of each column before the values
+    QVector<int> m_userWidths; ///< of these columns, as the user wants them; 0 for as its texts do
     bool m_isFitting = false;  ///< columns change because of the program
 };

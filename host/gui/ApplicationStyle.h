@@ -7,7 +7,7 @@ namespace acss {
 
 /**
  * The widget style below the application's style sheet: Fusion, with the application's own icons in message
- * boxes, in the colours of the theme.
+ * boxes and in Qt's file dialogs, in the colours of the theme.
  *
  * Letters of shortcuts are underlined, but not where writing runs from right to left: Qt draws an underlined
  * letter on its own, which tears apart the joined letters of Arabic. The keys work all the same.

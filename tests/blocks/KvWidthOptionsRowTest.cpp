@@ -14,6 +14,7 @@ private slots:
     void goesFromOneToHundredPercent();
     void settingEmitsNothing();
     void showsEveryWidth();
+    void isWrittenAsInReports();
     void outOfRangeIsClamped_data();
     void outOfRangeIsClamped();
     void typingEmits();
@@ -48,6 +49,16 @@ void KvWidthOptionsRowTest::showsEveryWidth()
         row.setWidthPercent(percent);
         QCOMPARE(row.widthPercent(), percent);
     }
+}
+
+void KvWidthOptionsRowTest::isWrittenAsInReports()
+{
+    QLocale::setDefault(QLocale(QLocale::Arabic, QLocale::Egypt));
+    KvWidthOptionsRow row;
+    row.setWidthPercent(42);
+    const QString text = row.findChild<QSpinBox *>()->text();
+    QLocale::setDefault(QLocale::c());
+    QCOMPARE(text, QStringLiteral("42%"));
 }
 
 void KvWidthOptionsRowTest::outOfRangeIsClamped_data()

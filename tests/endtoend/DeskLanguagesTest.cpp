@@ -87,6 +87,13 @@ void DeskLanguagesTest::whatLiesOnTheImageHasRoom()
     const auto *const bar = view->viewport()->findChild<KvDeskCounterBar *>();
     QVERIFY(bar && bar->isVisible());
     m_walk.lookAtSizes(m_walk.window(), QStringLiteral("counting"));
+    // What the clicks are for is said in full.
+    bool isLabelled = false;
+    for (const QLabel *const label : bar->findChildren<QLabel *>()) {
+        isLabelled = isLabelled || (label->isVisible() && label->text() == bar->classes()->accessibleName() &&
+                                    label->width() >= label->sizeHint().width());
+    }
+    QVERIFY(isLabelled);
     QVERIFY(view->viewport()->rect().contains(bar->geometry()));
 
     m_walk.action(KvDeskActions::SelectTool)->trigger();

@@ -71,6 +71,11 @@ public:
         // Layouts take a few rounds of events after a change.
         const bool isSettled =
             QTest::qWaitFor([widget]() { return TextFit::faults(widget).isEmpty(); }, kSettling);
+        for (const QAbstractSpinBox *field : widget->findChildren<QAbstractSpinBox *>()) {
+            // Numbers are written alike everywhere.
+            if (field->locale().language() != QLocale::C)
+                m_faults.append(name + QStringLiteral(": a number in another form ") + field->text());
+        }
         if (isSettled)
             return;
         for (const QString &fault : TextFit::faults(widget))

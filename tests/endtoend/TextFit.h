@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "KvDeskCellDelegate.h"
+
 #include <QAbstractButton>
 #include <QAbstractScrollArea>
 #include <QAbstractSpinBox>
@@ -18,6 +20,7 @@
 #include <QStyleOptionButton>
 #include <QStyleOptionComboBox>
 #include <QTabBar>
+#include <QTableView>
 #include <QToolButton>
 
 /** Looks for texts of a window that have too little room where they stand. */
@@ -61,6 +64,8 @@ private:
             checkEdit(edit);
         else if (auto *bar = qobject_cast<QMenuBar *>(widget))
             checkBar(bar);
+        else if (auto *table = qobject_cast<QTableView *>(widget))
+            checkTable(table);
     }
 
     /** The visible widgets of a layout and those within it; other layouts may put widgets on one another. */
@@ -177,6 +182,29 @@ private:
         for (QAction *action : bar->actions()) {
             if (!bar->rect().contains(bar->actionGeometry(action)))
                 fault(bar, action->text(), QStringLiteral("is outside of the menu bar"));
+        }
+    }
+
+    // Texts of cells elide by themselves, but two of a column must not look alike then.
+    void checkTable(QTableView *table)
+    {
+        for (int column = 0; table->model() && column < table->model()->columnCount(); ++column) {
+            QHash<QString, QString> shown;
+            for (int row = 0; row < table->model()->rowCount() && table->rowAt(0) >= 0; ++row) {
+                const QModelIndex index = table->model()->index(row, column);
+                const auto *delegate = qobject_cast<const KvDeskCellDelegate *>(table->itemDelegate(index));
+                if (!delegate || !table->viewport()->rect().intersects(table->visualRect(index)))
+                    continue;
+                QStyleOptionViewItem cell;
+                cell.initFrom(table);
+                cell.widget = table;
+                cell.rect = table->visualRect(index);
+                const QString text = index.data().toString();
+                const QString other = shown.value(delegate->shownText(cell, index), text);
+                if (other != text)
+                    fault(table, text, QStringLiteral("looks like ") + other);
+                shown.insert(delegate->shownText(cell, index), text);
+            }
         }
     }
 

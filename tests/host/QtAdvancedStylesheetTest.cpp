@@ -89,6 +89,9 @@ private slots:
     void textsAreReadable();
     void messageIconsAreOfTheTheme_data();
     void messageIconsAreOfTheTheme();
+    void fileDialogIconsAreOfTheTheme_data();
+    void fileDialogIconsAreOfTheTheme();
+    void backPointsWhereReadingComesFrom();
     void messageBoxesFollowTheTheme();
     void charactersHaveTheLanguagesForms_data();
     void charactersHaveTheLanguagesForms();
@@ -270,6 +273,80 @@ void QtAdvancedStylesheetTest::messageIconsAreOfTheTheme()
         QVERIFY2(contrast(service->color(token), service->color(QStringLiteral("window"))) >= 3.0,
                  qPrintable(theme));
     }
+}
+
+void QtAdvancedStylesheetTest::fileDialogIconsAreOfTheTheme_data()
+{
+    QTest::addColumn<int>("icon");
+    const QMetaEnum icons = QMetaEnum::fromType<QStyle::StandardPixmap>();
+    for (const char *name : {"SP_ArrowBack",
+                             "SP_ArrowForward",
+                             "SP_FileDialogBack",
+                             "SP_FileDialogToParent",
+                             "SP_FileDialogNewFolder",
+                             "SP_FileDialogListView",
+                             "SP_FileDialogDetailedView",
+                             "SP_DirIcon",
+                             "SP_DirOpenIcon",
+                             "SP_DirClosedIcon",
+                             "SP_DirLinkIcon",
+                             "SP_DirHomeIcon",
+                             "SP_FileIcon",
+                             "SP_FileLinkIcon",
+                             "SP_ComputerIcon",
+                             "SP_DesktopIcon",
+                             "SP_DriveHDIcon",
+                             "SP_DriveFDIcon",
+                             "SP_DriveNetIcon",
+                             "SP_DriveCDIcon",
+                             "SP_DriveDVDIcon",
+                             "SP_TrashIcon"})
+        QTest::newRow(name) << icons.keyToValue(name);
+}
+
+/// Strokes of one colour, as the icons of the application.
+void QtAdvancedStylesheetTest::fileDialogIconsAreOfTheTheme()
+{
+    QFETCH(int, icon);
+    auto *const service = QtAdvancedStylesheet::getInstance();
+    for (const QString &theme : service->themes()) {
+        service->setCurrentTheme(theme);
+        service->applyTo(qApp);
+        const QColor text = service->color(QStringLiteral("text"));
+        const QImage image = QApplication::style()
+                                 ->standardIcon(static_cast<QStyle::StandardPixmap>(icon))
+                                 .pixmap(48, 48)
+                                 .toImage();
+        QVERIFY(!image.isNull());
+        int strokes = 0;
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x) {
+                if (image.pixelColor(x, y).alpha() != 255)
+                    continue;
+                QCOMPARE(image.pixelColor(x, y), text);
+                ++strokes;
+            }
+        }
+        QVERIFY2(strokes > 30 && strokes < image.width() * image.height() / 2,
+                 qPrintable(QString::number(strokes)));
+    }
+}
+
+void QtAdvancedStylesheetTest::backPointsWhereReadingComesFrom()
+{
+    QtAdvancedStylesheet::getInstance()->applyTo(qApp);
+    const auto image = [](QStyle::StandardPixmap icon, Qt::LayoutDirection direction) {
+        QWidget widget;
+        widget.setLayoutDirection(direction);
+        return QApplication::style()->standardIcon(icon, nullptr, &widget).pixmap(24, 24).toImage();
+    };
+    const QImage left = image(QStyle::SP_ArrowBack, Qt::LeftToRight);
+    const QImage right = image(QStyle::SP_ArrowForward, Qt::LeftToRight);
+    QVERIFY(left != right);
+    QCOMPARE(image(QStyle::SP_ArrowBack, Qt::RightToLeft), right);
+    QCOMPARE(image(QStyle::SP_FileDialogBack, Qt::RightToLeft), right);
+    QCOMPARE(image(QStyle::SP_ArrowForward, Qt::RightToLeft), left);
+    QCOMPARE(image(QStyle::SP_DirIcon, Qt::RightToLeft), image(QStyle::SP_DirIcon, Qt::LeftToRight));
 }
 
 void QtAdvancedStylesheetTest::messageBoxesFollowTheTheme()

@@ -17,6 +17,8 @@ KvWidthOptionsRow::KvWidthOptionsRow(QWidget *parent)
     label->setMinimumWidth(KvBaseOptionsWidget::LabelWidth);
     label->setAlignment(Qt::AlignCenter);
     m_spinBox->setFixedWidth(KvBaseOptionsWidget::FieldWidth);
+    // As all numbers of reports, whatever the language.
+    m_spinBox->setLocale(QLocale::c());
     m_spinBox->setRange(1, 100);
     m_spinBox->setSuffix(QStringLiteral("%"));
     m_spinBox->setButtonSymbols(QAbstractSpinBox::NoButtons);

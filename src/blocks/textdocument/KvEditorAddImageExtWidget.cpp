@@ -14,6 +14,8 @@ KvEditorAddImageExtWidget::KvEditorAddImageExtWidget(QWidget *parent)
     , m_ui(std::make_unique<Ui::KvEditorAddImageExtWidgetUi>())
 {
     m_ui->setupUi(this);
+    // As all numbers of reports, whatever the language.
+    m_ui->widthSpinBox->setLocale(QLocale::c());
     // The row itself has no spacing.
     m_ui->label->setContentsMargins(0, 0, kSpacing, 0);
     m_ui->label_2->setContentsMargins(kGroupSpacing, 0, kSpacing, 0);

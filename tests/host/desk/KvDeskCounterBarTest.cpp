@@ -238,23 +238,50 @@ void KvDeskCounterBarTest::staysInTheMiddle()
 
 void KvDeskCounterBarTest::fitsANarrowView_data()
 {
-    QTest::addColumn<int>("width");
-    QTest::newRow("wide") << 900;
-    QTest::newRow("without the hint") << 480;
-    QTest::newRow("with a narrow list") << 340;
+    QTest::addColumn<int>("room"); ///< of the view, besides what all parts take
+    QTest::addColumn<bool>("hasHint");
+    QTest::addColumn<bool>("hasLabel");
+    QTest::newRow("wide") << 300 << true << true;
+    QTest::newRow("just wide enough") << 0 << true << true;
+    QTest::newRow("a pixel too narrow") << -1 << false << true;
+    QTest::newRow("with a narrow list") << -200 << false << true;
+    QTest::newRow("without the label") << -1 << false << false;
 }
 
 void KvDeskCounterBarTest::fitsANarrowView()
 {
-    QFETCH(int, width);
-    m_desk->view.resize(width, 240);
+    QFETCH(int, room);
+    QFETCH(bool, hasHint);
+    QFETCH(bool, hasLabel);
+    const auto labelOf = [this](const QString &text) {
+        for (QLabel *const label : m_bar->findChildren<QLabel *>()) {
+            if (label->text() == text)
+                return label;
+        }
+        return static_cast<QLabel *>(nullptr);
+    };
+    const QLabel *const label = labelOf(QStringLiteral("Clicks count for"));
+    const QLabel *const hint = labelOf(QStringLiteral("A right click takes a place away"));
+    QVERIFY(label && hint);
+    const int all = label->sizeHint().width() + 240 + 32 + hint->sizeHint().width() + 5 * 8;
+    const int withoutNames = label->sizeHint().width() + 96 + 32 + 4 * 8;
+    m_desk->view.resize(hasLabel ? all + room : withoutNames + room, 240);
     flushBar();
     QCoreApplication::processEvents();
+    QCOMPARE(hint->isVisible(), hasHint);
+    QCOMPARE(label->isVisible(), hasLabel);
+    QVERIFY(!hasLabel || label->width() >= label->sizeHint().width());
+    QVERIFY(!hasHint || hint->width() >= hint->sizeHint().width());
+    const QString toolTip = m_bar->classes()->toolTip();
+    QVERIFY(toolTip.contains(QStringLiteral("The counter that gets the clicks")));
+    QCOMPARE(toolTip.contains(hint->text()), !hasHint);
+    QCOMPARE(toolTip.contains(label->text()), !hasLabel);
+    QCOMPARE(m_bar->classes()->accessibleName(), label->text());
     QVERIFY(m_desk->view.viewport()->rect().contains(m_bar->geometry()));
     QVERIFY(m_bar->rect().contains(m_bar->newClassButton()->geometry()));
     QVERIFY(m_bar->classes()->geometry().right() < m_bar->newClassButton()->x());
     QVERIFY(m_bar->classes()->width() >= 96);
-    QVERIFY(width < 900 || m_bar->classes()->width() == 240);
+    QVERIFY(!hasHint || m_bar->classes()->width() == 240);
 }
 
 STATREPORT_TEST_MAIN(KvDeskCounterBarTest)

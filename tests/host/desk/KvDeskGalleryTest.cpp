@@ -81,6 +81,8 @@ void KvDeskGalleryTest::initTestCase()
 void KvDeskGalleryTest::init()
 {
     StatReportTest::init();
+    // Numbers are written as in every language.
+    QLocale::setDefault(QLocale(QLocale::Arabic, QLocale::Egypt));
     KvDeskResources::ensure();
     ZtAppSettings::getInstance()->setStoragePath(QString());
     ZtStatusLog::getInstance()->clear();
@@ -94,6 +96,7 @@ void KvDeskGalleryTest::init()
 void KvDeskGalleryTest::cleanup()
 {
     m_gallery.reset();
+    QLocale::setDefault(QLocale::c());
     StatReportTest::cleanup();
 }
 

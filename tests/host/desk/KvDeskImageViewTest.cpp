@@ -14,6 +14,10 @@
 #include "measuring/ZtKernelImage.h"
 #include "measuring/ZtMeasuringDocument.h"
 
+#include <QLabel>
+
+Q_DECLARE_METATYPE(ZtCalibration)
+
 namespace {
 
 /// A camera whose picture the test sets.
@@ -79,6 +83,8 @@ private slots:
     void selectionIsBroughtIntoView();
     void pointerIsReported();
     void rulersTakeRoom();
+    void rulersHaveOneUnit_data();
+    void rulersHaveOneUnit();
     void isNeverMirrored();
     void removedImageLeavesNothing();
 
@@ -413,6 +419,40 @@ void KvDeskImageViewTest::rulersTakeRoom()
     m_view->slotSetRulersVisible(false);
     QCOMPARE(m_view->viewport()->size(), QSize(640, 480));
     QVERIFY(!rulers.first()->isVisible());
+}
+
+// Views and pixels that are not square, where one direction alone would read in another unit.
+void KvDeskImageViewTest::rulersHaveOneUnit_data()
+{
+    QTest::addColumn<QSize>("view");
+    QTest::addColumn<ZtCalibration>("calibration");
+    QTest::addColumn<QString>("unit");
+    const QString micrometres = QStringLiteral("\u03BCm");
+    QTest::newRow("small") << QSize(640, 480) << ZtCalibration(0.5) << micrometres;
+    QTest::newRow("wide") << QSize(900, 240) << ZtCalibration(2.35) << QStringLiteral("mm");
+    QTest::newRow("high") << QSize(240, 900) << ZtCalibration(2.35) << QStringLiteral("mm");
+    QTest::newRow("high pixels") << QSize(640, 480) << ZtCalibration(0.5, 4.0) << QStringLiteral("mm");
+    QTest::newRow("broad pixels") << QSize(640, 480) << ZtCalibration(4.0, 0.5) << QStringLiteral("mm");
+    QTest::newRow("2 by 4") << QSize(440, 440) << ZtCalibration(2.0, 4.0) << QStringLiteral("mm");
+}
+
+void KvDeskImageViewTest::rulersHaveOneUnit()
+{
+    QFETCH(QSize, view);
+    QFETCH(ZtCalibration, calibration);
+    showImage();
+    m_view->resize(view);
+    m_view->slotSetRulersVisible(true);
+    m_document->setCalibration(calibration);
+    m_view->slotZoomActual();
+    const QList<KvDeskRuler *> rulers = m_view->findChildren<KvDeskRuler *>();
+    QCOMPARE(rulers.size(), 2);
+    for (const KvDeskRuler *const ruler : rulers)
+        QTEST(ruler->unitText(), "unit");
+    bool isNamed = false;
+    for (const QLabel *const label : m_view->findChildren<QLabel *>())
+        isNamed = isNamed || label->text() == rulers.first()->unitText();
+    QVERIFY(isNamed);
 }
 
 void KvDeskImageViewTest::isNeverMirrored()

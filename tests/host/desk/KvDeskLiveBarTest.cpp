@@ -56,6 +56,8 @@ private:
 void KvDeskLiveBarTest::init()
 {
     StatReportTest::init();
+    // Numbers are written as in every language.
+    QLocale::setDefault(QLocale(QLocale::Arabic, QLocale::Egypt));
     KvDeskResources::ensure();
     ZtStatusLog::getInstance()->clear();
     m_actions = std::make_unique<KvDeskActions>();
@@ -71,6 +73,7 @@ void KvDeskLiveBarTest::cleanup()
 {
     m_window.reset();
     m_document.reset();
+    QLocale::setDefault(QLocale::c());
     StatReportTest::cleanup();
 }
 

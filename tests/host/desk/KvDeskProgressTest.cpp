@@ -201,15 +201,24 @@ void KvDeskProgressTest::whatCannotBeCancelledIsWaitedFor()
         progress->commit();
         inner(progress);
     };
+    const QString usual = m_progress->cancelButton()->toolTip();
     bool isEnabled = true;
+    QString reason;
     whenShown([&]() {
         m_progress->cancelButton()->click();
         isEnabled = m_progress->cancelButton()->isEnabled();
+        reason = m_progress->cancelButton()->toolTip();
         work.mayEnd->release();
     });
     QCOMPARE(m_progress->run(QStringLiteral("Long"), committing), KvDeskProgress::Done);
     QVERIFY(!isEnabled);
+    QCOMPARE(reason, usual + QStringLiteral("\nThis can no longer be cancelled"));
     QCOMPARE(work.done->load(), 1);
+    // The next work can be cancelled again.
+    QCOMPARE(m_progress->run(QStringLiteral("Long"), [](ZtProgress *) { QTest::qSleep(200); }),
+             KvDeskProgress::Done);
+    QVERIFY(m_progress->cancelButton()->isEnabled());
+    QCOMPARE(m_progress->cancelButton()->toolTip(), usual);
 }
 
 void KvDeskProgressTest::inputIsBlocked()

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskRuler.h"
 
+#include "measuring/ZtUnit.h"
 #include "support/StatReportTest.h"
 
 #include <algorithm>
@@ -66,8 +67,7 @@ void KvDeskRulerTest::units_data()
     QTest::addColumn<double>("pixelSize");
     QTest::addColumn<QString>("unit");
     QTest::newRow("none") << 0.0 << QStringLiteral("px");
-    QTest::newRow("micrometres") << 0.5 << QStringLiteral("\u03BCm");
-    QTest::newRow("millimetres") << 10.0 << QStringLiteral("mm");
+    QTest::newRow("calibrated") << 0.5 << QStringLiteral("mm");
 }
 
 void KvDeskRulerTest::units()
@@ -75,7 +75,8 @@ void KvDeskRulerTest::units()
     QFETCH(double, pixelSize);
     KvDeskRuler ruler(Qt::Horizontal);
     ruler.resize(800, KvDeskRuler::thickness);
-    ruler.setScale(0.0, 1.0, pixelSize);
+    ruler.setScale(0.0, 1.0, pixelSize, ZtUnit::parse(QStringLiteral("mm")));
+    QCOMPARE(ruler.extent(2.0, pixelSize), 400.0 * pixelSize);
     QTEST(ruler.unitText(), "unit");
     QCOMPARE(ruler.toolTip(), QStringLiteral("Ruler in %1").arg(ruler.unitText()));
 }
@@ -86,7 +87,7 @@ void KvDeskRulerTest::isDrawn()
         KvDeskRuler ruler(orientation);
         const bool isLevel = orientation == Qt::Horizontal;
         ruler.resize(isLevel ? QSize(300, KvDeskRuler::thickness) : QSize(KvDeskRuler::thickness, 300));
-        ruler.setScale(50.0, 1.0, 0.0);
+        ruler.setScale(50.0, 1.0, 0.0, ZtUnit());
         const auto grab = [&ruler, isLevel]() {
             const QImage image = ruler.grab().toImage();
             return isLevel ? image : image.transformed(QTransform().rotate(90).scale(1, -1));
@@ -146,9 +147,9 @@ void KvDeskRulerTest::topmostLabelIsWhole()
         }
         return count;
     };
-    ruler.setScale(1.0, 1.0, 0.0);
+    ruler.setScale(1.0, 1.0, 0.0, ZtUnit());
     QVERIFY(textColumns(2, 14) > 0);
-    ruler.setScale(40.0, 1.0, 0.0);
+    ruler.setScale(40.0, 1.0, 0.0, ZtUnit());
     QVERIFY(textColumns(26, 38) > 0);
 }
 

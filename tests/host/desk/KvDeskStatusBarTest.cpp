@@ -113,6 +113,13 @@ void KvDeskStatusBarTest::statistics()
     QVERIFY(shown);
     QVERIFY(shown->isVisible());
     QCOMPARE(shown->toolTip(), QStringLiteral("Details"));
+    // A long text is cut at its end: it makes no window wider.
+    const int least = bar.minimumSizeHint().width();
+    bar.resize(500, bar.height());
+    bar.slotSetStatistics(QStringLiteral("n = 2, ").repeated(50), QStringLiteral("More details"));
+    QCOMPARE(bar.minimumSizeHint().width(), least);
+    QTRY_VERIFY(shown->width() < shown->sizeHint().width() && shown->geometry().right() < 500);
+    QCOMPARE(shown->toolTip(), QStringLiteral("More details"));
     bar.slotSetStatistics(QString(), QString());
     QVERIFY(!shown->isVisible());
 }

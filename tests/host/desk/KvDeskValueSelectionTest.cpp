@@ -38,6 +38,7 @@ private slots:
     void selectionStaysAmongManyObjects();
     void statisticsOfObjects();
     void statisticsOfRows();
+    void statisticsLeaveOutFilteredRows();
     void statisticsFollowChanges();
     void hiddenValuesAreLeftOut();
 
@@ -215,7 +216,8 @@ void KvDeskValueSelectionTest::statisticsOfObjects()
     QCOMPARE(statistics.count(), 4);
     QCOMPARE(statistics.numbers().count(), 2);
     QVERIFY(!spy.isEmpty());
-    QVERIFY(spy.last().at(0).toString().startsWith(QStringLiteral("Diameter: n = 2, mean ")));
+    QVERIFY(
+        spy.last().at(0).toString().startsWith(QStringLiteral("Selected values: 4; Diameter: n = 2, mean ")));
     QCOMPARE(spy.last().at(1).toString(), statistics.details());
     m_values->selection.clear();
     QCOMPARE(spy.last().at(0).toString(), QString());
@@ -230,6 +232,26 @@ void KvDeskValueSelectionTest::statisticsOfRows()
     QVERIFY(!statistics.isMixed());
     QCOMPARE(statistics.numbers().count(), 15);
     QCOMPARE(m_values->selection.objects().size(), 15);
+}
+
+// Objects are selected with all of their values; those that the filter hides do not count until it shows
+// them.
+void KvDeskValueSelectionTest::statisticsLeaveOutFilteredRows()
+{
+    const auto filter = [this](const QString &text) {
+        m_values->table.filterField()->setText(text);
+        QTest::keyClick(m_values->table.filterField(), Qt::Key_Return);
+    };
+    QSignalSpy spy(&m_values->table, SIGNAL(signalStatisticsChanged(QString,QString)));
+    m_values->selection.set({{ZtDrawnType::Circle, 1}, {ZtDrawnType::Circle, 2}, rectangle1}, rectangle1);
+    QCOMPARE(m_values->table.selection()->statistics().count(), 7);
+    filter(QStringLiteral("circle area"));
+    QCOMPARE(m_values->table.selection()->statistics().count(), 2);
+    QVERIFY(spy.last().first().toString().startsWith(QStringLiteral("n = 2, mean ")));
+    filter(QStringLiteral("line"));
+    QCOMPARE(spy.last().first().toString(), QString());
+    filter(QString());
+    QVERIFY(spy.last().first().toString().startsWith(QStringLiteral("Selected values: 7; ")));
 }
 
 void KvDeskValueSelectionTest::statisticsFollowChanges()

@@ -28,6 +28,7 @@ private slots:
     void sortsByHeader();
     void numbersAreNeverCut();
     void columnsKeepTheirWidths();
+    void columnsFollowTheirTexts();
 
 private:
     void open() { QVERIFY(m_values->openDemo()); }
@@ -108,6 +109,29 @@ void KvDeskValueTableTest::columnsKeepTheirWidths()
     QTRY_VERIFY(m_table->view()->columnWidth(0) < 120);
     m_table->resize(700, 500);
     QTRY_COMPARE(m_table->view()->columnWidth(0), 120);
+}
+
+// Of a long name at least as much is seen as of a short one before.
+void KvDeskValueTableTest::columnsFollowTheirTexts()
+{
+    open();
+    m_table->resize(900, 500);
+    const int column = KvDeskValueTableModel::ObjectColumn;
+    const QFontMetrics metrics(m_table->view()->font());
+    const QString name = QStringLiteral("Rectangle of the third sample 1");
+    QTRY_VERIFY(m_table->view()->columnWidth(column) < metrics.horizontalAdvance(name));
+    m_values->editor.rename({ZtDrawnType::Rectangle, 1}, name);
+    m_table->model()->flush();
+    QTRY_VERIFY(m_table->view()->columnWidth(column) > metrics.horizontalAdvance(name));
+    // The user's own width stays.
+    m_table->view()->setColumnWidth(column, 90);
+    m_values->editor.rename({ZtDrawnType::Rectangle, 2}, name + name);
+    m_table->model()->flush();
+    QCoreApplication::processEvents();
+    QCOMPARE(m_table->view()->columnWidth(column), 90);
+    // In a narrow table, too, the number of an object is seen.
+    m_table->resize(330, 500);
+    QTRY_VERIFY(m_table->view()->columnWidth(column) >= 72);
 }
 
 void KvDeskValueTableTest::filtersWhileTyping()
