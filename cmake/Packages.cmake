@@ -38,7 +38,10 @@ set(CPACK_DEBIAN_DESK_PACKAGE_SECTION science)
 set(CPACK_DEBIAN_DESK_PACKAGE_DEPENDS "libstatreporthost${PROJECT_VERSION_MAJOR} ${exact}, libqt5svg5, qt5-image-formats-plugins")
 # Letters of every language that the programs have, on the screen and in reports.
 set(fonts "fonts-open-sans, fonts-noto-core, fonts-noto-cjk")
-set(CPACK_DEBIAN_DESK_PACKAGE_RECOMMENDS "statreport-plugin ${exact}, ${fonts}, qttranslations5-l10n")
+# What makes its files and its entry in the menu known to the desktop, and opens folders and reports.
+set(desktop "desktop-file-utils, hicolor-icon-theme, shared-mime-info, xdg-utils")
+set(CPACK_DEBIAN_DESK_PACKAGE_RECOMMENDS
+  "statreport-plugin ${exact}, ${fonts}, qttranslations5-l10n, ${desktop}")
 set(CPACK_COMPONENT_DESK_DESCRIPTION "measure objects on microscope and camera images
 Opens an image or a camera, is calibrated, and measures lengths, angles,
 areas, diameters and counts. With the report plug-in its values go into PDF
