@@ -72,10 +72,9 @@ QString optionsWord()
 
 QString helpOf(const QCommandLineParser &parser, const QString &command)
 {
-    // The options come behind the command.
+    // The command stands in the usage only, before the options: it is no argument that needs to be explained.
     QString text = parser.helpText();
-    const QString blank = QStringLiteral(" ");
-    return text.replace(blank + optionsWord() + blank + command, blank + command + blank + optionsWord());
+    return text.insert(text.indexOf(optionsWord()), command + QLatin1Char(' '));
 }
 
 /** A line of the overview: what to write, and behind it or on the next line, what it does. */
@@ -333,7 +332,6 @@ KvCliParseResult KvCliParser::parse(const QStringList &arguments)
         return result;
     }
     QCommandLineParser parser;
-    parser.addPositionalArgument(first, QString(), first);
     addCommonOptions(parser);
     addCommandOptions(parser, result.arguments.command);
     if (!parser.parse(arguments)) {

@@ -56,7 +56,7 @@ int runApplication(int argc, char **argv, const QString &language, const KvCliAr
     acss::QtAdvancedStylesheet::substituteFonts();
     ZtAppSettings::getInstance()->setStoragePath(QString());
     ZtAppSettings::setProgramInfo(QStringLiteral("StatReport"), QStringLiteral(STATREPORT_VERSION),
-                                  QStringLiteral("The StatReport authors"));
+                                  QStringLiteral(STATREPORT_VENDOR));
     const int exitCode = runCommand(arguments, output);
     // Pieces of tables are deleted later; without an event loop nothing else would do it.
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);

@@ -74,10 +74,12 @@ foreach(program ${STATREPORT_PROGRAMS})
   statreport_install_compressed(desk docs/man/${program}.1 ${CMAKE_INSTALL_MANDIR}/man1 ${program}.1)
 endforeach()
 install(DIRECTORY examples/sessions examples/tables examples/pictures DESTINATION ${STATREPORT_EXAMPLES_DIR} COMPONENT desk)
-# The guide that the Desk shows, what it links to, and the pictures that it names.
+# The guide that the Desk shows, in every language, what it links to, and the pictures that it names. Not below share/doc,
+# which a system may leave out.
 set_property(DIRECTORY ${PROJECT_SOURCE_DIR} APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS docs/user-guide.md)
-set(guide_dir ${CMAKE_INSTALL_DATADIR}/doc/measuringdesk)
-install(FILES docs/user-guide.md docs/tables.md docs/rtp-format.md DESTINATION ${guide_dir} COMPONENT desk)
+set(guide_dir ${CMAKE_INSTALL_DATADIR}/measuringdesk/guide)
+file(GLOB guides CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/docs/user-guide*.md)
+install(FILES ${guides} docs/tables.md docs/rtp-format.md DESTINATION ${guide_dir} COMPONENT desk)
 file(STRINGS docs/user-guide.md guide_pictures REGEX "^!\\[")
 list(TRANSFORM guide_pictures REPLACE "^!\\[.*\\]\\((.*)\\)$" "docs/\\1")
 install(FILES ${guide_pictures} DESTINATION ${guide_dir}/pictures COMPONENT desk)

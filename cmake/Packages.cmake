@@ -3,7 +3,7 @@
 # system installs them (prefix /usr, libraries in the folder of the architecture).
 set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME statreport)
-set(CPACK_PACKAGE_VENDOR "StatReport")
+set(CPACK_PACKAGE_VENDOR "${STATREPORT_VENDOR}")
 set(CPACK_PACKAGE_CONTACT "The StatReport developers <developers@statreport.invalid>")
 # Each package has a first line of its own; this one would stand above it.
 set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "")
@@ -36,8 +36,12 @@ object types and measured objects, frames, signals, settings, tools, themes.")
 set(CPACK_DEBIAN_DESK_PACKAGE_NAME measuringdesk)
 set(CPACK_DEBIAN_DESK_PACKAGE_SECTION science)
 set(CPACK_DEBIAN_DESK_PACKAGE_DEPENDS "libstatreporthost${PROJECT_VERSION_MAJOR} ${exact}, libqt5svg5, qt5-image-formats-plugins")
+# Letters of every language that the programs have, on the screen and in reports.
+set(fonts "fonts-open-sans, fonts-noto-core, fonts-noto-cjk")
+# What makes its files and its entry in the menu known to the desktop, and opens folders and reports.
+set(desktop "desktop-file-utils, hicolor-icon-theme, shared-mime-info, xdg-utils")
 set(CPACK_DEBIAN_DESK_PACKAGE_RECOMMENDS
-  "statreport-plugin ${exact}, fonts-open-sans, fonts-noto-core, fonts-noto-cjk, qttranslations5-l10n")
+  "statreport-plugin ${exact}, ${fonts}, qttranslations5-l10n, ${desktop}")
 set(CPACK_COMPONENT_DESK_DESCRIPTION "measure objects on microscope and camera images
 Opens an image or a camera, is calibrated, and measures lengths, angles,
 areas, diameters and counts. With the report plug-in its values go into PDF
@@ -47,6 +51,7 @@ The command-line program statreport makes the same reports without a display.")
 set(CPACK_DEBIAN_PLUGIN_PACKAGE_NAME statreport-plugin)
 set(CPACK_DEBIAN_PLUGIN_PACKAGE_SECTION science)
 set(CPACK_DEBIAN_PLUGIN_PACKAGE_DEPENDS "libstatreporthost${PROJECT_VERSION_MAJOR} ${exact}")
+set(CPACK_DEBIAN_PLUGIN_PACKAGE_RECOMMENDS "${fonts}")
 set(CPACK_DEBIAN_PLUGIN_PACKAGE_ENHANCES measuringdesk)
 set(CPACK_COMPONENT_PLUGIN_DESCRIPTION "statistics reports for image-measurement applications
 A plug-in with a templates editor, live statistics and PDF reports of what was

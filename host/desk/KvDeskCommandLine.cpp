@@ -50,6 +50,11 @@ void KvDeskCommandLine::checkTheme()
     m_fault = tr("There is no theme \"%1\": use %2").arg(m_theme, themes.join(tr(" or ")));
 }
 
+QString KvDeskCommandLine::complaint() const
+{
+    return m_fault.isEmpty() ? m_fault : tr("%1 (measuringdesk --help tells more)").arg(m_fault);
+}
+
 QString KvDeskCommandLine::requestedText(const QStringList &words)
 {
     for (const QString &word : words.mid(1)) {

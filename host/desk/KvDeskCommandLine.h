@@ -15,6 +15,8 @@ public:
 
     /** What is wrong with the command line, one sentence; empty for a good one. */
     QString fault() const { return m_fault; }
+    /** The fault and where to read more; empty for a good command line. */
+    QString complaint() const;
 
     /** The files to open in this order: session, image, table, then those named without an option. */
     QString session() const { return m_session; }

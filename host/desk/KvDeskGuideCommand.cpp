@@ -9,15 +9,25 @@
 
 namespace {
 
-const QString fileName = QStringLiteral("user-guide.md");
+QString fileOf(const QString &language)
+{
+    return language.isEmpty() ? QStringLiteral("user-guide.md")
+                              : QStringLiteral("user-guide.%1.md").arg(language);
+}
+
+QString find(const QString &fileName, const QString &programFolder)
+{
+    const QString folder = KvDeskDataFolder::find(QStringLiteral("measuringdesk/guide"),
+                                                  QStringLiteral("docs"), fileName, programFolder);
+    return folder.isEmpty() ? folder : folder + QLatin1Char('/') + fileName;
+}
 
 } // namespace
 
-QString KvDeskGuideCommand::guide(const QString &programFolder)
+QString KvDeskGuideCommand::guide(const QString &language, const QString &programFolder)
 {
-    const QString folder = KvDeskDataFolder::find(QStringLiteral("doc/measuringdesk"), QStringLiteral("docs"),
-                                                  fileName, programFolder);
-    return folder.isEmpty() ? folder : folder + QLatin1Char('/') + fileName;
+    const QString translated = find(fileOf(language), programFolder);
+    return translated.isEmpty() ? find(fileOf(QString()), programFolder) : translated;
 }
 
 KvDeskGuideCommand::KvDeskGuideCommand(KvDeskActions *actions, const QString &path, QObject *parent)

@@ -14,8 +14,10 @@ class KvDeskGuideCommand : public QObject
 {
     Q_OBJECT
 public:
-    /** The guide's file that comes with the program; empty where there is none. */
-    static QString guide(const QString &programFolder = QCoreApplication::applicationDirPath());
+    /** The guide's file that comes with the program: in a language of KvDeskLanguages, in English where there
+     * is none in that; empty where there is neither. */
+    static QString guide(const QString &language,
+                         const QString &programFolder = QCoreApplication::applicationDirPath());
 
     /** \a actions has to outlive this. Their action for the guide says so when \a path is empty. */
     KvDeskGuideCommand(KvDeskActions *actions, const QString &path, QObject *parent = nullptr);

@@ -2,13 +2,17 @@
 #include "KvDeskGuideText.h"
 
 #include "KvDeskGuidePictures.h"
+#include "KvDeskLanguages.h"
 #include "gui/QtAdvancedStylesheet.h"
+#include "kernel/ZtLeftToRight.h"
 
 #include <QAbstractTextDocumentLayout>
 #include <QApplication>
 #include <QDesktopServices>
 #include <QFile>
 #include <QFileInfo>
+#include <QMimeData>
+#include <QRegularExpression>
 #include <QScrollBar>
 #include <QTextBlock>
 #include <QTextList>
@@ -28,10 +32,20 @@ constexpr int itemMargin = 4;
 constexpr int zoomStep = 10;
 constexpr int smallestZoom = 50;
 constexpr int largestZoom = 300;
+/// WORD JOINER, which has no width: Qt puts a blank of the first letter's font between a bullet and the text,
+/// and one of the program's font is so narrow that the bullet touches the letters.
+constexpr QChar bulletSpacer{0x2060};
 
 QColor themeColor(const char *token)
 {
     return acss::QtAdvancedStylesheet::getInstance()->color(QLatin1String(token));
+}
+
+// "guide.Arabic.md"; a file without a language in its name reads from left to right.
+Qt::LayoutDirection directionOf(const QString &path)
+{
+    const QString language = QFileInfo(path).completeBaseName().section(QLatin1Char('.'), -1);
+    return KvDeskLanguages::localeOf(language).textDirection();
 }
 
 QString read(const QString &path)
@@ -66,10 +80,30 @@ void setFormat(QTextDocument *document, const Part &part, const QTextCharFormat 
     cursor.setCharFormat(format);
 }
 
+// Columns stand in the order of the text's cells, from left to right: Qt has no other.
+QString withMirroredTables(const QString &markdown)
+{
+    static const QRegularExpression bar(QStringLiteral("(?<!\\\\)\\|"));
+    QStringList lines = markdown.split(QLatin1Char('\n'));
+    for (QString &line : lines) {
+        if (!line.startsWith(QLatin1Char('|')))
+            continue;
+        QStringList cells = line.split(bar);
+        std::reverse(cells.begin(), cells.end());
+        line = cells.join(QLatin1Char('|'));
+    }
+    return lines.join(QLatin1Char('\n'));
+}
+
 // Only code has a font in Markdown.
 bool isCode(const QTextCharFormat &format)
 {
     return format.hasProperty(QTextFormat::FontFamily);
+}
+
+bool hasBullet(const QTextBlock &block)
+{
+    return block.textList() && block.textList()->format().style() > QTextListFormat::ListDecimal;
 }
 
 // Qt gives it the system's font in a size of its own, which would not follow the zoom.
@@ -123,7 +157,7 @@ KvDeskGuideText::KvDeskGuideText(const QString &path, QWidget *parent)
     : QTextBrowser(parent)
     , m_folder(QFileInfo(path).absolutePath())
 {
-    setLayoutDirection(Qt::LeftToRight);
+    setLayoutDirection(directionOf(path));
     setFrameShape(QFrame::NoFrame);
     setOpenLinks(false);
     setUndoRedoEnabled(false);
@@ -140,13 +174,43 @@ KvDeskGuideText::KvDeskGuideText(const QString &path, QWidget *parent)
 
 void KvDeskGuideText::load(const QString &path)
 {
-    setMarkdown(read(path));
+    const QString markdown = read(path);
+    setMarkdown(layoutDirection() == Qt::RightToLeft ? withMirroredTables(markdown) : markdown);
+    setDirection(layoutDirection());
     nameHeadings();
     spaceBlocks();
     slotColourText();
     // The place that the first step back goes to.
     if (!m_headings.isEmpty())
         showHeading(0);
+}
+
+void KvDeskGuideText::setDirection(Qt::LayoutDirection direction)
+{
+    for (QTextBlock block = document()->begin(); block.isValid(); block = block.next()) {
+        const bool isCodeBlock = block.blockFormat().hasProperty(QTextFormat::BlockCodeFence);
+        QTextBlockFormat format;
+        format.setLayoutDirection(isCodeBlock ? Qt::LeftToRight : direction);
+        QTextCursor(block).mergeBlockFormat(format);
+    }
+    if (direction == Qt::RightToLeft)
+        isolateCode();
+}
+
+// Dashes, slashes and brackets at the ends of a piece of code would change sides. The marks have no width.
+void KvDeskGuideText::isolateCode()
+{
+    QVector<Part> parts = partsOf(document());
+    std::reverse(parts.begin(), parts.end());
+    for (const Part &part : qAsConst(parts)) {
+        const QTextBlock block = document()->findBlock(part.position);
+        if (!isCode(part.format) || block.blockFormat().hasProperty(QTextFormat::BlockCodeFence))
+            continue;
+        QTextCursor cursor(document());
+        cursor.setPosition(part.position);
+        cursor.setPosition(part.position + part.length, QTextCursor::KeepAnchor);
+        cursor.insertText(ZtLeftToRight::marked(cursor.selectedText()), part.format);
+    }
 }
 
 QString KvDeskGuideText::anchorOf(const QString &title)
@@ -191,6 +255,8 @@ void KvDeskGuideText::spaceBlocks()
         QTextCursor cursor(block);
         if (!cursor.currentTable())
             cursor.mergeBlockFormat(spaceOf(block));
+        if (hasBullet(block))
+            cursor.insertText(bulletSpacer, codeFormat(block.charFormat()));
     }
 }
 
@@ -212,6 +278,12 @@ void KvDeskGuideText::colourTables()
         if (!table)
             continue;
         QTextTableFormat format = table->format();
+        format.setLayoutDirection(layoutDirection());
+        // A table at the right would otherwise stand in the margin of the text.
+        if (layoutDirection() == Qt::RightToLeft) {
+            format.setAlignment(Qt::AlignRight);
+            format.setRightMargin(margin);
+        }
         format.setBorder(1);
         format.setBorderCollapse(true);
         format.setBorderStyle(QTextFrameFormat::BorderStyle_Solid);
@@ -310,6 +382,14 @@ void KvDeskGuideText::slotZoomOut()
 void KvDeskGuideText::slotZoomNormal()
 {
     setZoom(100);
+}
+
+QMimeData *KvDeskGuideText::createMimeDataFromSelection() const
+{
+    QMimeData *const copied = QTextBrowser::createMimeDataFromSelection();
+    copied->setText(ZtLeftToRight::plain(copied->text().remove(bulletSpacer)));
+    copied->setHtml(ZtLeftToRight::plain(copied->html().remove(bulletSpacer)));
+    return copied;
 }
 
 void KvDeskGuideText::wheelEvent(QWheelEvent *event)

@@ -8,7 +8,8 @@
  * A Markdown text with pictures to read: headings are anchors, links to them and showHeading() go there, and
  * backward() goes back. Other links are opened by the desktop.
  *
- * The text reads from left to right whatever the language of the program is.
+ * Paragraphs, lists and tables read as the language of the text does, which the name of the file says
+ * ("guide.Arabic.md"), whatever that of the program is; code reads from left to right.
  */
 class KvDeskGuideText : public QTextBrowser
 {
@@ -54,6 +55,8 @@ signals:
 
 protected:
     void wheelEvent(QWheelEvent *event) override;
+    /** Without the marks around code and at bullets, which are for the eye only. */
+    QMimeData *createMimeDataFromSelection() const override;
 
 private slots:
     void slotOpenLink(const QUrl &aUrl);
@@ -62,6 +65,8 @@ private slots:
 
 private:
     void load(const QString &path);
+    void setDirection(Qt::LayoutDirection direction);
+    void isolateCode();
     void nameHeadings();
     void spaceBlocks();
     void colourTables();

@@ -76,7 +76,7 @@ void KvDeskGuideWindow::createContents()
     m_contents->setSpacing(itemSpacing);
     m_contents->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     // The headings are in the language of the guide.
-    m_contents->setLayoutDirection(Qt::LeftToRight);
+    m_contents->setLayoutDirection(m_text->layoutDirection());
     const QVector<KvDeskGuideText::Heading> &headings = m_text->headings();
     for (int i = 0; i < headings.size(); ++i) {
         if (headings.at(i).level > deepestContents)
@@ -131,6 +131,9 @@ void KvDeskGuideWindow::createFind(QToolBar *bar)
     m_findPrevious = addTo(bar, "previous", tr("Find previous"),
                            {QKeySequence(Qt::SHIFT + Qt::Key_F3), QKeySequence(Qt::SHIFT + Qt::Key_Return)});
     m_findNext = addTo(bar, "next", tr("Find next"), {QKeySequence(Qt::Key_F3)});
+    m_askWhatToFind = new QAction(this);
+    m_askWhatToFind->setShortcuts(m_findPrevious->shortcuts() + m_findNext->shortcuts());
+    addAction(m_askWhatToFind);
     m_findResult = new QLabel(bar);
     m_findResult->setProperty("caption", true);
     m_findResult->setMinimumWidth(resultWidth);
@@ -153,6 +156,8 @@ void KvDeskGuideWindow::connectSignals()
     connect(m_findField, SIGNAL(returnPressed()), this, SLOT(slotFindNext()));
     connect(m_findNext, SIGNAL(triggered()), this, SLOT(slotFindNext()));
     connect(m_findPrevious, SIGNAL(triggered()), this, SLOT(slotFindPrevious()));
+    connect(m_askWhatToFind, SIGNAL(triggered()), this, SLOT(slotFocusFind()));
+    updateFind();
     connect(new QShortcut(QKeySequence::Find, this), SIGNAL(activated()), this, SLOT(slotFocusFind()));
     connect(new QShortcut(Qt::Key_Escape, this), SIGNAL(activated()), this, SLOT(slotEscape()));
 }
@@ -182,6 +187,14 @@ void KvDeskGuideWindow::slotFocusFind()
     m_findField->selectAll();
 }
 
+void KvDeskGuideWindow::updateFind()
+{
+    const bool isPossible = !m_findField->text().isEmpty();
+    setPossible(m_findPrevious, isPossible, tr("Type what to find first"));
+    setPossible(m_findNext, isPossible, tr("Type what to find first"));
+    m_askWhatToFind->setEnabled(!isPossible);
+}
+
 void KvDeskGuideWindow::showFindResult(bool isFound)
 {
     m_findResult->setText(isFound ? QString() : tr("Not found"));
@@ -189,24 +202,20 @@ void KvDeskGuideWindow::showFindResult(bool isFound)
 
 void KvDeskGuideWindow::slotFindTyped()
 {
+    updateFind();
     const QString text = m_findField->text();
     showFindResult(text.isEmpty() || m_text->findTyped(text));
 }
 
 void KvDeskGuideWindow::slotFindNext()
 {
-    if (m_findField->text().isEmpty())
-        slotFocusFind();
-    else
+    if (!m_findField->text().isEmpty())
         showFindResult(m_text->findNext(m_findField->text()));
 }
 
 void KvDeskGuideWindow::slotFindPrevious()
 {
-    if (m_findField->text().isEmpty())
-        slotFocusFind();
-    else
-        showFindResult(m_text->findPrevious(m_findField->text()));
+    showFindResult(m_text->findPrevious(m_findField->text()));
 }
 
 // As in other fields of that kind: first it is emptied.

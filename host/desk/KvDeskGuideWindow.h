@@ -44,6 +44,7 @@ private:
     void createFind(QToolBar *bar);
     QAction *addTo(QToolBar *bar, const char *icon, const QString &name, const QList<QKeySequence> &keys);
     void connectSignals();
+    void updateFind();
     void showFindResult(bool isFound);
     void restoreWindow();
     void saveWindow() const;
@@ -57,6 +58,7 @@ private:
     QAction *m_forward = nullptr;
     QAction *m_findPrevious = nullptr;
     QAction *m_findNext = nullptr;
+    QAction *m_askWhatToFind = nullptr; ///< has the keys of finding as long as there is nothing to find
     QAction *m_zoomOut = nullptr;
     QAction *m_zoomIn = nullptr;
     QAction *m_zoomNormal = nullptr;

@@ -16,6 +16,7 @@
 #include "KvDeskImageMenu.h"
 #include "KvDeskImageView.h"
 #include "KvDeskInlineEditor.h"
+#include "KvDeskLanguages.h"
 #include "KvDeskLiveBar.h"
 #include "KvDeskObjectEditor.h"
 #include "KvDeskRecentFiles.h"
@@ -152,7 +153,7 @@ void KvDeskMainWindow::createPanels()
     m_valueTable->setEditor(m_objectEditor);
     new KvDeskExportCommand(m_actions->action(KvDeskActions::ExportTable), m_files, m_session, m_selection,
                             this);
-    new KvDeskGuideCommand(m_actions, KvDeskGuideCommand::guide(), this);
+    new KvDeskGuideCommand(m_actions, KvDeskGuideCommand::guide(KvDeskLanguages::effectiveName()), this);
     m_gallery = new KvDeskGallery(m_actions, this);
     m_liveBar = new KvDeskLiveBar(m_actions, m_session->document(), this);
     m_statusLog = new KvDeskStatusLog(this);

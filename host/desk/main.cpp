@@ -53,7 +53,7 @@ void openFiles(const KvDeskCommandLine &commandLine, KvDeskMainWindow *window)
 void setProgramInfo()
 {
     ZtAppSettings::setProgramInfo(QStringLiteral("Measuring Desk"), QStringLiteral(STATREPORT_VERSION),
-                                  QStringLiteral("StatReport"));
+                                  QStringLiteral(STATREPORT_VENDOR));
 }
 
 // Without a display.
@@ -101,8 +101,7 @@ int main(int argc, char **argv)
     const KvDeskTranslation translation(KvDeskLanguages::effectiveName());
     const KvDeskCommandLine commandLine(words);
     if (!commandLine.fault().isEmpty()) {
-        std::fprintf(stderr, "measuringdesk: %s (measuringdesk --help tells more)\n",
-                     qPrintable(commandLine.fault()));
+        std::fprintf(stderr, "measuringdesk: %s\n", qPrintable(commandLine.complaint()));
         return usageError;
     }
     return run(commandLine);

@@ -19,8 +19,11 @@ public:
     {
         if (text.isEmpty() || QGuiApplication::layoutDirection() != Qt::RightToLeft)
             return text;
-        return begin + text + end;
+        return marked(text);
     }
+
+    /** The same whatever the program's direction is, for a text that has its own. */
+    static QString marked(const QString &text) { return begin + text + end; }
 
     /** \a text without the marks, to be taken to somewhere else. */
     static QString plain(QString text) { return text.remove(begin).remove(end); }

@@ -171,6 +171,11 @@ void KvCliParserTest::showsTheHelpOfACommand()
     QVERIFY2(description.endsWith(QLatin1Char('.')), qPrintable(description));
     for (const QString &option : qAsConst(options))
         QVERIFY2(result.text.contains(option), qPrintable(option));
+    // Each argument is explained, and there is no heading above none.
+    const QString arguments = result.text.section(QStringLiteral("\nArguments:\n"), 1);
+    QCOMPARE(arguments.isEmpty(), !usage.contains(QStringLiteral("TEMPLATE.rtp")));
+    for (const QString &argument : arguments.split(QLatin1Char('\n'), Qt::SkipEmptyParts))
+        QVERIFY2(argument.endsWith(QLatin1Char('.')), qPrintable(argument));
 }
 
 void KvCliParserTest::showsTheVersion_data()

@@ -65,7 +65,7 @@ void DialogLanguagesTest::dialogsHaveRoom()
     KvDeskExportDialog exporting({}, m_walk.window());
     exporting.show();
     m_walk.look(&exporting, QStringLiteral("export"));
-    KvDeskGuideWindow guide(KvDeskGuideCommand::guide());
+    KvDeskGuideWindow guide(KvDeskGuideCommand::guide(language));
     guide.show();
     m_walk.look(&guide, QStringLiteral("guide"));
     QVERIFY2(m_walk.faults().isEmpty(), m_walk.faults());

@@ -228,7 +228,7 @@ int main(int argc, char **argv)
     QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
     const QApplication application(argc, argv);
     ZtAppSettings::setProgramInfo(QStringLiteral("Measuring Desk"), QStringLiteral(STATREPORT_VERSION),
-                                  QStringLiteral("StatReport"));
+                                  QStringLiteral(STATREPORT_VENDOR));
     const QString folder = QString::fromLocal8Bit(argv[3]);
     QDir().mkpath(folder);
     const QString language = argc >= 5 ? QString::fromLocal8Bit(argv[4]) : QStringLiteral("English");

@@ -73,7 +73,7 @@ void InstallationTest::everythingIsThere_data()
                              "share/man/man1/measuringdesk.1.gz",
                              "share/doc/measuringdesk/changelog.gz",
                              "share/doc/libstatreporthost0/changelog.gz",
-                             "share/doc/measuringdesk/user-guide.md",
+                             "share/measuringdesk/guide/user-guide.md",
                              "share/bash-completion/completions/statreport",
                              "share/zsh/site-functions/_statreport",
                              "share/fish/vendor_completions.d/statreport.fish",
@@ -142,7 +142,9 @@ void InstallationTest::rendersAnExample()
 
 void InstallationTest::everythingThatTheGuideNamesIsThere()
 {
-    const QString folder = installed(QStringLiteral("share/doc/measuringdesk/"));
+    const QString folder = installed(QStringLiteral("share/measuringdesk/guide/"));
+    const QStringList guides{QStringLiteral("user-guide*.md")};
+    QCOMPARE(QDir(folder).entryList(guides), QDir(sourcePath(QStringLiteral("docs"))).entryList(guides));
     QFile guide(folder + QStringLiteral("user-guide.md"));
     QVERIFY(guide.open(QIODevice::ReadOnly));
     QSet<QString> named;

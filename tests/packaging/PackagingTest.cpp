@@ -114,6 +114,8 @@ private slots:
     void manualKnowsEveryOption();
     void everyVersionIsThisOne_data();
     void everyVersionIsThisOne();
+    void packagesRecommendWhatTheyUse_data();
+    void packagesRecommendWhatTheyUse();
     void guideNamesThePictures();
     void overridesHaveReasons();
 };
@@ -331,6 +333,36 @@ void PackagingTest::everyVersionIsThisOne()
     QVERIFY2(date.isValid(), qPrintable(found.captured(2)));
     static const QDate first = date;
     QCOMPARE(date, first);
+}
+
+void PackagingTest::packagesRecommendWhatTheyUse_data()
+{
+    QTest::addColumn<QString>("package");
+    QTest::addColumn<QString>("needed");
+    const auto row = [](const char *package, const char *needed) {
+        QTest::addRow("%s: %s", package, needed)
+            << QString::fromLatin1(package) << QString::fromLatin1(needed);
+    };
+    for (const char *const package : {"DESK", "PLUGIN"}) {
+        for (const char *const font : {"fonts-open-sans", "fonts-noto-core", "fonts-noto-cjk"})
+            row(package, font);
+    }
+    for (const char *const needed : {"statreport-plugin", "qttranslations5-l10n", "desktop-file-utils",
+                                     "hicolor-icon-theme", "shared-mime-info", "xdg-utils"})
+        row("DESK", needed);
+}
+
+void PackagingTest::packagesRecommendWhatTheyUse()
+{
+    QFETCH(QString, package);
+    QFETCH(QString, needed);
+    const QRegularExpression line(
+        QStringLiteral("set\\(CPACK_DEBIAN_%1_PACKAGE_RECOMMENDS \"(.*)\"\\)").arg(package));
+    const QString list = line.match(read(QStringLiteral(STATREPORT_CPACK_CONFIG))).captured(1);
+    QStringList names;
+    for (const QString &entry : list.split(QStringLiteral(", ")))
+        names.append(entry.section(QLatin1Char(' '), 0, 0));
+    QVERIFY2(names.contains(needed), qPrintable(list));
 }
 
 void PackagingTest::guideNamesThePictures()

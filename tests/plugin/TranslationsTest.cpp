@@ -171,23 +171,52 @@ QStringList faultsOf(const QVector<Message> &messages, bool (*isGood)(const Mess
     return faults;
 }
 
-/// Calls of translate() with a variable whose texts are not marked in the same file: lupdate does not see
-/// them.
-QStringList unmarkedTexts(const SourceTree::Files &files)
+/// What every call of tr() and translate() with a variable in it is called with. lupdate does not see these
+/// texts: they have to be marked where they stand, which is for a person to judge, call by call.
+QStringList variableTexts(const SourceTree::Files &files)
 {
-    static const QRegularExpression call(
-        QStringLiteral("translate\\(\\s*(?:\"(\\w+)\"|\\w+)\\s*,\\s*(?!\")[^\\s\"]"));
-    QStringList faults;
+    static const QRegularExpression call(QStringLiteral(
+        "(?:\\btr\\(|QCoreApplication::translate\\(\\s*[\\w\"]+\\s*,)\\s*(?![\\s\")])([^,()]+)"));
+    QStringList found;
     for (auto it = files.cbegin(); it != files.cend(); ++it) {
-        const bool isMarked = it.value().contains(QLatin1String("QT_TRANSLATE_NOOP")) ||
-                              it.value().contains(QLatin1String("QT_TR_NOOP"));
-        const QRegularExpressionMatch match = call.match(SourceTree::withoutComments(it.value()));
-        const bool isCall =
-            match.hasMatch() && it.value().contains(QLatin1String("QCoreApplication::translate"));
-        if (isCall && !isMarked)
-            faults.append(it.key());
+        QRegularExpressionMatchIterator calls = call.globalMatch(SourceTree::withoutComments(it.value()));
+        while (calls.hasNext())
+            found.append(it.key() + QStringLiteral(": ") + calls.next().captured(1).trimmed());
     }
-    return faults;
+    return found;
+}
+
+/// Sentences that are printed or shown as they stand in the code.
+QStringList untranslatedTexts(const SourceTree::Files &files)
+{
+    static const QString text = QStringLiteral("\"(?:[^\"\\\\]|\\\\.)*\"");
+    static const QString function = QStringLiteral(
+        "\\b(?:v?f?printf|f?puts|set\\w*(?:Text|Title|Tip|Label|Name|Description|Message)|showMessage|"
+        "add(?:Item|Action|Row|Menu|Tab|Button|Option)|question|warning|critical|information|about|"
+        "Q(?:Label|Action|PushButton|CheckBox|RadioButton|GroupBox|MessageBox)(?: \\w+)?)\\(");
+    // What may come before the text: translated texts, and words that are none.
+    static const QString before =
+        QStringLiteral("(?:\\btr\\(\\s*(?:%1\\s*)+(?:,\\s*%1)?|\\btranslate\\(\\s*\"\\w+\",\\s*(?:%1\\s*)+|"
+                       "\"[^\" ]*\"|[^;\"])*+")
+            .arg(text);
+    static const QRegularExpression call(
+        function + before + QStringLiteral("\"([^\"\\n]*\\p{L}{2,}[,.:;]? \\p{L}{2,}[^\"\\n]*)\""));
+    QStringList found;
+    for (auto it = files.cbegin(); it != files.cend(); ++it) {
+        QRegularExpressionMatchIterator calls = call.globalMatch(SourceTree::withoutComments(it.value()));
+        while (calls.hasNext())
+            found.append(it.key() + QStringLiteral(": ") + calls.next().captured(1));
+    }
+    return found;
+}
+
+SourceTree::Files codeOfTheProducts()
+{
+    QStringList folders;
+    for (const auto &product : products)
+        folders.append(product.first);
+    return SourceTree::read(StatReportTest::sourcePath(QString()), folders,
+                            {QStringLiteral("*.h"), QStringLiteral("*.cpp")});
 }
 
 QByteArray lines(const QStringList &texts)
@@ -214,6 +243,8 @@ private slots:
     void seesOtherShapes();
     void seesUnmarkedTexts_data();
     void seesUnmarkedTexts();
+    void seesUntranslatedTexts_data();
+    void seesUntranslatedTexts();
 
     void thePluginHoldsEveryLanguage_data();
     void thePluginHoldsEveryLanguage();
@@ -234,6 +265,7 @@ private slots:
     void contextsAreTheAgreedOnes_data();
     void contextsAreTheAgreedOnes();
     void noTextHidesFromLupdate();
+    void noTextIsUntranslated();
 
 private:
     void addFiles();
@@ -353,13 +385,20 @@ void TranslationsTest::seesUnmarkedTexts_data()
     QTest::addColumn<QString>("text");
     QTest::addColumn<bool>("isFault");
     const QString call = QStringLiteral("QCoreApplication::translate(");
+    const QString marked = QStringLiteral("QT_TRANSLATE_NOOP(\"KvA\", \"Open\") ");
     QTest::newRow("a text") << call + QStringLiteral("\"KvA\", \"Open\");") << false;
     QTest::newRow("a text on the next line") << call + QStringLiteral("\"KvA\",\n    \"Open\");") << false;
     QTest::newRow("a variable") << call + QStringLiteral("\"KvA\", text);") << true;
     QTest::newRow("a variable and a context") << call + QStringLiteral("context, text);") << true;
-    QTest::newRow("a marked one") << QStringLiteral("QT_TRANSLATE_NOOP(\"KvA\", \"Open\") ") + call +
-                                         QStringLiteral("\"KvA\", text);")
-                                  << false;
+    // A mark says nothing of the other calls in its file.
+    QTest::newRow("beside a marked text") << marked + call + QStringLiteral("\"KvA\", text);") << true;
+    QTest::newRow("the second call") << call + QStringLiteral("\"KvA\", \"Open\");") + call +
+                                            QStringLiteral("\"KvA\", text);")
+                                     << true;
+    QTest::newRow("of a class") << QStringLiteral("KvA::tr(text)") << true;
+    QTest::newRow("of a class, a text") << QStringLiteral("tr(\"Open\")") << false;
+    QTest::newRow("of a class, a text on the next line") << QStringLiteral("tr(\n   \"Open\")") << false;
+    QTest::newRow("another function") << QStringLiteral("str(text)") << false;
     QTest::newRow("commented out") << QStringLiteral("// ") + call + QStringLiteral("\"KvA\", text);")
                                    << false;
     QTest::newRow("of a painter") << QStringLiteral("painter.translate(a, b);") << false;
@@ -369,7 +408,36 @@ void TranslationsTest::seesUnmarkedTexts()
 {
     QFETCH(QString, text);
     QFETCH(bool, isFault);
-    QCOMPARE(unmarkedTexts({{QStringLiteral("a.cpp"), text}}).size(), isFault ? 1 : 0);
+    QCOMPARE(variableTexts({{QStringLiteral("a.cpp"), text}}).size(), isFault ? 1 : 0);
+}
+
+void TranslationsTest::seesUntranslatedTexts_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<bool>("isFault");
+    const auto row = [](const char *text, bool isFault) { QTest::newRow(text) << text << isFault; };
+    row("std::fputs(\"No such file\", stderr);", true);
+    row("std::fprintf(stderr, \"program: %s (program --help tells more)\\n\", fault);", true);
+    row("printf(\"%s\\n\", qPrintable(text));", false);
+    row("label->setText(QStringLiteral(\"Two words\"));", true);
+    row("label->setText(isGood ? QLatin1String(\"Two words\") : QString());", true);
+    row("label->setText(tr(\"Two words\"));", false);
+    row("label->setText(QStringLiteral(\"%1 %2\").arg(a, b));", false);
+    row("button->setToolTip(\"Two words\");", true);
+    row("auto *const label = new QLabel(QStringLiteral(\"Two words\"), this);", true);
+    row("const QLabel label(QStringLiteral(\"Two words\"));", true);
+    row("menu->addAction(icon, QStringLiteral(\"Two words\"));", true);
+    row("QMessageBox::warning(this, tr(\"Two words\"), QStringLiteral(\"And three more\"));", true);
+    row("action->setText(a); f(QStringLiteral(\"no text\"));", false);
+    row("// label->setText(QStringLiteral(\"Two words\"));", false);
+    row("setStyleSheet(QStringLiteral(\"color: black\"));", false);
+}
+
+void TranslationsTest::seesUntranslatedTexts()
+{
+    QFETCH(QString, text);
+    QFETCH(bool, isFault);
+    QCOMPARE(untranslatedTexts({{QStringLiteral("a.cpp"), text}}).size(), isFault ? 1 : 0);
 }
 
 void TranslationsTest::thePluginHoldsEveryLanguage_data()
@@ -583,9 +651,30 @@ void TranslationsTest::contextsAreTheAgreedOnes()
 
 void TranslationsTest::noTextHidesFromLupdate()
 {
-    const QStringList faults =
-        unmarkedTexts(SourceTree::read(sourcePath(QString()), {QStringLiteral("src"), QStringLiteral("host")},
-                                       {QStringLiteral("*.h"), QStringLiteral("*.cpp")}));
+    // Each of these was looked up: its texts are marked, most of them in a table above the call.
+    const QStringList expected{
+        QStringLiteral("cli/KvCliParser.cpp: kParserTexts[0]"),
+        QStringLiteral("cli/KvCliParser.cpp: kParserTexts[1]"),
+        QStringLiteral("cli/KvStatsReport.cpp: heading"),
+        QStringLiteral("host/desk/KvDeskActions.cpp: definition.text"),
+        QStringLiteral("host/desk/KvDeskActions.cpp: definition.toolTip"),
+        QStringLiteral("host/desk/KvDeskExamples.cpp: example->title"),
+        QStringLiteral("host/desk/KvDeskKnownDistance.cpp: unit.text"),
+        QStringLiteral("host/measuring/ZtDrawnType.cpp: name"),
+        QStringLiteral("host/measuring/ZtDrawnType.cpp: value.name"),
+        QStringLiteral("host/measuring/ZtFileFault.cpp: cause.text"),
+        QStringLiteral("host/measuring/ZtFileFault.cpp: cause.text"),
+        QStringLiteral("src/blocks/measurementstable/KvStatisticsMeasurementsTableNodeCfg.cpp: name.toUtf8"),
+        QStringLiteral("src/blocks/statisticstable/KvStatisticsStatsTableNodeCfg.cpp: name.toUtf8"),
+        QStringLiteral("src/data/KvStatisticsUnitConverter.cpp: text")};
+    QStringList found = variableTexts(codeOfTheProducts());
+    found.sort();
+    QVERIFY2(found == expected, lines(found));
+}
+
+void TranslationsTest::noTextIsUntranslated()
+{
+    const QStringList faults = untranslatedTexts(codeOfTheProducts());
     QVERIFY2(faults.isEmpty(), lines(faults));
 }
 

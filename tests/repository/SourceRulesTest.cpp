@@ -134,6 +134,7 @@ private slots:
     void everyHeaderHasPragmaOnce();
     void classesAreInTheirOwnHeader();
     void noFileHoldsWorkingNotes();
+    void theMakersAreNamedOnce();
 
 private:
     SourceTree::Files m_files;
@@ -313,6 +314,21 @@ void SourceRulesTest::noFileHoldsWorkingNotes()
         }
     }
     QVERIFY2(faults.isEmpty(), lines(faults));
+}
+
+// A program that says its version says who makes it, by the same constant.
+void SourceRulesTest::theMakersAreNamedOnce()
+{
+    static const QRegularExpression call(QStringLiteral("setProgramInfo\\([^;]*STATREPORT_VERSION[^;]*;"));
+    int calls = 0;
+    for (auto it = m_files.constBegin(); it != m_files.constEnd(); ++it) {
+        const QRegularExpressionMatch match = call.match(it.value());
+        if (!match.hasMatch() || !isCpp(it.key()))
+            continue;
+        ++calls;
+        QVERIFY2(match.captured().contains(QStringLiteral("STATREPORT_VENDOR")), qPrintable(it.key()));
+    }
+    QVERIFY(calls >= 2);
 }
 
 STATREPORT_TEST_MAIN(SourceRulesTest)

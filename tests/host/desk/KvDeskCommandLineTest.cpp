@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "KvDeskCommandLine.h"
 
+#include "support/BracketTranslator.h"
 #include "support/StatReportTest.h"
 
 class KvDeskCommandLineTest : public StatReportTest
@@ -15,6 +16,7 @@ private slots:
     void theme();
     void faults_data();
     void faults();
+    void complaintIsTranslated();
     void requestedTexts_data();
     void requestedTexts();
     void helpNamesAllOptions();
@@ -94,6 +96,15 @@ void KvDeskCommandLineTest::faults()
     QFETCH(QString, line);
     QFETCH(QString, fault);
     QCOMPARE(KvDeskCommandLine(words(line)).fault(), fault);
+}
+
+void KvDeskCommandLineTest::complaintIsTranslated()
+{
+    QCOMPARE(KvDeskCommandLine(words(QStringLiteral("a.json"))).complaint(), QString());
+    const KvDeskCommandLine wrong(words(QStringLiteral("--theme Blue")));
+    QCOMPARE(wrong.complaint(), wrong.fault() + QStringLiteral(" (measuringdesk --help tells more)"));
+    const BracketTranslator translator(QStringLiteral("KvDeskCommandLine"));
+    QCOMPARE(wrong.complaint(), QStringLiteral("[%1 (measuringdesk --help tells more)]").arg(wrong.fault()));
 }
 
 void KvDeskCommandLineTest::requestedTexts_data()

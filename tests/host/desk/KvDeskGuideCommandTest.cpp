@@ -27,6 +27,8 @@ private slots:
     void comesBackFromTheTaskBar();
     void guideOfTheProgram_data();
     void guideOfTheProgram();
+    void guideOfTheLanguage_data();
+    void guideOfTheLanguage();
     void f1ShowsIt();
     void closesWithTheMainWindow();
     void isInTheMenu();
@@ -96,7 +98,7 @@ void KvDeskGuideCommandTest::guideOfTheProgram_data()
     QTest::addColumn<QString>("program");
     QTest::addColumn<QString>("guide");
     QTest::newRow("installed") << QStringLiteral("usr/lib/statreport/bin")
-                               << QStringLiteral("usr/share/doc/measuringdesk/user-guide.md");
+                               << QStringLiteral("usr/share/measuringdesk/guide/user-guide.md");
     QTest::newRow("build tree") << QStringLiteral("source/build/dev/bin")
                                 << QStringLiteral("source/docs/user-guide.md");
 }
@@ -108,10 +110,36 @@ void KvDeskGuideCommandTest::guideOfTheProgram()
     const QString programFolder = temporaryPath(program);
     const QString path = temporaryPath(guide);
     QVERIFY(QDir().mkpath(programFolder));
-    QCOMPARE(KvDeskGuideCommand::guide(programFolder), QString());
+    QCOMPARE(KvDeskGuideCommand::guide(QStringLiteral("German"), programFolder), QString());
     QVERIFY(QDir().mkpath(QFileInfo(path).absolutePath()));
     QVERIFY(QFile::copy(GuideFile::create(), path));
-    QCOMPARE(KvDeskGuideCommand::guide(programFolder), path);
+    QCOMPARE(KvDeskGuideCommand::guide(QStringLiteral("German"), programFolder), path);
+}
+
+void KvDeskGuideCommandTest::guideOfTheLanguage_data()
+{
+    QTest::addColumn<QString>("language");
+    QTest::addColumn<QString>("file");
+    QTest::newRow("English") << QStringLiteral("English") << QStringLiteral("user-guide.md");
+    QTest::newRow("translated") << QStringLiteral("ChineseSimple")
+                                << QStringLiteral("user-guide.ChineseSimple.md");
+    QTest::newRow("not translated") << QStringLiteral("Korean") << QStringLiteral("user-guide.md");
+    QTest::newRow("no language of the program")
+        << QStringLiteral("Polish") << QStringLiteral("user-guide.md");
+    QTest::newRow("none") << QString() << QStringLiteral("user-guide.md");
+}
+
+void KvDeskGuideCommandTest::guideOfTheLanguage()
+{
+    QFETCH(QString, language);
+    QFETCH(QString, file);
+    const QString folder = temporaryPath(QStringLiteral("languages/share/measuringdesk/guide/"));
+    const QString program = temporaryPath(QStringLiteral("languages/lib/statreport/bin"));
+    QVERIFY(QDir().mkpath(folder));
+    QVERIFY(QDir().mkpath(program));
+    for (const char *const name : {"user-guide.md", "user-guide.ChineseSimple.md", "user-guide.German.md"})
+        QFile::copy(GuideFile::create(), folder + QLatin1String(name));
+    QCOMPARE(KvDeskGuideCommand::guide(language, program), folder + file);
 }
 
 // The test program is as deep in the build as the Desk.

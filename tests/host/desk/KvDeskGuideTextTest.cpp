@@ -6,6 +6,7 @@
 #include "gui/QtAdvancedStylesheet.h"
 
 #include <QAbstractTextDocumentLayout>
+#include <QClipboard>
 #include <QDesktopServices>
 #include <QFontInfo>
 #include <QScrollBar>
@@ -36,6 +37,26 @@ public slots:
 
 } // namespace
 
+namespace {
+
+/// The first column from \a x on that holds something, or that holds nothing.
+int nextColumn(const QImage &image, int x, bool isInk)
+{
+    const QRgb paper = image.pixel(0, 0);
+    const auto hasInk = [&image, paper](int column) {
+        for (int y = 0; y < image.height(); ++y) {
+            if (image.pixel(column, y) != paper)
+                return true;
+        }
+        return false;
+    };
+    while (x < image.width() && hasInk(x) != isInk)
+        ++x;
+    return x;
+}
+
+} // namespace
+
 class KvDeskGuideTextTest : public StatReportTest
 {
     Q_OBJECT
@@ -60,7 +81,12 @@ private slots:
     void zooms();
     void wheelZooms();
     void followsTheTheme();
-    void readsFromLeftToRight();
+    void readsAsItsLanguage_data();
+    void readsAsItsLanguage();
+    void codeReadsFromLeftToRight();
+    void copiedCodeIsPlain();
+    void bulletsStandApart_data();
+    void bulletsStandApart();
     void missingFileIsEmpty();
 
 private:
@@ -109,6 +135,12 @@ void KvDeskGuideTextTest::anchors_data()
     QTest::newRow("marks") << QStringLiteral("Objects, undo (\"all\")") << QStringLiteral("objects-undo-all");
     QTest::newRow("hyphens") << QStringLiteral("Command-line a_b 2") << QStringLiteral("command-line-a_b-2");
     QTest::newRow("nothing") << QString() << QString();
+    QTest::newRow("umlauts") << QStringLiteral("Größe ändern") << QStringLiteral("größe-ändern");
+    QTest::newRow("Cyrillic") << QStringLiteral("Первое Измерение") << QStringLiteral("первое-измерение");
+    QTest::newRow("Arabic") << QStringLiteral("الجلسات والاستعادة") << QStringLiteral("الجلسات-والاستعادة");
+    QTest::newRow("Chinese") << QStringLiteral("更改对象、撤消") << QStringLiteral("更改对象撤消");
+    QTest::newRow("Japanese") << QStringLiteral("レポート") << QStringLiteral("レポート");
+    QTest::newRow("Korean") << QStringLiteral("보고서 템플릿") << QStringLiteral("보고서-템플릿");
 }
 
 void KvDeskGuideTextTest::anchors()
@@ -304,14 +336,100 @@ void KvDeskGuideTextTest::followsTheTheme()
     }
 }
 
-void KvDeskGuideTextTest::readsFromLeftToRight()
+void KvDeskGuideTextTest::readsAsItsLanguage_data()
 {
-    QGuiApplication::setLayoutDirection(Qt::RightToLeft);
-    const KvDeskGuideText text(m_path);
+    QTest::addColumn<QString>("file");
+    QTest::addColumn<Qt::LayoutDirection>("program");
+    QTest::addColumn<Qt::LayoutDirection>("text");
+    QTest::newRow("English") << QStringLiteral("guide.md") << Qt::LeftToRight << Qt::LeftToRight;
+    QTest::newRow("English in a mirrored program")
+        << QStringLiteral("guide.md") << Qt::RightToLeft << Qt::LeftToRight;
+    QTest::newRow("German") << QStringLiteral("guide.German.md") << Qt::LeftToRight << Qt::LeftToRight;
+    QTest::newRow("Arabic") << QStringLiteral("guide.Arabic.md") << Qt::RightToLeft << Qt::RightToLeft;
+}
+
+void KvDeskGuideTextTest::readsAsItsLanguage()
+{
+    QFETCH(QString, file);
+    QFETCH(Qt::LayoutDirection, program);
+    QFETCH(Qt::LayoutDirection, text);
+    const QString path = GuideFile::create(file);
+    QGuiApplication::setLayoutDirection(program);
+    const KvDeskGuideText guide(path);
     QGuiApplication::setLayoutDirection(Qt::LeftToRight);
-    QCOMPARE(text.layoutDirection(), Qt::LeftToRight);
-    for (QTextBlock block = text.document()->begin(); block.isValid(); block = block.next())
-        QCOMPARE(block.textDirection(), Qt::LeftToRight);
+    QCOMPARE(guide.layoutDirection(), text);
+    for (QTextBlock block = guide.document()->begin(); block.isValid(); block = block.next()) {
+        const bool isCode = block.blockFormat().hasProperty(QTextFormat::BlockCodeFence);
+        QVERIFY2(block.textDirection() == (isCode ? Qt::LeftToRight : text), qPrintable(block.text()));
+    }
+    const auto *const table =
+        qobject_cast<QTextTable *>(guide.document()->rootFrame()->childFrames().first());
+    QVERIFY(table);
+    QCOMPARE(table->format().layoutDirection(), text);
+    // The first column is where reading begins.
+    QCOMPARE(table->cellAt(0, text == Qt::RightToLeft ? 1 : 0).firstCursorPosition().block().text(),
+             QStringLiteral("key"));
+    QCOMPARE(bool(table->format().alignment() & Qt::AlignRight), text == Qt::RightToLeft);
+    // The marks around code are nothing of the anchors.
+    QCOMPARE(guide.headings().at(1).anchor, QStringLiteral("first-code-chapter"));
+}
+
+// The dashes stay before the word, which stands at the right in the line.
+void KvDeskGuideTextTest::codeReadsFromLeftToRight()
+{
+    KvDeskGuideText guide(GuideFile::create(QStringLiteral("guide.Arabic.md")));
+    guide.resize(600, 400);
+    guide.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&guide));
+    const QTextCursor found = guide.document()->find(QStringLiteral("--dashes"));
+    QTextCursor cursor(found);
+    cursor.setPosition(found.selectionStart());
+    const int dashes = guide.cursorRect(cursor).x();
+    cursor.setPosition(found.selectionEnd() - 1);
+    QVERIFY(dashes < guide.cursorRect(cursor).x());
+}
+
+void KvDeskGuideTextTest::copiedCodeIsPlain()
+{
+    KvDeskGuideText guide(GuideFile::create(QStringLiteral("guide.Arabic.md")));
+    QTextCursor cursor = guide.document()->find(QStringLiteral("An item with"));
+    cursor.select(QTextCursor::BlockUnderCursor);
+    guide.setTextCursor(cursor);
+    guide.copy();
+    QCOMPARE(QApplication::clipboard()->text().trimmed(), QStringLiteral("An item with --dashes"));
+}
+
+void KvDeskGuideTextTest::bulletsStandApart_data()
+{
+    QTest::addColumn<QString>("file");
+    QTest::newRow("left to right") << QStringLiteral("guide.md");
+    QTest::newRow("right to left") << QStringLiteral("guide.Arabic.md");
+}
+
+// There is room between the bullet and the letters: half of the bullet's size at least.
+void KvDeskGuideTextTest::bulletsStandApart()
+{
+    QFETCH(QString, file);
+    KvDeskGuideText guide(GuideFile::create(file));
+    guide.resize(600, 400);
+    guide.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&guide));
+    QTextCursor cursor = guide.document()->find(QStringLiteral("Another"));
+    cursor.setPosition(cursor.selectionStart());
+    guide.setTextCursor(cursor);
+    guide.ensureCursorVisible();
+    QImage line = guide.viewport()
+                      ->grab(QRect(0, guide.cursorRect(cursor).y(), guide.viewport()->width(),
+                                   guide.cursorRect(cursor).height()))
+                      .toImage();
+    if (guide.layoutDirection() == Qt::RightToLeft)
+        line = line.mirrored(true, false);
+    const int bullet = nextColumn(line, 0, true);
+    const int gap = nextColumn(line, bullet, false);
+    const int text = nextColumn(line, gap, true);
+    QVERIFY(text < line.width());
+    QVERIFY2(2 * (text - gap) >= gap - bullet,
+             qPrintable(QStringLiteral("bullet %1 gap %2 text %3").arg(bullet).arg(gap).arg(text)));
 }
 
 void KvDeskGuideTextTest::missingFileIsEmpty()
