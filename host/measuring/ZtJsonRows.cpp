@@ -75,7 +75,7 @@ void ZtJsonRows::beginPass(double from, double to)
 bool ZtJsonRows::setList(const QString &place)
 {
     if (m_json.kind() != ZtJsonReader::List)
-        return fail(place, reason(QT_TRANSLATE_NOOP("ZtSessionReader", "This must be a list")));
+        return fail(place, reason(QT_TRANSLATE_NOOP("ZtSession", "This must be a list")));
     m_list = m_json.position();
     rewind();
     return true;
@@ -122,7 +122,7 @@ bool ZtJsonRows::nextItem()
     }
     if (m_json.kind() == ZtJsonReader::Object)
         return true;
-    return fail(placeOf(-1), reason(QT_TRANSLATE_NOOP("ZtSessionReader", "This must be an object")));
+    return fail(placeOf(-1), reason(QT_TRANSLATE_NOOP("ZtSession", "This must be an object")));
 }
 
 int ZtJsonRows::line()
@@ -192,7 +192,7 @@ bool ZtJsonRows::readField(const QString &place, std::deque<std::string> *texts,
 
 QString ZtJsonRows::reason(const char *text)
 {
-    return QCoreApplication::translate("ZtSessionReader", text);
+    return QCoreApplication::translate("ZtSession", text);
 }
 
 QString ZtJsonRows::toPlace(std::string_view key)

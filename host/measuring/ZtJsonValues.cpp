@@ -36,7 +36,7 @@ bool ZtJsonValues::prepare()
         return false;
     const QString place = QStringLiteral("objects");
     if (m_positions[2] == 0)
-        return fail(place, reason(QT_TRANSLATE_NOOP("ZtSessionReader", "This must be a list")));
+        return fail(place, reason(QT_TRANSLATE_NOOP("ZtSession", "This must be a list")));
     json().seek(m_positions[2]);
     return setList(place);
 }
@@ -46,7 +46,7 @@ bool ZtJsonValues::checkVersion(std::size_t position)
     const QString place = QStringLiteral("version");
     json().seek(position);
     if (position == 0 || json().kind() != ZtJsonReader::Number)
-        return fail(place, reason(QT_TRANSLATE_NOOP("ZtSessionReader", "This must be a number")));
+        return fail(place, reason(QT_TRANSLATE_NOOP("ZtSession", "This must be a number")));
     const double found = json().number();
     return found == version ||
            fail(place,
@@ -111,7 +111,7 @@ bool ZtJsonValues::enterValues(std::size_t position)
         json().seek(position);
     if (position == 0 || json().kind() != ZtJsonReader::List)
         return fail(placeOf(-1) + QStringLiteral(".values"),
-                    reason(QT_TRANSLATE_NOOP("ZtSessionReader", "This must be a list")));
+                    reason(QT_TRANSLATE_NOOP("ZtSession", "This must be a list")));
     json().enter();
     return true;
 }
@@ -132,7 +132,7 @@ bool ZtJsonValues::readValue(ZtCsvRow *row)
     row->line = line();
     row->fields = {m_type, m_key, m_name, {}, {}, {}};
     if (json().kind() != ZtJsonReader::Object)
-        return fail(placeOf(-1), reason(QT_TRANSLATE_NOOP("ZtSessionReader", "This must be an object")));
+        return fail(placeOf(-1), reason(QT_TRANSLATE_NOOP("ZtSession", "This must be an object")));
     if (!findMembers(placeOf(-1), {"name", "unit", "value"}, &m_positions))
         return false;
     const std::size_t end = json().position();

@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>اكتب رقمًا مثل 5.3 أو 5,3</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>يتراوح حجم البكسل بين %1 و%2</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 
 يحدد متغير البيئة STATREPORT_PLUGINS مجلدات أخرى فيها إضافات.
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (للمزيد: ‎measuringdesk --help‎)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>لم تُنسخ أي كائنات مقيسة</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>أكمل ما بدأته أو ألغه أولًا</translation>
     </message>
 </context>
 <context>
@@ -1213,6 +1232,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Not found</source>
         <translation>لا توجد نتائج</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>اكتب ما تبحث عنه أولًا</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1492,6 +1515,10 @@ Dropped, because newer ones came first: %1</source>
         <source>pasting of %1</source>
         <translation>لصق %1</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>استيراد %1</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1533,6 +1560,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>ترك كل شيء كما كان (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>لم يعد الإلغاء ممكنًا</translation>
     </message>
 </context>
 <context>
@@ -2534,6 +2565,10 @@ Reported by %2</source>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>جلسات الإصدار %1 غير معروفة؛ ويقرأ هذا البرنامج الإصدارات من %2 إلى %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>هذا الملف جدول قيم؛ استورده</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2721,6 +2756,30 @@ Reported by %2</source>
             <numerusform>في الصف %n حقلًا بدلًا من %1</numerusform>
             <numerusform>في الصف %n حقل بدلًا من %1</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>في السجلات أسماء مختلفة أكثر من اللازم</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>هذا الملف جلسة وليس جدولًا؛ افتحه</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>الملف ليس قائمة سجلات ولا تصديرًا للقيم</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>هذا الاسم مكرر</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>يجب أن يكون هنا نص أو رقم أو null</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>الجدول من الإصدار %1؛ يقرأ هذا البرنامج الإصدار %2</translation>
     </message>
 </context>
 <context>

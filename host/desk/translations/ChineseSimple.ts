@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>请输入数字，例如 5.3 或 5,3</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>像素大小应在 %1 与 %2 之间</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 
 环境变量 STATREPORT_PLUGINS 可指定更多插件目录。
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1（详细信息：measuringdesk --help）</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>没有已复制的测量对象</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>请先完成或取消已开始的操作</translation>
     </message>
 </context>
 <context>
@@ -1183,6 +1202,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Not found</source>
         <translation>未找到</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>请先输入要查找的内容</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1457,6 +1480,10 @@ Dropped, because newer ones came first: %1</source>
         <source>pasting of %1</source>
         <translation>粘贴 %1</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>导入 %1</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1498,6 +1525,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>保持一切不变 (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>已无法取消</translation>
     </message>
 </context>
 <context>
@@ -2489,6 +2520,10 @@ Reported by %2</source>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>无法识别版本 %1 的会话；本程序可读取版本 %2 至 %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>此文件是测量值表，请导入</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2666,6 +2701,30 @@ Reported by %2</source>
         <translation>
             <numerusform>该行有 %n 个字段，应为 %1 个</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>记录中不同的名称太多</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>此文件是会话而不是表，请打开</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>此文件既不是记录列表，也不是导出的测量值</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>此名称出现两次</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>此处必须是文本、数字或 null</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>表的版本为 %1；本程序读取版本 %2</translation>
     </message>
 </context>
 <context>

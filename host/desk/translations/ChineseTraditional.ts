@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>請輸入數字，例如 5.3 或 5,3</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>像素大小應介於 %1 與 %2 之間</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 
 環境變數 STATREPORT_PLUGINS 可指定更多外掛程式目錄。
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1（詳細資訊：measuringdesk --help）</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>沒有已複製的量測物件</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>請先完成或取消已開始的操作</translation>
     </message>
 </context>
 <context>
@@ -1183,6 +1202,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Not found</source>
         <translation>找不到</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>請先輸入要尋找的內容</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1457,6 +1480,10 @@ Dropped, because newer ones came first: %1</source>
         <source>pasting of %1</source>
         <translation>貼上 %1</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>匯入 %1</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1498,6 +1525,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>讓一切保持原狀 (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>已無法取消</translation>
     </message>
 </context>
 <context>
@@ -2489,6 +2520,10 @@ Reported by %2</source>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>無法辨識版本 %1 的工作階段；本程式可讀取版本 %2 至 %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>此檔案是量測值表，請匯入</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2666,6 +2701,30 @@ Reported by %2</source>
         <translation>
             <numerusform>該列有 %n 個欄位，應為 %1 個</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>記錄中不同的名稱太多</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>此檔案是工作階段而不是表格，請開啟</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>此檔案既不是記錄清單，也不是匯出的量測值</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>此名稱出現兩次</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>此處必須是文字、數字或 null</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>表格的版本為 %1；本程式讀取版本 %2</translation>
     </message>
 </context>
 <context>

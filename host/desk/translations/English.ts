@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>Type a number such as 5.3 or 5,3</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>A pixel measures between %1 and %2</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ Measures objects on images and shows their values.
 
 The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (measuringdesk --help tells more)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>No measured objects were copied</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>Finish or cancel what you have begun first</translation>
     </message>
 </context>
 <context>
@@ -1189,6 +1208,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Not found</source>
         <translation>Not found</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>Type what to find first</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1464,6 +1487,10 @@ Dropped, because newer ones came first: %1</translation>
         <source>pasting of %1</source>
         <translation>pasting of %1</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>import of %1</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1505,6 +1532,10 @@ Dropped, because newer ones came first: %1</translation>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>Leave everything as it was (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>This can no longer be cancelled</translation>
     </message>
 </context>
 <context>
@@ -2498,6 +2529,10 @@ Reported by %2</translation>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>Sessions of version %1 are not known; this program reads versions %2 to %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>This file is a table of values; import it</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2677,6 +2712,30 @@ Reported by %2</translation>
             <numerusform>The row has %n field instead of %1</numerusform>
             <numerusform>The row has %n fields instead of %1</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>The records have too many different names</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>This file is a session, not a table; open it</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>The file is neither a list of records nor an export of values</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>This name comes twice</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>This must be a text, a number or null</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>The table is of version %1; this program reads version %2</translation>
     </message>
 </context>
 <context>

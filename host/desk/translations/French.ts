@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>Saisissez un nombre tel que 5.3 ou 5,3</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>Un pixel mesure entre %1 et %2</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -575,7 +586,7 @@
     <message>
         <source>Calibrated: %1, %2 per pixel</source>
         <extracomment>%1 is an objective or a file, %2 the size of a pixel with its unit</extracomment>
-        <translation>Étalonné : %1, %2 par pixel</translation>
+        <translation>Étalonné&#xa0;: %1, %2 par pixel</translation>
     </message>
 </context>
 <context>
@@ -615,6 +626,10 @@ Mesure des objets sur des images et affiche leurs valeurs.
 
 La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de plug-ins.
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (aide : measuringdesk --help)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     <message>
         <source>No measured objects were copied</source>
         <translation>Aucun objet mesuré n’a été copié</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>Terminez ou annulez d’abord ce que vous avez commencé</translation>
     </message>
 </context>
 <context>
@@ -984,22 +1003,22 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     <message numerus="yes">
         <source>Session opened: %1 (%n object(s))</source>
         <translation>
-            <numerusform>Session ouverte : %1 (%n objet)</numerusform>
-            <numerusform>Session ouverte : %1 (%n objets)</numerusform>
+            <numerusform>Session ouverte&#xa0;: %1 (%n objet)</numerusform>
+            <numerusform>Session ouverte&#xa0;: %1 (%n objets)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Measurements restored: %1 (%n object(s))</source>
         <translation>
-            <numerusform>Mesures restaurées : %1 (%n objet)</numerusform>
-            <numerusform>Mesures restaurées : %1 (%n objets)</numerusform>
+            <numerusform>Mesures restaurées&#xa0;: %1 (%n objet)</numerusform>
+            <numerusform>Mesures restaurées&#xa0;: %1 (%n objets)</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Table imported: %1 (%n object(s))</source>
         <translation>
-            <numerusform>Tableau importé : %1 (%n objet)</numerusform>
-            <numerusform>Tableau importé : %1 (%n objets)</numerusform>
+            <numerusform>Tableau importé&#xa0;: %1 (%n objet)</numerusform>
+            <numerusform>Tableau importé&#xa0;: %1 (%n objets)</numerusform>
         </translation>
     </message>
 </context>
@@ -1120,8 +1139,8 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     <message numerus="yes">
         <source>Move %n selected image(s) to the trash?</source>
         <translation>
-            <numerusform>Mettre %n image sélectionnée à la corbeille ?</numerusform>
-            <numerusform>Mettre %n images sélectionnées à la corbeille ?</numerusform>
+            <numerusform>Mettre %n image sélectionnée à la corbeille&#xa0;?</numerusform>
+            <numerusform>Mettre %n images sélectionnées à la corbeille&#xa0;?</numerusform>
         </translation>
     </message>
 </context>
@@ -1188,6 +1207,10 @@ La variable d’environnement STATREPORT_PLUGINS indique d’autres dossiers de 
     <message>
         <source>Not found</source>
         <translation>Introuvable</translation>
+    </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>Saisissez d’abord le texte à rechercher</translation>
     </message>
 </context>
 <context>
@@ -1464,6 +1487,10 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
         <source>pasting of %1</source>
         <translation>coller %1</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>importation de %1</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1505,6 +1532,10 @@ Ignorées au profit de plus récentes&#xa0;: %1</translation>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>Tout laisser en l’état (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>Il n’est plus possible d’annuler</translation>
     </message>
 </context>
 <context>
@@ -2498,6 +2529,10 @@ Signalé par %2</translation>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>Les sessions de version %1 ne sont pas connues&#xa0;; ce programme lit les versions %2 à %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>Ce fichier est un tableau de valeurs ; importez-le</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2677,6 +2712,30 @@ Signalé par %2</translation>
             <numerusform>La ligne a %n champ au lieu de %1</numerusform>
             <numerusform>La ligne a %n champs au lieu de %1</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>Les enregistrements ont trop de noms différents</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>Ce fichier est une session, pas un tableau ; ouvrez-le</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>Le fichier n’est ni une liste d’enregistrements ni une exportation de valeurs</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>Ce nom apparaît deux fois</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>Il faut ici un texte, un nombre ou null</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>Le tableau est de version %1 ; ce programme lit la version %2</translation>
     </message>
 </context>
 <context>

@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>Geben Sie eine Zahl wie 5.3 oder 5,3 ein</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>Ein Pixel misst zwischen %1 und %2</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ Misst Objekte in Bildern und zeigt ihre Messwerte.
 
 Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (weitere Hilfe: measuringdesk --help)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>Es wurden keine Messobjekte kopiert</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>Schließen Sie zuerst ab, was Sie begonnen haben, oder brechen Sie es ab</translation>
     </message>
 </context>
 <context>
@@ -1189,6 +1208,10 @@ Die Umgebungsvariable STATREPORT_PLUGINS nennt weitere Ordner mit Plug-ins.
         <source>Not found</source>
         <translation>Nicht gefunden</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>Geben Sie zuerst einen Suchbegriff ein</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1464,6 +1487,10 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
         <source>pasting of %1</source>
         <translation>%1 einfügen</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>%1 importieren</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1505,6 +1532,10 @@ Verworfen, weil neuere zuvorkamen: %1</translation>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>Alles so lassen, wie es war (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>Dies lässt sich nicht mehr abbrechen</translation>
     </message>
 </context>
 <context>
@@ -2498,6 +2529,10 @@ Gemeldet von %2</translation>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>Sitzungen der Version %1 sind nicht bekannt; dieses Programm liest die Versionen %2 bis %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>Diese Datei ist eine Wertetabelle; importieren Sie sie</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2677,6 +2712,30 @@ Gemeldet von %2</translation>
             <numerusform>Die Zeile hat %n Feld statt %1</numerusform>
             <numerusform>Die Zeile hat %n Felder statt %1</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>Die Datensätze haben zu viele verschiedene Namen</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>Diese Datei ist eine Sitzung, keine Tabelle; öffnen Sie sie</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>Die Datei ist weder eine Liste von Datensätzen noch ein Export von Messwerten</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>Dieser Name kommt doppelt vor</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>Hier muss ein Text, eine Zahl oder null stehen</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>Die Tabelle hat die Version %1; dieses Programm liest Version %2</translation>
     </message>
 </context>
 <context>

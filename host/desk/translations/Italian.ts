@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>Digitare un numero come 5.3 o 5,3</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>Un pixel misura tra %1 e %2</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ Misura oggetti su immagini e ne mostra i valori.
 
 La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-in.
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (ulteriore aiuto: measuringdesk --help)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
     <message>
         <source>No measured objects were copied</source>
         <translation>Nessun oggetto misurato è stato copiato</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>Completare o annullare prima ciò che è stato iniziato</translation>
     </message>
 </context>
 <context>
@@ -1189,6 +1208,10 @@ La variabile d&apos;ambiente STATREPORT_PLUGINS indica altre cartelle con plug-i
         <source>Not found</source>
         <translation>Non trovato</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>Digitare prima il testo da cercare</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1464,6 +1487,10 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
         <source>pasting of %1</source>
         <translation>inserimento di %1</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>importazione di %1</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1505,6 +1532,10 @@ Scartati perché ne sono arrivati di più recenti: %1</translation>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>Lascia tutto com&apos;era (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>Non è più possibile annullare</translation>
     </message>
 </context>
 <context>
@@ -2498,6 +2529,10 @@ Segnalato da %2</translation>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>Le sessioni della versione %1 non sono riconosciute; questo programma legge le versioni dalla %2 alla %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>Questo file è una tabella di valori; importarla</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2677,6 +2712,30 @@ Segnalato da %2</translation>
             <numerusform>La riga ha %n campo invece di %1</numerusform>
             <numerusform>La riga ha %n campi invece di %1</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>I record hanno troppi nomi diversi</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>Questo file è una sessione, non una tabella; aprirla</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>Il file non è né un elenco di record né un’esportazione di valori</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>Questo nome compare due volte</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>Qui deve esserci un testo, un numero o null</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>La tabella è della versione %1; questo programma legge la versione %2</translation>
     </message>
 </context>
 <context>

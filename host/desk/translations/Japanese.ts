@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>5.3 や 5,3 のような数値を入力してください</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>ピクセルの大きさは %1 から %2 までです</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 
 環境変数 STATREPORT_PLUGINS で、プラグインのフォルダーをさらに指定できます。
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (詳細: measuringdesk --help)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>測定オブジェクトがコピーされていません</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>先に、始めた操作を完了するか取り消してください</translation>
     </message>
 </context>
 <context>
@@ -1183,6 +1202,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Not found</source>
         <translation>見つかりません</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>先に検索する語を入力してください</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1457,6 +1480,10 @@ Dropped, because newer ones came first: %1</source>
         <source>pasting of %1</source>
         <translation>%1の貼り付け</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>%1のインポート</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1498,6 +1525,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>何も変更せずに中止します (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>もうキャンセルできません</translation>
     </message>
 </context>
 <context>
@@ -2489,6 +2520,10 @@ Reported by %2</source>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>バージョン %1 のセッションには対応していません。このプログラムが読み取れるのはバージョン %2 ～ %3 です</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>このファイルは測定値の表です。インポートしてください</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2666,6 +2701,30 @@ Reported by %2</source>
         <translation>
             <numerusform>行のフィールド数が %1 ではなく %n です</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>レコードに異なる名前が多すぎます</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>このファイルは表ではなくセッションです。開いてください</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>このファイルはレコードのリストでも、エクスポートした測定値でもありません</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>この名前は 2 回出てきます</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>ここには文字列、数値、または null が必要です</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>表のバージョンは %1 ですが、このプログラムはバージョン %2 を読み取ります</translation>
     </message>
 </context>
 <context>

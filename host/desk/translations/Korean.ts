@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>5.3 또는 5,3과 같은 숫자를 입력하세요</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>픽셀 크기는 %1에서 %2 사이입니다</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 
 환경 변수 STATREPORT_PLUGINS로 플러그인 폴더를 더 지정할 수 있습니다.
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (자세한 내용: measuringdesk --help)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>복사한 측정 개체가 없습니다</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>시작한 작업을 먼저 마치거나 취소하세요</translation>
     </message>
 </context>
 <context>
@@ -1183,6 +1202,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Not found</source>
         <translation>찾을 수 없음</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>먼저 찾을 말을 입력하세요</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1457,6 +1480,10 @@ Dropped, because newer ones came first: %1</source>
         <source>pasting of %1</source>
         <translation>%1 붙여넣기</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>%1 가져오기</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1498,6 +1525,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>아무것도 변경하지 않고 중단합니다(Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>더 이상 취소할 수 없습니다</translation>
     </message>
 </context>
 <context>
@@ -2489,6 +2520,10 @@ Reported by %2</source>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>버전 %1의 세션은 지원하지 않습니다. 이 프로그램은 버전 %2~%3만 읽을 수 있습니다</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>이 파일은 값 표입니다. 가져오기를 사용하세요</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2666,6 +2701,30 @@ Reported by %2</source>
         <translation>
             <numerusform>행의 필드가 %1개가 아니라 %n개입니다</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>레코드에 서로 다른 이름이 너무 많습니다</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>이 파일은 표가 아니라 세션입니다. 여세요</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>이 파일은 레코드 목록도, 내보낸 값도 아닙니다</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>이 이름이 두 번 나옵니다</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>여기에는 텍스트, 숫자 또는 null이 있어야 합니다</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>표의 버전은 %1입니다. 이 프로그램은 버전 %2을(를) 읽습니다</translation>
     </message>
 </context>
 <context>

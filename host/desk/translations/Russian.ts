@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>Введите число, например 5.3 или 5,3</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>Размер пикселя — от %1 до %2</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
 
 Переменная среды STATREPORT_PLUGINS задаёт дополнительные папки с подключаемыми модулями.
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (подробнее: measuringdesk --help)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
     <message>
         <source>No measured objects were copied</source>
         <translation>Нет скопированных измеренных объектов</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>Сначала завершите или отмените начатое</translation>
     </message>
 </context>
 <context>
@@ -1195,6 +1214,10 @@ The environment variable STATREPORT_PLUGINS names more folders with plug-ins.
         <source>Not found</source>
         <translation>Не найдено</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>Сначала введите текст для поиска</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1471,6 +1494,10 @@ Dropped, because newer ones came first: %1</source>
         <source>pasting of %1</source>
         <translation>вставку: %1</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>импорт %1</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1512,6 +1539,10 @@ Dropped, because newer ones came first: %1</source>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>Оставить всё как было (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>Отменить уже нельзя</translation>
     </message>
 </context>
 <context>
@@ -2507,6 +2538,10 @@ Reported by %2</source>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>Сеансы версии %1 неизвестны; эта программа читает версии с %2 по %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>Этот файл — таблица значений; импортируйте его</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2688,6 +2723,30 @@ Reported by %2</source>
             <numerusform>В строке %n поля вместо %1</numerusform>
             <numerusform>В строке %n полей вместо %1</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>В записях слишком много разных имён</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>Этот файл — сеанс, а не таблица; откройте его</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>Файл не является ни списком записей, ни экспортом значений</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>Это имя встречается дважды</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>Здесь должен быть текст, число или null</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>Версия таблицы — %1; эта программа читает версию %2</translation>
     </message>
 </context>
 <context>

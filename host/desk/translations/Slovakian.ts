@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>Zadajte číslo, napríklad 5.3 alebo 5,3</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>Pixel meria od %1 do %2</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ Meria objekty na obrázkoch a zobrazuje ich hodnoty.
 
 Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvnými modulmi.
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (ďalšia pomoc: measuringdesk --help)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
     <message>
         <source>No measured objects were copied</source>
         <translation>Neboli skopírované žiadne merané objekty</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>Najprv dokončite alebo zrušte, čo ste začali</translation>
     </message>
 </context>
 <context>
@@ -1195,6 +1214,10 @@ Premenná prostredia STATREPORT_PLUGINS určuje ďalšie priečinky so zásuvný
         <source>Not found</source>
         <translation>Nenájdené</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>Najprv zadajte hľadaný text</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1471,6 +1494,10 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
         <source>pasting of %1</source>
         <translation>prilepenie: %1</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>import %1</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1512,6 +1539,10 @@ Vynechané, pretože medzitým prišli novšie: %1</translation>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>Nechať všetko tak, ako to bolo (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>Už sa to nedá zrušiť</translation>
     </message>
 </context>
 <context>
@@ -2507,6 +2538,10 @@ Ohlásil: %2</translation>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>Relácie verzie %1 nie sú známe; tento program číta verzie %2 až %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>Tento súbor je tabuľka hodnôt; importujte ho</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2688,6 +2723,30 @@ Ohlásil: %2</translation>
             <numerusform>Riadok má %n polia namiesto %1</numerusform>
             <numerusform>Riadok má %n polí namiesto %1</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>Záznamy majú priveľa rôznych názvov</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>Tento súbor je relácia, nie tabuľka; otvorte ho</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>Súbor nie je ani zoznam záznamov, ani export hodnôt</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>Tento názov sa vyskytuje dvakrát</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>Tu musí byť text, číslo alebo null</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>Tabuľka má verziu %1; tento program číta verziu %2</translation>
     </message>
 </context>
 <context>

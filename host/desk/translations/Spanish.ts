@@ -563,6 +563,17 @@
     </message>
 </context>
 <context>
+    <name>KvDeskCalibrationWay</name>
+    <message>
+        <source>Type a number such as 5.3 or 5,3</source>
+        <translation>Escriba un número como 5.3 o 5,3</translation>
+    </message>
+    <message>
+        <source>A pixel measures between %1 and %2</source>
+        <translation>Un píxel mide entre %1 y %2</translation>
+    </message>
+</context>
+<context>
     <name>KvDeskCalibrator</name>
     <message>
         <source>%1 states pixels of %2; the session measures with %3</source>
@@ -615,6 +626,10 @@ Mide objetos en imágenes y muestra sus valores.
 
 La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
 </translation>
+    </message>
+    <message>
+        <source>%1 (measuringdesk --help tells more)</source>
+        <translation>%1 (más ayuda: measuringdesk --help)</translation>
     </message>
 </context>
 <context>
@@ -678,6 +693,10 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
     <message>
         <source>No measured objects were copied</source>
         <translation>No se han copiado objetos medidos</translation>
+    </message>
+    <message>
+        <source>Finish or cancel what you have begun first</source>
+        <translation>Termine o cancele primero lo que ha empezado</translation>
     </message>
 </context>
 <context>
@@ -1189,6 +1208,10 @@ La variable de entorno STATREPORT_PLUGINS indica más carpetas con complementos.
         <source>Not found</source>
         <translation>No encontrado</translation>
     </message>
+    <message>
+        <source>Type what to find first</source>
+        <translation>Escriba primero lo que desea buscar</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskImageView</name>
@@ -1464,6 +1487,10 @@ Descartados porque llegaron antes otros más nuevos: %1</translation>
         <source>pasting of %1</source>
         <translation>pegado de %1</translation>
     </message>
+    <message>
+        <source>import of %1</source>
+        <translation>importar %1</translation>
+    </message>
 </context>
 <context>
     <name>KvDeskPlugins</name>
@@ -1505,6 +1532,10 @@ Descartados porque llegaron antes otros más nuevos: %1</translation>
     <message>
         <source>Leave everything as it was (Esc)</source>
         <translation>Dejar todo como estaba (Esc)</translation>
+    </message>
+    <message>
+        <source>This can no longer be cancelled</source>
+        <translation>Ya no se puede cancelar</translation>
     </message>
 </context>
 <context>
@@ -2498,6 +2529,10 @@ Notificado por %2</translation>
         <source>Sessions of version %1 are not known; this program reads versions %2 to %3</source>
         <translation>Las sesiones de la versión %1 no se reconocen; este programa lee las versiones de la %2 a la %3</translation>
     </message>
+    <message>
+        <source>This file is a table of values; import it</source>
+        <translation>Este archivo es una tabla de valores; impórtela</translation>
+    </message>
 </context>
 <context>
     <name>ZtStillImageSource</name>
@@ -2677,6 +2712,30 @@ Notificado por %2</translation>
             <numerusform>La fila tiene %n campo en lugar de %1</numerusform>
             <numerusform>La fila tiene %n campos en lugar de %1</numerusform>
         </translation>
+    </message>
+    <message>
+        <source>The records have too many different names</source>
+        <translation>Los registros tienen demasiados nombres distintos</translation>
+    </message>
+    <message>
+        <source>This file is a session, not a table; open it</source>
+        <translation>Este archivo es una sesión, no una tabla; ábrala</translation>
+    </message>
+    <message>
+        <source>The file is neither a list of records nor an export of values</source>
+        <translation>El archivo no es una lista de registros ni una exportación de valores</translation>
+    </message>
+    <message>
+        <source>This name comes twice</source>
+        <translation>Este nombre aparece dos veces</translation>
+    </message>
+    <message>
+        <source>This must be a text, a number or null</source>
+        <translation>Aquí debe haber un texto, un número o null</translation>
+    </message>
+    <message>
+        <source>The table is of version %1; this program reads version %2</source>
+        <translation>La tabla es de la versión %1; este programa lee la versión %2</translation>
     </message>
 </context>
 <context>
