@@ -5,7 +5,10 @@
 #include "KvDeskGallery.h"
 #include "KvDeskGallerySettings.h"
 #include "KvDeskGalleryView.h"
+#include "KvDeskGuideCommand.h"
+#include "KvDeskGuideWindow.h"
 #include "KvDeskImageView.h"
+#include "KvDeskInlineEditor.h"
 #include "KvDeskLanguages.h"
 #include "KvDeskSelection.h"
 #include "KvDeskSettingsDialog.h"
@@ -15,6 +18,8 @@
 #include "KvDeskTranslation.h"
 #include "RunningDesk.h"
 
+#include "editor/KvPrintProgressDialog.h"
+#include "host/desk/RecoveryCopies.h"
 #include "kernel/ZtAppSettings.h"
 #include "measuring/ZtDrawnType.h"
 #include "measuring/ZtFrameSourceCatalogue.h"
@@ -24,11 +29,14 @@
 #include <QButtonGroup>
 #include <QDir>
 #include <QFile>
+#include <QMenu>
+#include <QMenuBar>
 #include <QMessageBox>
 #include <QTemporaryDir>
 #include <QtTest>
 
 #include <cstdio>
+#include <functional>
 #include <set>
 
 /**
@@ -45,6 +53,7 @@ public:
     {
         ZtAppSettings::getInstance()->setStoragePath(QString());
         setLanguage(language);
+        m_language = language;
         KvDeskTheme::store(theme);
         KvDeskGallerySettings::setSnapshotsFolder(m_examples + QStringLiteral("/pictures"));
         KvDeskFirstTemplates::offer(m_examples + QStringLiteral("/templates"));
@@ -55,9 +64,13 @@ public:
     void takeAll()
     {
         takeDesk();
+        takeMenus();
         takeDialogs();
+        takeFileDialogs();
+        takeGuide();
         takeEditor();
         takeStatistics();
+        takeRecovery();
     }
 
 private:
@@ -80,6 +93,26 @@ private:
         if (!widget->grab().save(path))
             std::fprintf(stderr, "screenshots: %s cannot be written\n", qPrintable(path));
         std::printf("%s\n", qPrintable(path));
+    }
+
+    // Of the window that "open" runs: it is photographed and closed.
+    void takeModal(const QString &name, const std::function<void()> &open) const
+    {
+        bool isTaken = false;
+        QTimer timer;
+        QObject::connect(&timer, &QTimer::timeout, &timer, [&]() {
+            QWidget *const modal = QApplication::activeModalWidget();
+            if (!modal || !modal->isVisible())
+                return;
+            timer.stop();
+            take(modal, name);
+            isTaken = true;
+            modal->close();
+        });
+        timer.start(5);
+        open();
+        if (!QTest::qWaitFor([&isTaken]() { return isTaken; }))
+            std::fprintf(stderr, "screenshots: there was no window for %s\n", qPrintable(name));
     }
 
     QAction *action(KvDeskActions::Id id) const { return m_desk->window()->actions()->action(id); }
@@ -105,6 +138,11 @@ private:
         }
         window->selection()->select({ZtDrawnType::Line, 2});
         take(window, QStringLiteral("desk-selected"));
+        window->activateWindow();
+        window->imageView()->setFocus();
+        action(KvDeskActions::Rename)->trigger();
+        take(window, QStringLiteral("desk-renaming"));
+        window->imageView()->inlineEditor()->slotCancel();
         action(KvDeskActions::StartPage)->trigger();
         take(window, QStringLiteral("desk-start-over-image"));
         action(KvDeskActions::CounterTool)->trigger();
@@ -118,6 +156,52 @@ private:
         take(m_desk->window()->toolColumn(), QStringLiteral("panel-report"));
     }
 
+    void takeMenus() const
+    {
+        QMenuBar *const bar = m_desk->window()->menuBar();
+        int count = 0;
+        for (const QAction *const entry : bar->actions()) {
+            if (!entry->menu())
+                continue;
+            entry->menu()->popup(
+                bar->mapToGlobal(bar->actionGeometry(const_cast<QAction *>(entry)).bottomLeft()));
+            take(entry->menu(), QStringLiteral("menu-%1").arg(++count));
+            entry->menu()->close();
+        }
+    }
+
+    void takeFileDialogs() const
+    {
+        const QVector<QPair<KvDeskActions::Id, QString>> dialogs{
+            {KvDeskActions::OpenImage, QStringLiteral("open-image")},
+            {KvDeskActions::OpenSession, QStringLiteral("open-session")},
+            {KvDeskActions::ImportTable, QStringLiteral("import-table")},
+            {KvDeskActions::SaveSessionAs, QStringLiteral("save-session")}};
+        for (const auto &dialog : dialogs)
+            takeModal(QStringLiteral("dialog-") + dialog.second,
+                      [this, &dialog]() { action(dialog.first)->trigger(); });
+    }
+
+    // At its beginning and further down.
+    void takeGuide() const
+    {
+        KvDeskGuideWindow guide(KvDeskGuideCommand::guide(m_language));
+        guide.resize(1024, 768);
+        guide.show();
+        take(&guide, QStringLiteral("guide"));
+        guide.contents()->setCurrentRow(guide.contents()->count() - 2);
+        QTest::keyClick(guide.contents(), Qt::Key_Return);
+        take(&guide, QStringLiteral("guide-end"));
+    }
+
+    void takeRecovery() const
+    {
+        RecoveryCopies::add(m_copies.path(), QStringLiteral("a"), 2, 90);
+        RecoveryCopies::add(m_copies.path(), QStringLiteral("b"), 2, 9000);
+        m_desk->window()->startRecovery(m_copies.path());
+        take(m_desk->window(), QStringLiteral("desk-recovery"));
+    }
+
     void takeDialogs()
     {
         KvDeskSettingsDialog settings(m_desk->window());
@@ -125,6 +209,7 @@ private:
         KvDeskExportDialog table({}, m_desk->window());
         takeDialog(&table, "dialog-export");
         takeMessages();
+        takeModal(QStringLiteral("dialog-about"), [this]() { action(KvDeskActions::About)->trigger(); });
         action(KvDeskActions::Calibrate)->trigger();
         for (QWidget *const widget : QApplication::topLevelWidgets()) {
             if (!widget->inherits("KvDeskCalibrationDialog"))
@@ -164,12 +249,28 @@ private:
         QWidget *const editor = m_desk->editor();
         editor->resize(1280, 800);
         take(editor, QStringLiteral("editor-empty"));
-        const FileDialogAnswerer answerer(m_examples + QStringLiteral("/templates/every-block.rtp"));
-        editor->activateWindow();
-        QTest::keyClick(editor, Qt::Key_O, Qt::ControlModifier);
-        take(editor, QStringLiteral("editor-every-block"));
+        {
+            const FileDialogAnswerer answerer(m_examples + QStringLiteral("/templates/every-block.rtp"));
+            editor->activateWindow();
+            QTest::keyClick(editor, Qt::Key_O, Qt::ControlModifier);
+            take(editor, QStringLiteral("editor-every-block"));
+        }
         takeOptions(editor);
+        takeByKey(editor, QStringLiteral("dialog-save-template"), Qt::Key_S,
+                  Qt::ControlModifier | Qt::ShiftModifier);
+        takeByKey(editor, QStringLiteral("dialog-open-template"), Qt::Key_O, Qt::ControlModifier);
+        KvPrintProgressDialog printing(editor, 0);
+        printing.pageWritten(1, 4);
+        take(&printing, QStringLiteral("dialog-printing"));
+        printing.close();
         editor->close();
+    }
+
+    void takeByKey(QWidget *window, const QString &name, Qt::Key key, Qt::KeyboardModifiers modifiers) const
+    {
+        window->activateWindow();
+        settle();
+        takeModal(name, [=]() { QTest::keyClick(window, key, modifiers); });
     }
 
     // Of each type of block the first.
@@ -186,7 +287,18 @@ private:
             QTest::mouseClick(m_desk->pages()->viewport(), Qt::LeftButton, Qt::NoModifier,
                               m_desk->pages()->mapFromScene(m_desk->centerOf(piece)));
             take(editor, QStringLiteral("editor-options-%1").arg(classes.at(i)));
+            takeOptionsDialogs();
         }
+    }
+
+    // Of a text: its link and its picture.
+    void takeOptionsDialogs() const
+    {
+        if (!m_desk->options() || !m_desk->options()->inherits("KvTextDocumentNodeOptionsWidget"))
+            return;
+        for (const char *const slot : {"slotLinkClicked", "slotGalleryClicked"})
+            takeModal(QStringLiteral("dialog-text-") + QString::fromLatin1(slot).mid(4, 4).toLower(),
+                      [this, slot]() { QMetaObject::invokeMethod(m_desk->options(), slot); });
     }
 
     void takeStatistics()
@@ -211,6 +323,8 @@ private:
     QString m_examples;
     QString m_theme;
     QString m_folder;
+    QString m_language;
+    QTemporaryDir m_copies; ///< what a program left that did not end in order; the Desk holds locks in it
     std::unique_ptr<KvDeskTranslation> m_translation;
     std::unique_ptr<RunningDesk> m_desk;
 };
