@@ -291,7 +291,7 @@
     </message>
     <message>
         <source>missing</source>
-        <translation>nicht vorhanden</translation>
+        <translation>nichts</translation>
     </message>
     <message>
         <source>&quot;%1&quot; is missing</source>
