@@ -664,6 +664,7 @@ void TranslationsTest::noTextHidesFromLupdate()
         QStringLiteral("host/measuring/ZtDrawnType.cpp: value.name"),
         QStringLiteral("host/measuring/ZtFileFault.cpp: cause.text"),
         QStringLiteral("host/measuring/ZtFileFault.cpp: cause.text"),
+        QStringLiteral("host/measuring/ZtJsonRows.cpp: text"),
         QStringLiteral("src/blocks/measurementstable/KvStatisticsMeasurementsTableNodeCfg.cpp: name.toUtf8"),
         QStringLiteral("src/blocks/statisticstable/KvStatisticsStatsTableNodeCfg.cpp: name.toUtf8"),
         QStringLiteral("src/data/KvStatisticsUnitConverter.cpp: text")};
