@@ -66,8 +66,7 @@ namespace {
 
 constexpr QSize firstSize(1280, 800);
 constexpr QSize smallestSize(800, 528);
-constexpr int valuesWidth = 480;          ///< enough for the values of drawn objects in most languages
-constexpr int leastValuesWidth = 416;     ///< at first, where the screen is narrow
+constexpr int valuesWidth = 416;          ///< at first; the numbers of objects are whole in every language
 constexpr QSize leastImageSize(280, 248); ///< the panels give way first
 constexpr int logHeight = 144;
 constexpr int galleryHeight = 188; ///< one row of thumbnails
@@ -165,10 +164,7 @@ void KvDeskMainWindow::createPanels()
     m_imageSplitter->addWidget(m_valueTable);
     m_imageSplitter->setChildrenCollapsible(false);
     m_imageSplitter->setStretchFactor(0, 1);
-    // On a narrow screen the image needs the room more.
-    const int firstWidth = qMin(firstSize.width(), screen()->availableSize().width());
-    const int firstValuesWidth = qBound(leastValuesWidth, firstWidth * 3 / 8, valuesWidth);
-    m_imageSplitter->setSizes({firstSize.width() - firstValuesWidth, firstValuesWidth});
+    m_imageSplitter->setSizes({firstSize.width() - valuesWidth, valuesWidth});
     m_logSplitter = new QSplitter(Qt::Vertical, this);
     m_logSplitter->addWidget(m_imageSplitter);
     m_logSplitter->addWidget(m_gallery);

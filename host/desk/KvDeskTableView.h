@@ -18,7 +18,8 @@ public:
 
     explicit KvDeskTableView(QWidget *parent = nullptr);
 
-    /** The selected rows as they are copied, top to bottom: fields with tabulators between them, one line each. */
+    /** The selected rows as they are copied, top to bottom: fields with tabulators between them, one line
+     * each. */
     QString selectedText() const;
     /** What is copied: selectedText(), below the headings where they are wanted, and the same as an HTML
      * table; null without a selection. */

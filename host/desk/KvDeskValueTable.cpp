@@ -32,7 +32,6 @@ namespace {
 constexpr int minimumColumnWidth = 48;
 constexpr int minimumObjectWidth = 72; ///< with its number, which tells it from others
 constexpr int largestTextWidth = 200;
-constexpr int headingPadding = 8;
 constexpr int cellPadding = 8; ///< pixels at both ends of a text
 constexpr int largestUnitWidth = 80;
 constexpr int rounding = 2;       ///< pixels by which a text may be wider than its whole pixels
@@ -310,9 +309,7 @@ int KvDeskValueTable::wantedWidth(int column) const
 
 int KvDeskValueTable::headingWidth(int column) const
 {
-    const QString heading = m_model->headerData(column, Qt::Horizontal).toString();
-    return qMax(minimumColumnWidth,
-                m_view->horizontalHeader()->fontMetrics().horizontalAdvance(heading) + headingPadding);
+    return qMax(minimumColumnWidth, m_view->horizontalHeader()->sectionSizeHint(column));
 }
 
 void KvDeskValueTable::slotColumnResized(int aColumn, int aOldWidth, int aNewWidth)

@@ -29,7 +29,8 @@ int distance(const QColor &a, const QColor &b)
     return std::abs(a.red() - b.red()) + std::abs(a.green() - b.green()) + std::abs(a.blue() - b.blue());
 }
 
-// They differ in brightness as well as in hue; neighbours differ most, and the first are bright on dark stains.
+// They differ in brightness as well as in hue; neighbours differ most, and the first are bright on dark
+// stains.
 QVector<QColor> makeCounterColors()
 {
     const QColor palette[] = {{160, 235, 235}, {240, 110, 50},  {255, 255, 255}, {40, 190, 140},
