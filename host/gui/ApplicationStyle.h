@@ -18,9 +18,12 @@ class ApplicationStyle : public QProxyStyle
 public:
     ApplicationStyle();
 
+    /** Letters of shortcuts are not underlined from right to left, which would tear joined letters apart. */
     int styleHint(StyleHint hint, const QStyleOption *option, const QWidget *widget,
                   QStyleHintReturn *returnData) const override;
+    /** Message boxes have icons of a size that suits their strokes. */
     int pixelMetric(PixelMetric metric, const QStyleOption *option, const QWidget *widget) const override;
+    /** The family's own icons for message boxes and file dialogs. */
     QIcon standardIcon(StandardPixmap standardPixmap, const QStyleOption *option,
                        const QWidget *widget) const override;
 };
