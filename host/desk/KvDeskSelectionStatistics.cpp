@@ -101,7 +101,8 @@ QString KvDeskSelectionStatistics::line(const Group &sum) const
         return QString();
     const ZtUnit unit = unitOf(all, sum.kind);
     const auto format = [&sum, &unit](double value) {
-        return inUnit(value, sum, unit, ZtUnitSettings::getInstance()->significantDigits());
+        return ZtLeftToRight::isolated(
+            inUnit(value, sum, unit, ZtUnitSettings::getInstance()->significantDigits()));
     };
     const QString name = isMixed() ? sum.valueName + QStringLiteral(": ") : QString();
     if (all.count() == 1)

@@ -3,6 +3,7 @@
 
 #include "kernel/ZtAppSettings.h"
 #include "kernel/ZtGsManipulator.h"
+#include "support/RightToLeft.h"
 #include "support/StatReportTest.h"
 
 #include <limits>
@@ -49,6 +50,7 @@ private slots:
     void texts();
     void followsTheSettings();
     void details();
+    void unitsFollowNumbersFromRightToLeft();
     void detailsOfAMixture();
 };
 
@@ -138,6 +140,14 @@ void KvDeskSelectionStatisticsTest::details()
              QString::fromUtf8("Selected values: 2\nMean: 1.50000000 μm\nStandard deviation: 0.500000000 μm\n"
                                "Smallest: 1.00000000 μm\nLargest: 2.00000000 μm"));
     QVERIFY(!statistics.isMixed());
+}
+
+void KvDeskSelectionStatisticsTest::unitsFollowNumbersFromRightToLeft()
+{
+    const RightToLeft program;
+    KvDeskSelectionStatistics statistics;
+    statistics.add(lengths({10}));
+    QCOMPARE(statistics.text(), RightToLeft::isolated(QStringLiteral("10.000 \u03bcm")));
 }
 
 void KvDeskSelectionStatisticsTest::detailsOfAMixture()
