@@ -19,8 +19,8 @@ int digitCount(int number)
 // Whether a text that ends in a number is that of the type's name, a blank and the number.
 bool isNumberedName(const QString &text, const QString &typeName, int number)
 {
-    return text.size() == typeName.size() + 1 + digitCount(number)
-        && std::equal(typeName.begin(), typeName.end(), text.begin());
+    return text.size() == typeName.size() + 1 + digitCount(number) &&
+           std::equal(typeName.begin(), typeName.end(), text.begin());
 }
 
 } // namespace
