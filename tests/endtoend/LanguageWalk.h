@@ -8,12 +8,12 @@
 #include "KvDeskTranslation.h"
 #include "KvDeskValueTable.h"
 #include "KvDeskValueTableModel.h"
+#include "ModalVisit.h"
 #include "RunningDesk.h"
 #include "TextFit.h"
 #include "host/desk/FakeCamera.h"
 #include "kernel/ZtAppSettings.h"
 
-#include <QTimer>
 
 #include <functional>
 
@@ -96,20 +96,7 @@ public:
     /** Does something that runs a modal window, looks at that window, and closes it. */
     void lookAtModal(const QString &name, const std::function<void()> &open)
     {
-        bool hasLooked = false;
-        QTimer timer;
-        QObject::connect(&timer, &QTimer::timeout, &timer, [&]() {
-            QWidget *const modal = QApplication::activeModalWidget();
-            if (!modal || !modal->isVisible())
-                return;
-            timer.stop();
-            look(modal, name);
-            hasLooked = true;
-            modal->close();
-        });
-        timer.start(5);
-        open();
-        QVERIFY2(hasLooked, qPrintable(name));
+        QVERIFY2(visitModal(open, [&](QWidget *modal) { look(modal, name); }), qPrintable(name));
     }
 
     void showAllPanels()

@@ -16,6 +16,7 @@
 #include "KvDeskTheme.h"
 #include "KvDeskToolColumn.h"
 #include "KvDeskTranslation.h"
+#include "ModalVisit.h"
 #include "RunningDesk.h"
 
 #include "editor/KvPrintProgressDialog.h"
@@ -98,20 +99,7 @@ private:
     // Of the window that "open" runs: it is photographed and closed.
     void takeModal(const QString &name, const std::function<void()> &open) const
     {
-        bool isTaken = false;
-        QTimer timer;
-        QObject::connect(&timer, &QTimer::timeout, &timer, [&]() {
-            QWidget *const modal = QApplication::activeModalWidget();
-            if (!modal || !modal->isVisible())
-                return;
-            timer.stop();
-            take(modal, name);
-            isTaken = true;
-            modal->close();
-        });
-        timer.start(5);
-        open();
-        if (!QTest::qWaitFor([&isTaken]() { return isTaken; }))
+        if (!visitModal(open, [&](QWidget *modal) { take(modal, name); }))
             std::fprintf(stderr, "screenshots: there was no window for %s\n", qPrintable(name));
     }
 
